@@ -1,0 +1,26 @@
+# Settings shared by every target of this project; none of them is global.
+
+# Language, visibility, warnings and exact floating point for one target.
+function(hx_target_defaults target)
+  target_compile_features(${target} PUBLIC cxx_std_20)
+  set_target_properties(${target} PROPERTIES
+    CXX_EXTENSIONS OFF
+    CXX_VISIBILITY_PRESET hidden
+    VISIBILITY_INLINES_HIDDEN ON
+    VERIFY_INTERFACE_HEADER_SETS ON)
+  if(NOT MSVC)
+    target_compile_options(${target} PRIVATE
+      -Wall -Wextra -Wpedantic -Wconversion -Wshadow
+      # Error codes show the path below src/, the same on every machine.
+      -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/src/=
+      # A double operation rounds once, to double: no fused multiply-add, and
+      # on 32-bit x86 no 80-bit intermediate results.
+      -ffp-contract=off)
+    if(CMAKE_SIZEOF_VOID_P EQUAL 4 AND CMAKE_SYSTEM_PROCESSOR MATCHES "86|AMD64")
+      target_compile_options(${target} PRIVATE -msse2 -mfpmath=sse)
+    endif()
+    if(HX_WARNINGS_AS_ERRORS)
+      target_compile_options(${target} PRIVATE -Werror)
+    endif()
+  endif()
+endfunction()

@@ -1,0 +1,94 @@
+// A doubly linked list whose items stay valid while other items come and go.
+//
+//   leda::list<int> l;
+//   l.append(1);
+//   for (leda::list_item<int> it = l.first(); it; it = l.succ(it)) use(l[it]);
+
+#ifndef PLATFORM_CONTAINERS_LIST_H
+#define PLATFORM_CONTAINERS_LIST_H
+
+#include <iterator>
+#include <list>
+#include <utility>
+
+namespace leda {
+
+/// A place in a list, or null. Valid until its own element is deleted.
+template <class T>
+class list_item {
+ public:
+  list_item() = default;
+  explicit operator bool() const { return m_Valid; }
+  friend bool operator==(const list_item& a, const list_item& b) {
+    return a.m_Valid == b.m_Valid && (!a.m_Valid || a.m_Place == b.m_Place);
+  }
+
+ private:
+  template <class>
+  friend class list;
+  using Place = typename std::list<T>::iterator;
+  explicit list_item(Place place) : m_Place(place), m_Valid(true) {}
+
+  Place m_Place{};
+  bool m_Valid = false;
+};
+
+/// A value type: copying copies the elements.
+template <class T>
+class list {
+ public:
+  using item = list_item<T>;
+
+  bool empty() const { return m_Elements.empty(); }
+  int size() const { return static_cast<int>(m_Elements.size()); }
+  void clear() { m_Elements.clear(); }
+
+  /// The first item, null for an empty list.
+  item first() const { return at(elements().begin()); }
+  /// The last item, null for an empty list.
+  item last() const {
+    return empty() ? item() : item(std::prev(elements().end()));
+  }
+  /// The item after \p it, null after the last one.
+  item succ(item it) const { return at(std::next(it.m_Place)); }
+
+  T& operator[](item it) { return *it.m_Place; }
+  const T& operator[](item it) const { return *it.m_Place; }
+  const T& contents(item it) const { return *it.m_Place; }
+  /// The first element; the list must not be empty.
+  const T& front() const { return m_Elements.front(); }
+
+  item append(const T& element) {
+    return item(m_Elements.insert(m_Elements.end(), element));
+  }
+  item insert_before(const T& element, item it) {
+    return item(m_Elements.insert(it.m_Place, element));
+  }
+  void del_item(item it) { m_Elements.erase(it.m_Place); }
+
+  /// Removes and returns the first element; the list must not be empty.
+  T pop() {
+    T element = std::move(m_Elements.front());
+    m_Elements.pop_front();
+    return element;
+  }
+
+  auto begin() const { return m_Elements.begin(); }
+  auto end() const { return m_Elements.end(); }
+
+ private:
+  // Items of a constant list still name changeable places; only a list that
+  // may be changed hands out changeable elements.
+  std::list<T>& elements() const {
+    return const_cast<std::list<T>&>(m_Elements);
+  }
+  item at(typename std::list<T>::iterator place) const {
+    return place == elements().end() ? item() : item(place);
+  }
+
+  std::list<T> m_Elements;
+};
+
+}  // namespace leda
+
+#endif  // PLATFORM_CONTAINERS_LIST_H

@@ -1,0 +1,99 @@
+#include "platform/messages/HX_MessageHandler.h"
+
+#include <algorithm>
+#include <csignal>
+#include <cstdio>
+#include <cstdlib>
+
+#include "Control/ERR_Catalogue.h"
+#include "SourceRef/HxCSrcRef.h"
+#include "platform/messages/ERR_MessageHandler.h"
+#include "platform/strings/KyCXString.h"
+
+namespace {
+
+std::string format(const char* text, std::va_list arguments) {
+  std::va_list again;
+  va_copy(again, arguments);
+  const int length = std::vsnprintf(nullptr, 0, text, arguments);
+  std::string result(static_cast<std::size_t>(std::max(length, 0)), '\0');
+  std::vsnprintf(result.data(), result.size() + 1, text, again);
+  va_end(again);
+  return result;
+}
+
+}  // namespace
+
+HX_MessageHandler& HX_MessageHandler::instance() {
+  static HX_MessageHandler s_handler;
+  return s_handler;
+}
+
+void HX_MessageHandler::clear() {
+  m_Messages.clear();
+  m_Status = 0;
+}
+
+void HX_MessageHandler::emit(int severity, const HxCSrcRef* srcRef, int row,
+                             std::va_list arguments) {
+  HX_Message message;
+  message.row = row;
+  message.severity = severity;
+  message.srcRef = srcRef;
+  if (srcRef != nullptr) {
+    KyCXString source;
+    srcRef->toString(source);
+    message.source = source.cstring();
+  }
+  if (const ERR_CatalogueRow* entry = ERR_FindRow(row)) {
+    message.id = entry->id;
+    message.text = format(entry->text, arguments);
+  }
+  m_Status = std::max(m_Status, severity & 3);
+  m_Messages.push_back(message);
+  if (m_Sink) m_Sink(message);
+}
+
+void HX_MessageHandler::writeToStandardError(const HX_Message& message) {
+  std::fprintf(stderr, "%d %s: %s%s%s%s\n", message.id,
+               severityName(message.severity), message.text.c_str(),
+               message.source.empty() ? "" : " [", message.source.c_str(),
+               message.source.empty() ? "" : "]");
+}
+
+int HX_MessageHandler::debugReport(const char* file, int line,
+                                   const char* expression) {
+  if (m_DebugReport) return m_DebugReport(file, line, expression);
+  std::fprintf(stderr, "%s:%d: check failed: %s\n", file, line, expression);
+  return 0;
+}
+
+const char* HX_MessageHandler::severityName(int severity) {
+  static constexpr const char* kNames[] = {
+      "note",           "warning",
+      "error",          "fatal error",
+      "internal note",  "internal warning",
+      "internal error", "internal fatal error"};
+  return kNames[severity & 7];
+}
+
+void ERR_EmitErrorMessage(int severity, const HxCSrcRef* srcRef,
+                          int messageNumber, ...) {
+  std::va_list arguments;
+  va_start(arguments, messageNumber);
+  HX_MessageHandler::instance().emit(severity, srcRef, messageNumber,
+                                     arguments);
+  va_end(arguments);
+}
+
+int ERR_get_errstatus() { return HX_MessageHandler::instance().errorStatus(); }
+
+bool ShowInternalInfo() {
+  return HX_MessageHandler::instance().showInternalInfo();
+}
+
+int HX_DebugReport(const char* file, int line, const char* expression) {
+  return HX_MessageHandler::instance().debugReport(file, line, expression);
+}
+
+void HX_DebugBreak() { std::raise(SIGTRAP); }

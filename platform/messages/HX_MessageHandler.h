@@ -1,0 +1,74 @@
+// The message handler as a host sees it: what was reported, and where it goes.
+//
+//   HX_MessageHandler& handler = HX_MessageHandler::instance();
+//   handler.setSink([](const HX_Message& m) { log << m.text << '\n'; });
+//   ...
+//   for (const HX_Message& m : handler.messages()) ...
+
+#ifndef PLATFORM_MESSAGES_HX_MESSAGEHANDLER_H
+#define PLATFORM_MESSAGES_HX_MESSAGEHANDLER_H
+
+#include <cstdarg>
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "platform/HX_PlatformExport.h"
+
+class HxCSrcRef;
+
+/// One reported message. Texts are ISO-8859-1.
+struct HX_Message {
+  int row = 0;       ///< row of the catalogue
+  int id = 0;        ///< the number a user sees; 0 if the row is not known
+  int severity = 0;  ///< 0 to 7, as for ERR_EmitErrorMessage()
+  const HxCSrcRef* srcRef = nullptr;  ///< not owned, may be gone by now
+  std::string source;                 ///< the reference's text, or empty
+  std::string text;                   ///< formatted
+};
+
+class HX_PLATFORM_API HX_MessageHandler {
+ public:
+  using Sink = std::function<void(const HX_Message&)>;
+  /// Receives file, line and expression; answers 1 to debug.
+  using DebugReport = std::function<int(const char*, int, const char*)>;
+
+  static HX_MessageHandler& instance();
+
+  /// Every message since the last clear(), in the order of reporting.
+  const std::vector<HX_Message>& messages() const { return m_Messages; }
+  /// Forgets the messages and the error status.
+  void clear();
+  /// See ERR_get_errstatus().
+  int errorStatus() const { return m_Status; }
+
+  /// Each message goes to \p sink once, after it was recorded. The default
+  /// writes one line to standard error; an empty sink drops them.
+  void setSink(Sink sink) { m_Sink = std::move(sink); }
+  static void writeToStandardError(const HX_Message& message);
+
+  void setShowInternalInfo(bool show) { m_ShowInternalInfo = show; }
+  bool showInternalInfo() const { return m_ShowInternalInfo; }
+
+  /// Replaces the line on standard error that a debug report writes.
+  void setDebugReport(DebugReport report) { m_DebugReport = std::move(report); }
+  int debugReport(const char* file, int line, const char* expression);
+
+  /// Formats and records one message; see ERR_EmitErrorMessage().
+  void emit(int severity, const HxCSrcRef* srcRef, int row,
+            std::va_list arguments);
+
+  /// "note", "warning", "error", "fatal error", or the same after "internal ".
+  static const char* severityName(int severity);
+
+ private:
+  HX_MessageHandler() = default;
+
+  std::vector<HX_Message> m_Messages;
+  Sink m_Sink = &HX_MessageHandler::writeToStandardError;
+  DebugReport m_DebugReport;
+  int m_Status = 0;
+  bool m_ShowInternalInfo = false;
+};
+
+#endif  // PLATFORM_MESSAGES_HX_MESSAGEHANDLER_H

@@ -1,0 +1,21 @@
+// Clocks of the operating system.
+
+#ifndef PLATFORM_OS_HX_OSCLOCK_H
+#define PLATFORM_OS_HX_OSCLOCK_H
+
+#include <cstdint>
+
+#include "platform/HX_PlatformExport.h"
+
+/// Milliseconds of elapsed time since the process started.
+HX_PLATFORM_API std::int64_t HX_ProcessClock();
+
+/// Ticks per second of the high-resolution counter.
+/// \return 1 if there is such a counter, else 0 with \p frequency untouched.
+HX_PLATFORM_API int QueryPerformanceFrequency(std::int64_t* frequency);
+
+/// The ticks of the high-resolution counter, which never runs backwards.
+/// \return 1 if there is such a counter, else 0 with \p ticks untouched.
+HX_PLATFORM_API int QueryPerformanceCounter(std::int64_t* ticks);
+
+#endif  // PLATFORM_OS_HX_OSCLOCK_H

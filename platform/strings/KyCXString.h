@@ -1,0 +1,186 @@
+// The generator's string class: a sequence of 16-bit units.
+//
+// A text of up to 39 units of ISO-8859-1, which is nearly every name, lives
+// inside the object and never asks for memory. Texts whose units all lie below
+// 256 are held as 8-bit text, so cstring() is free; a text with a larger unit
+// keeps its 16-bit units and its 8-bit form side by side.
+//
+//   KyCXString name("speed");
+//   name += "_";
+//   name += KyCXString(3, false, true);   // "speed_3"
+//   name.find("_");                       // 5
+//   name.sub(0, 4);                       // "speed"
+
+#ifndef PLATFORM_STRINGS_KYCXSTRING_H
+#define PLATFORM_STRINGS_KYCXSTRING_H
+
+#include <cstring>
+#include <string_view>
+
+#include "platform/HX_PlatformExport.h"
+#include "platform/containers/array.h"
+
+/// A value type. Positions count from 0; a range includes both its ends.
+/// Comparison is by unit value, never by locale. Letter case and white space
+/// are those of ASCII: the letters A-Z and a-z; blank, tab, line feed, vertical
+/// tab, form feed and carriage return.
+class HX_PLATFORM_API KyCXString {
+ public:
+  /// Where shortenString() takes the text out.
+  enum ScEPosition {
+    ePositionFront = 0,
+    ePositionMiddle = 1,
+    ePositionBack = 2
+  };
+
+  KyCXString() noexcept { m_Inline[0] = 0; }
+  /// The ISO-8859-1 text up to its terminating zero; null gives an empty text.
+  KyCXString(const char* text);
+  /// One character.
+  explicit KyCXString(char character);
+  /// \p length units starting at \p units.
+  KyCXString(const unsigned short* units, int length);
+  /// The digits of \p value: decimal, or hexadecimal in upper case (negative
+  /// values then in two's complement). Unless \p shortest, zeros are put in
+  /// front up to the width of the largest value.
+  KyCXString(int value, bool hexadecimal, bool shortest);
+  KyCXString(unsigned long value, bool hexadecimal, bool shortest);
+  KyCXString(const KyCXString& other);
+  KyCXString(KyCXString&& other) noexcept;
+  ~KyCXString() {
+    if (ownsMemory()) release();
+  }
+
+  KyCXString& operator=(const KyCXString& other);
+  KyCXString& operator=(KyCXString&& other) noexcept;
+  KyCXString& operator=(const char* text);
+
+  /// In units.
+  int length() const { return m_Length; }
+  bool isEmpty() const { return m_Length == 0; }
+
+  /// The unit at \p position; 0 outside the text.
+  unsigned short operator[](int position) const {
+    if (position < 0 || position >= m_Length) return 0;
+    if (m_Wide != nullptr) return m_Wide[position];
+    return static_cast<unsigned char>(m_Text[position]);
+  }
+
+  /// The ISO-8859-1 form, zero-terminated; a unit above 255 shows as '?'.
+  /// Never null; valid until the next change of this object.
+  const char* cstring() const { return m_Text; }
+
+  KyCXString& operator+=(const KyCXString& text);
+  KyCXString& operator+=(const char* text);
+  KyCXString& operator+=(char character);
+  /// Appends what sub() of \p text would give, without the copy.
+  KyCXString& appendSub(const KyCXString& text, int from, int to);
+
+  /// The position of the first occurrence of \p text at or after \p from, -1
+  /// if there is none. A negative \p from counts as 0; the empty text is found
+  /// at every \p from up to the length.
+  int find(const KyCXString& text, int from = 0) const;
+  int find(char character, int from = 0) const;
+  bool contains(const KyCXString& text) const { return find(text, 0) >= 0; }
+  bool startsWith(const KyCXString& text) const;
+
+  /// The units from \p from to \p to, both included; of a range that reaches
+  /// outside the text the part inside it, empty if there is none.
+  KyCXString sub(int from, int to) const;
+  /// The first \p count units; empty for a negative count.
+  KyCXString head(int count) const { return sub(0, count - 1); }
+
+  /// The texts between the occurrences of \p separator, at least one: n
+  /// separators give n + 1 parts, an empty text gives one empty part.
+  void split(char separator, leda::array<KyCXString>& parts) const;
+
+  KyCXString& toLower();
+  KyCXString& toUpper();
+  /// Removes white space at the chosen ends.
+  KyCXString& trim(bool leading, bool trailing);
+  /// Removes one pair of angle brackets that encloses the whole text.
+  KyCXString& filterAngleBrackets();
+  /// Writes \p by for each white space character or, with \p collapse, for
+  /// each run of them.
+  KyCXString& replaceWhiteSpace(char by, bool collapse);
+  /// Replaces every occurrence of \p what, from the left, never looking into a
+  /// replacement; an empty \p what changes nothing.
+  KyCXString& replace(const KyCXString& what, const KyCXString& by);
+
+  /// Writes '_' for each unit that may not stand in a C identifier (with
+  /// \p collapse for each run of them) and puts '_' before a leading digit.
+  /// A text that is not empty thereby becomes a valid identifier.
+  KyCXString& makeCIdentifier(bool collapse);
+  /// A letter or '_' first, then letters, digits and '_' (ISO C, 6.4.2.1,
+  /// without universal character names).
+  bool isValidCIdentifier() const;
+  /// A letter, a digit or '_'.
+  static bool isValidForCIdentifier(const unsigned short& unit);
+
+  /// Cuts a text that is longer than \p maxLength to exactly that length; a
+  /// text that fits stays as it is. The units around \p position are replaced
+  /// by \p fillCount times \p fill: at the front the end of the text survives,
+  /// in the middle both ends (the end at most one unit shorter), at the back
+  /// the front. Where \p maxLength leaves no room beside the fill, the last
+  /// \p maxLength units survive.
+  KyCXString& shortenString(int maxLength, int fillCount, char fill,
+                            ScEPosition position);
+
+  /// Negative, 0 or positive as this text goes before, equals or goes after
+  /// \p other: by the first unit that differs, else the shorter first.
+  int compareWith(const KyCXString& other) const;
+
+  friend bool operator==(const KyCXString& a, const KyCXString& b) {
+    if (a.m_Length != b.m_Length) return false;
+    if (a.m_Wide == nullptr && b.m_Wide == nullptr)
+      return std::memcmp(a.m_Text, b.m_Text,
+                         static_cast<std::size_t>(a.m_Length)) == 0;
+    return a.compareWith(b) == 0;
+  }
+  friend bool operator<(const KyCXString& a, const KyCXString& b) {
+    return a.compareWith(b) < 0;
+  }
+  friend KyCXString operator+(const KyCXString& a, const KyCXString& b) {
+    KyCXString sum(a);
+    sum += b;
+    return sum;
+  }
+  friend KyCXString operator+(KyCXString&& a, const KyCXString& b) {
+    a += b;
+    return static_cast<KyCXString&&>(a);
+  }
+
+ private:
+  static constexpr int kInlineCapacity = 39;
+
+  bool ownsMemory() const { return m_Text != m_Inline || m_Wide != nullptr; }
+  void release();
+  void makeRoom(int capacity);
+  void assignNarrow(const char* text, int length);
+  void assignUnits(const unsigned short* units, int length);
+  void appendNarrow(const char* text, int length);
+  void appendUnits(const KyCXString& text, int from, int count);
+  void setLength(int length);
+  std::string_view narrow() const {
+    return {m_Text, static_cast<std::size_t>(m_Length)};
+  }
+  template <class Change>
+  void changeUnits(Change change);
+
+  char* m_Text = m_Inline;           // 8-bit form, zero-terminated
+  unsigned short* m_Wide = nullptr;  // units; null while all are below 256
+  int m_Length = 0;
+  int m_Capacity = kInlineCapacity;  // of m_Text, without its final zero
+  char m_Inline[kInlineCapacity + 1];
+};
+
+namespace leda {
+
+/// Orders texts as KyCXString::compareWith() does.
+inline int compare(const KyCXString& a, const KyCXString& b) {
+  return a.compareWith(b);
+}
+
+}  // namespace leda
+
+#endif  // PLATFORM_STRINGS_KYCXSTRING_H

@@ -1,0 +1,34 @@
+// Reads the process clock and reports elapsed times.
+//
+//   HxCTimeStamp clock;
+//   const double start = clock.getTimeStamp();
+//   ...
+//   KyCXString label("Reading the model");
+//   clock.emitElapsedTime(start, label);   // note 2
+
+#ifndef CONTROL_HXCTIMESTAMP_H
+#define CONTROL_HXCTIMESTAMP_H
+
+#include "Control/HX_Allocated.h"
+#include "HX_Export.h"
+
+class KyCXString;
+
+/// Holds no data.
+class HX_UTILS_API HxCTimeStamp : public HX_Allocated {
+ public:
+  HxCTimeStamp() = default;
+  HxCTimeStamp(const HxCTimeStamp&) = default;
+  HxCTimeStamp& operator=(const HxCTimeStamp&) = default;
+  virtual ~HxCTimeStamp();
+
+  /// Milliseconds of the process clock.
+  double getTimeStamp() const;
+
+  /// Emits message 2 (note): \p label in a column of 30, and the seconds from
+  /// \p start (milliseconds, as of getTimeStamp()) to now.
+  /// \return true
+  bool emitElapsedTime(double start, KyCXString& label);
+};
+
+#endif  // CONTROL_HXCTIMESTAMP_H

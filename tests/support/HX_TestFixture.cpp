@@ -1,0 +1,55 @@
+#include "support/HX_TestFixture.h"
+
+#include "platform/messages/HX_MessageHandler.h"
+
+void PrintTo(const KyCXString& text, std::ostream* stream) {
+  *stream << '"' << text.cstring() << '"';
+}
+
+HX_TestFixture::HX_TestFixture() { reset(); }
+
+HX_TestFixture::~HX_TestFixture() { reset(); }
+
+std::vector<std::string> HX_TestFixture::messages() {
+  std::vector<std::string> result;
+  for (const HX_Message& m : HX_MessageHandler::instance().messages()) {
+    std::string line =
+        std::to_string(m.row) + "/" + std::to_string(m.severity) + " " + m.text;
+    if (m.srcRef != nullptr) line += " [" + m.source + "]";
+    result.push_back(line);
+  }
+  return result;
+}
+
+void HX_TestFixture::clearMessages() { HX_MessageHandler::instance().clear(); }
+
+std::vector<std::string>& HX_TestFixture::recordDebugReports() {
+  HX_MessageHandler& handler = HX_MessageHandler::instance();
+  handler.setShowInternalInfo(true);
+  handler.setDebugReport([this](const char*, int, const char* expression) {
+    m_DebugReports.emplace_back(expression);
+    return 0;
+  });
+  return m_DebugReports;
+}
+
+void HX_TestFixture::reset() {
+  HX_MessageHandler& handler = HX_MessageHandler::instance();
+  handler.clear();
+  handler.setSink({});
+  handler.setDebugReport({});
+  handler.setShowInternalInfo(false);
+  pHXMemory = nullptr;
+  HX_ClockSource::install(nullptr);
+}
+
+void* HX_CountingController::allocMemBlock(unsigned long size) {
+  if (m_Fails) return nullptr;
+  ++m_Allocated;
+  return HxCMemController::allocMemBlock(size);
+}
+
+void HX_CountingController::freeMemBlock(void* block) {
+  if (block != nullptr) ++m_Freed;
+  HxCMemController::freeMemBlock(block);
+}
