@@ -1,0 +1,112 @@
+#include "Strings/STR_StringSupport.h"
+
+#include <climits>
+#include <cmath>
+#include <cstring>
+#include <limits>
+
+#include "support/HX_TestFixture.h"
+
+namespace {
+
+class StringSupportTest : public HX_TestFixture {
+ protected:
+  // The text of a new string, which is given back; "(null)" for null.
+  std::string taken(char* text) {
+    const std::string result = text == nullptr ? "(null)" : text;
+    m_Controller.freeMemBlock(text);
+    return result;
+  }
+
+  HX_CountingController m_Controller;
+};
+
+TEST_F(StringSupportTest, NullSidesCountAsAbsent) {
+  const char* end = nullptr;
+  EXPECT_EQ(taken(STR_ConcatenateStrings("ab", "cd")), "abcd");
+  EXPECT_EQ(taken(STR_ConcatenateStrings("ab", nullptr)), "ab");
+  EXPECT_EQ(taken(STR_ConcatenateStrings(nullptr, "cd")), "cd");
+  EXPECT_EQ(taken(STR_ConcatenateStrings(nullptr, nullptr)), "(null)");
+  EXPECT_EQ(taken(STR_ConcatenateNStrings("a", "", "b", "c", end)), "abc");
+  EXPECT_EQ(taken(STR_ConcatenateNStrings(nullptr, "x", end)), "x");
+  EXPECT_EQ(taken(STR_ConcatenateNStrings(nullptr, end)), "(null)");
+  EXPECT_EQ(taken(STR_Concatenate3Strings("a", "b", "c")), "abc");
+  EXPECT_EQ(taken(STR_Concatenate3Strings("a", nullptr, "c")), "a");
+  EXPECT_EQ(taken(STR_DuplicateString(nullptr)), "(null)");
+  EXPECT_EQ(m_Controller.liveBlocks(), 0) << "an intermediate string leaks";
+  m_Controller.fail();
+  EXPECT_EQ(STR_Concatenate3Strings("a", "b", "c"), nullptr);
+  EXPECT_EQ(STR_IntToString(1), nullptr);
+  EXPECT_EQ(STR_DoubleToString(1, 1), nullptr);
+}
+
+TEST_F(StringSupportTest, NumbersAreWrittenInFull) {
+  EXPECT_EQ(taken(STR_IntToString(0)), "0");
+  EXPECT_EQ(taken(STR_IntToString(INT_MIN)), "-2147483648");
+  EXPECT_EQ(taken(STR_IntToString(INT_MAX)), "2147483647");
+
+  const struct {
+    double value;
+    int precision;
+    const char* text;
+  } rows[] = {{3.14159, 2, "3.14"},
+              {-0.5, 1, "-0.5"},
+              {123.0, 0, "123"},
+              {-0.0, 1, "-0.0"},
+              {9.996, 2, "10.00"},
+              {0.5, -1, "0.500000"},
+              {4294967296.0, 1, "4294967296.0"}};
+  for (const auto& row : rows)
+    EXPECT_EQ(taken(STR_DoubleToString(row.value, row.precision)), row.text);
+  EXPECT_EQ(taken(STR_DoubleToString(std::nan(""), 3)), "nan");
+  const double largest = std::numeric_limits<double>::max();
+  EXPECT_EQ(taken(STR_DoubleToString(-largest, 2)).size(), 1U + 309 + 3);
+}
+
+TEST_F(StringSupportTest, EqualityKnowsNullAndAsciiCase) {
+  const struct {
+    const char* a;
+    const char* b;
+    bool equal;
+    bool equalWithoutCase;
+  } rows[] = {{nullptr, nullptr, true, true}, {nullptr, "", false, false},
+              {"", nullptr, false, false},    {"Abc", "aBC", false, true},
+              {"abc", "abc", true, true},     {"abc", "abcd", false, false},
+              {"abcd", "abc", false, false},  {"\xC4", "\xE4", false, false},
+              {"[", "{", false, false},       {"@", "`", false, false}};
+  for (const auto& row : rows) {
+    SCOPED_TRACE(row.a == nullptr ? "(null)" : row.a);
+    EXPECT_EQ(STR_StringsAreEqual(row.a, row.b, STR_CASE_SENSITIVE), row.equal);
+    EXPECT_EQ(STR_StringsAreEqual(row.a, row.b, STR_CASE_INSENSITIVE),
+              row.equalWithoutCase);
+  }
+  EXPECT_TRUE(STR_IsNullOrEmpty(nullptr));
+  EXPECT_TRUE(STR_IsNullOrEmpty(""));
+  EXPECT_FALSE(STR_IsNullOrEmpty(" "));
+}
+
+TEST_F(StringSupportTest, EachByteIsValidOrReplaced) {
+  const std::string valid =
+      "_0123456789abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ";
+  for (int code = 1; code < 256; ++code) {
+    SCOPED_TRACE(code);
+    const char ch = static_cast<char>(code);
+    const bool isValid = valid.find(ch) != std::string::npos;
+    const bool isWhite = std::strchr("\n\t ", ch) != nullptr;
+    EXPECT_EQ(STR_IsValidCharForCIdentifier(ch), isValid);
+    const char text[] = {ch, 'x', 0};
+    const auto processed = [&text](int mode) {
+      char copy[3];
+      std::strcpy(copy, text);
+      STR_ProcessString(copy, copy, static_cast<STR_process_mode_tp>(mode));
+      EXPECT_STREQ(copy + 1, "x");
+      return copy[0];
+    };
+    EXPECT_EQ(processed(STR_INVALID_TO_UNDERSCORE), isValid ? ch : '_');
+    EXPECT_EQ(processed(STR_WHITESPACE_TO_UNDERSCORE), isWhite ? '_' : ch);
+    EXPECT_EQ(processed(STR_WHITESPACE_TO_BLANK), isWhite ? ' ' : ch);
+    EXPECT_EQ(processed(3), isWhite ? ' ' : ch);
+  }
+}
+
+}  // namespace
