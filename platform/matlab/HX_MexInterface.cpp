@@ -1,0 +1,76 @@
+#include "platform/matlab/HX_MexInterface.h"
+
+#include <algorithm>
+#include <cstdarg>
+#include <cstdio>
+#include <map>
+#include <string>
+#include <utility>
+
+#include "platform/strings/KyCXString.h"
+
+namespace {
+
+HX_CommandWindow& commandWindow() {
+  static HX_CommandWindow s_window;
+  return s_window;
+}
+
+std::map<std::string, HX_MatlabFunction>& functions() {
+  static std::map<std::string, HX_MatlabFunction> s_functions;
+  return s_functions;
+}
+
+}  // namespace
+
+int mexPrintf(const char* format, ...) {
+  std::va_list args;
+  va_start(args, format);
+  std::va_list again;
+  va_copy(again, args);
+  const int length = std::vsnprintf(nullptr, 0, format, args);
+  va_end(args);
+  if (length >= 0) {
+    std::string text(static_cast<std::size_t>(length), '\0');
+    std::vsnprintf(text.data(), text.size() + 1, format, again);
+    if (commandWindow())
+      commandWindow()(text.c_str());
+    else
+      std::fputs(text.c_str(), stdout);
+  }
+  va_end(again);
+  return length;
+}
+
+void HX_SetCommandWindow(HX_CommandWindow window) {
+  commandWindow() = std::move(window);
+}
+
+void HX_RegisterMatlabFunction(const char* name, HX_MatlabFunction function) {
+  functions()[name] = std::move(function);
+}
+
+int MEXCallMATLAB(int outputs, mxArray** output, int inputs, mxArray** input,
+                  const char* name) {
+  std::fill(output, output + std::max(outputs, 0), nullptr);
+  const auto found = functions().find(name);
+  if (found == functions().end() || !found->second) return 1;
+  return found->second(outputs, output, inputs, input);
+}
+
+mxArray* MXCreateInitializedScalarMxArray(double value) {
+  return mxCreateScalarDouble(value);
+}
+
+void MXDestroyArray(mxArray* array) { mxDestroyArray(array); }
+
+mxArray* MXGetField(mxArray* array, int index, const char* name) {
+  return mxGetField(array, index, name);
+}
+
+bool MXCopyMXArrayToString(const mxArray* array, KyCXString& text) {
+  const char* characters = mxGetText(array);
+  if (characters == nullptr) return false;
+  text = characters;
+  return true;
+}
