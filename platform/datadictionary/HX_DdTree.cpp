@@ -1,0 +1,70 @@
+#include "platform/datadictionary/HX_DdTree.h"
+
+namespace {
+
+constexpr char kRoot[] = "//DD0";
+
+std::string absolute(const std::string& path) {
+  const bool fromRoot = path.size() > 1 && path[0] == '/' && path[1] != '/';
+  return fromRoot ? kRoot + path : path;
+}
+
+}  // namespace
+
+HX_DdTree& HX_DdTree::instance() {
+  static HX_DdTree s_tree;
+  return s_tree;
+}
+
+unsigned long HX_DdTree::add(const std::string& path, unsigned short kind) {
+  const std::string full = absolute(path);
+  const unsigned long known = find(full);
+  if (known != kInvalidHandle) {
+    if (kind != 0) m_Objects[known - 1].kind = kind;
+    return known;
+  }
+  const std::size_t slash = full.rfind('/');
+  const bool hasParent = slash != std::string::npos && slash > 1;
+  const unsigned long parent = hasParent ? add(full.substr(0, slash)) : 0;
+  m_Objects.push_back({full, parent, kind, {}});
+  return m_Objects.size();
+}
+
+void HX_DdTree::addReference(unsigned long handle, const std::string& property,
+                             const std::string& path) {
+  m_Objects[handle - 1].references.push_back({property, path});
+}
+
+unsigned long HX_DdTree::find(const std::string& path) const {
+  const std::string full = absolute(path);
+  for (unsigned long handle = 1; handle <= m_Objects.size(); ++handle)
+    if (object(handle).path == full) return handle;
+  return kInvalidHandle;
+}
+
+bool HX_DdTree::isValid(unsigned long handle) const {
+  return handle >= 1 && handle <= m_Objects.size();
+}
+
+const std::string& HX_DdTree::path(unsigned long handle) const {
+  return object(handle).path;
+}
+
+std::string HX_DdTree::name(unsigned long handle) const {
+  const std::string& full = path(handle);
+  return full.substr(full.rfind('/') + 1);
+}
+
+const std::vector<HX_DdTree::Reference>& HX_DdTree::references(
+    unsigned long handle) const {
+  return object(handle).references;
+}
+
+std::vector<unsigned long> HX_DdTree::children(unsigned long handle,
+                                               unsigned short kind) const {
+  std::vector<unsigned long> result;
+  for (unsigned long child = 1; child <= m_Objects.size(); ++child)
+    if (object(child).parent == handle && object(child).kind == kind)
+      result.push_back(child);
+  return result;
+}

@@ -1,0 +1,33 @@
+// Answers questions that concern several data types.
+
+#ifndef PLATFORM_DATATYPES_HX_DATATYPESERVER_H
+#define PLATFORM_DATATYPES_HX_DATATYPESERVER_H
+
+#include "platform/datatypes/HX_DataType.h"
+
+class HxCSrcRef;
+
+class HX_BaseTypeServer {
+ public:
+  /// The type that bit fields are declared with; null if there is none.
+  HX_DataType* getBitfieldBaseType() const { return m_pBitfieldBase; }
+  void setBitfieldBaseType(HX_DataType* type) { m_pBitfieldBase = type; }
+
+ private:
+  HX_DataType* m_pBitfieldBase = nullptr;
+};
+
+class HX_DataTypeServer {
+ public:
+  /// The element type of an array (of arrays), any other type itself.
+  HX_DataType* getAsScalar(HX_DataType* type, const HxCSrcRef*) const {
+    while (type->getElement() != nullptr) type = type->getElement();
+    return type;
+  }
+  HX_BaseTypeServer* getBaseServer() { return &m_BaseServer; }
+
+ private:
+  HX_BaseTypeServer m_BaseServer;
+};
+
+#endif  // PLATFORM_DATATYPES_HX_DATATYPESERVER_H
