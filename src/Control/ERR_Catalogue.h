@@ -68,11 +68,20 @@ inline constexpr ERR_CatalogueRow kErrCatalogue[] = {
     {1292, 99023, kInternalMessages, 5, false, "INTERNAL: %s"},
 };
 
+/// The index of the row with this number, -1 if the library does not emit it.
+constexpr int ERR_FindIndex(int number) {
+  int index = 0;
+  for (const ERR_CatalogueRow& row : kErrCatalogue) {
+    if (row.number == number) return index;
+    ++index;
+  }
+  return -1;
+}
+
 /// The row with this number, null if the library does not emit it.
 constexpr const ERR_CatalogueRow* ERR_FindRow(int number) {
-  for (const ERR_CatalogueRow& row : kErrCatalogue)
-    if (row.number == number) return &row;
-  return nullptr;
+  const int index = ERR_FindIndex(number);
+  return index < 0 ? nullptr : &kErrCatalogue[index];
 }
 
 #endif  // CONTROL_ERR_CATALOGUE_H
