@@ -1,0 +1,168 @@
+#include <cstdio>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <random>
+
+#include "Control/HxCControl.h"
+#include "SourceRef/HxCSrcRef.h"
+#include "Trace/HxCTraceFallThrough.h"
+#include "Trace/HxCTransformationTracer.h"
+#include "support/HX_TestFixture.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::StartsWith;
+
+class TraceTest : public HX_TestFixture {
+ protected:
+  ~TraceTest() override {
+    HxCTraceFallThrough::setVerbose(false);
+    HxCControl::setProductionCodeBehaviour();
+    HxCTransformationTracer::shutdown();
+    std::remove(m_FileName.c_str());
+  }
+
+  std::string fileContent() const {
+    std::ifstream file(m_FileName, std::ios::binary);
+    return {std::istreambuf_iterator<char>(file), {}};
+  }
+
+  const std::string m_FileName =
+      (std::filesystem::temp_directory_path() /
+       ("hx_trace_test_" + std::to_string(std::random_device()()) + ".txt"))
+          .string();
+};
+
+using Tracer = HxCTraceFallThrough;
+using Throw = bool (Tracer::*)() const;
+using ThrowAt = bool (Tracer::*)(const KyCXString&, int) const;
+using ThrowFor = bool (Tracer::*)(const KyCXString&, int,
+                                  const KyCXString&) const;
+
+struct LevelRow {
+  const char* head;  // row/severity of the message
+  Throw plain;
+  ThrowAt at;
+  ThrowFor because;
+  bool isDeadly;
+};
+
+const LevelRow kLevels[] = {
+    {"1272/4", &Tracer::throwNote, &Tracer::throwNote, &Tracer::throwNote,
+     false},
+    {"1273/5", &Tracer::throwWarning, &Tracer::throwWarning,
+     &Tracer::throwWarning, false},
+    {"1274/6", &Tracer::throwError, &Tracer::throwError, &Tracer::throwError,
+     false},
+    {"1275/7", &Tracer::throwDeadly, &Tracer::throwDeadly, &Tracer::throwDeadly,
+     true},
+};
+
+// Calls the three overloads; true if one of them did not return false.
+bool throwAll(const LevelRow& level) {
+  Tracer t;
+  const bool plain = (t.*level.plain)();
+  const bool at = (t.*level.at)("x.cpp", 12);
+  const bool because = (t.*level.because)("x.cpp", 12, "bad index");
+  return plain || at || because;
+}
+
+TEST_F(TraceTest, VerboseLevelsReportPlaceAndFailADebugCheck) {
+  const auto& reports = recordDebugReports();
+  Tracer::setVerbose(true);
+  for (const LevelRow& level : kLevels) {
+    SCOPED_TRACE(level.head);
+    clearMessages();
+    EXPECT_FALSE(throwAll(level));
+    const std::string head =
+        std::string(level.head) +
+        " trace fall through - early abortion. [Internal: Module: '";
+    EXPECT_THAT(messages(),
+                ElementsAre(head + "file unknown!', Line: -1 Reason: cause "
+                                   "unknown!]",
+                            head + "x.cpp', Line: 12 Reason: cause unknown!]",
+                            head + "x.cpp', Line: 12 Reason: bad index]"));
+  }
+  EXPECT_EQ(reports, std::vector<std::string>(12, "0"));
+}
+
+TEST_F(TraceTest, OnlyDeadlyFallThroughsSpeakWhileNotVerbose) {
+  const auto& reports = recordDebugReports();
+  for (const LevelRow& level : kLevels) {
+    SCOPED_TRACE(level.head);
+    clearMessages();
+    const HxCSrcRef before;
+    EXPECT_FALSE(throwAll(level));
+    EXPECT_EQ(HxCSrcRef().getSrcRefId(), before.getSrcRefId() + 1);
+    const std::size_t expected = level.isDeadly ? 3 : 0;
+    EXPECT_EQ(messages().size(), expected);
+    EXPECT_EQ(reports.size(), expected);
+    for (const std::string& message : messages()) {
+      EXPECT_THAT(message,
+                  testing::AllOf(StartsWith("7/3 Internal error. Error code: "),
+                                 testing::HasSubstr("HxCTraceFallThrough.cpp_"),
+                                 testing::Not(testing::HasSubstr(" ["))));
+    }
+  }
+}
+
+TEST_F(TraceTest, ControlReportsOnlyWithBothSwitchesOn) {
+  HxCControl control;
+  for (int switches = 0; switches < 4; ++switches) {
+    SCOPED_TRACE(switches);
+    HxCControl::setFallThrough(switches & 1);
+    Tracer::setVerbose((switches & 2) != 0);
+    clearMessages();
+    EXPECT_FALSE(control.traceFallThrough());
+    EXPECT_FALSE(control.traceFallThrough("y.cpp", 7));
+    EXPECT_FALSE(control.traceFallThrough("y.cpp", 7, "late"));
+    if (switches != 3) {
+      EXPECT_THAT(messages(), IsEmpty());
+      continue;
+    }
+    EXPECT_THAT(
+        messages(),
+        ElementsAre(StartsWith("1274/6 "),
+                    testing::EndsWith("'y.cpp', Line: 7 Reason: cause "
+                                      "unknown!]"),
+                    testing::EndsWith("'y.cpp', Line: 7 Reason: late]")));
+  }
+}
+
+TEST_F(TraceTest, TraceFileAppendsExactRecords) {
+  using Transformations = HxCTransformationTracer;
+  Transformations::logTransformation("before boot");
+  EXPECT_TRUE(Transformations::boot(m_FileName.c_str()));
+  Transformations::logTransformation("A");
+  Transformations::logTransformation("100%s");
+  Transformations::logTransformation(nullptr);
+  // The second boot closes, and so writes, the first trace.
+  EXPECT_TRUE(Transformations::boot(m_FileName.c_str()));
+  EXPECT_EQ(fileContent(), "A \n 100%s \n ");
+  Transformations::logTransformation("");
+  EXPECT_TRUE(Transformations::shutdown());
+  EXPECT_TRUE(Transformations::shutdown());
+  Transformations::logTransformation("after shutdown");
+  EXPECT_EQ(fileContent(), "A \n 100%s \n  \n ");
+  EXPECT_THAT(messages(), IsEmpty());
+}
+
+TEST_F(TraceTest, FailedBootReportsTheNameAndEndsTheOldTrace) {
+  using Transformations = HxCTransformationTracer;
+  EXPECT_TRUE(Transformations::boot(m_FileName.c_str()));
+  for (const char* name : {"/no/such/folder/t.txt", "", "/"}) {
+    clearMessages();
+    EXPECT_FALSE(Transformations::boot(name));
+    Transformations::logTransformation("lost");
+    EXPECT_THAT(
+        messages(),
+        ElementsAre("90/3 Cannot create file: " + std::string(name) + "."));
+  }
+  EXPECT_FALSE(Transformations::boot(nullptr));
+  EXPECT_EQ(fileContent(), "");
+}
+
+}  // namespace
