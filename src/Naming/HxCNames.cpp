@@ -1,0 +1,3 @@
+#include "Naming/HxCNames.h"
+
+HxCNames::~HxCNames() = default;

@@ -1,0 +1,327 @@
+// Expands name templates into C names.
+//
+// A template is literal text with macros: '$' and a letter, or an extended
+// macro "$(Name)". "$$" writes one '$'.
+//
+//   | macro | value                          | macro | value                 |
+//   | $B    | block name                     | $L    | signal label or block |
+//   | $S    | S, subsystem id and number     | $I    | subsystem id          |
+//   | $M    | model name                     | $N    | subsystem name        |
+//   | $O    | Stateflow object name          | $H    | its state hierarchy   |
+//   | $C    | C, subsystem id, object number | $D    | data dictionary name  |
+//   | $T    | short name of the base type    | $X    | the identifier's text |
+//   | $R    | nothing; the name may change   | $(..) | Type, BaseType,       |
+//   |       |                                |       | Component             |
+//
+//   HxCCIdentifier id("$S_$B");
+//   id.setSourceRef(block.getSrcRef());
+//   HxCNames names;
+//   if (!names.createNameFromForm(id, nullptr, 0, 0, false)) ...  // not final
+//
+// Values from the model become C identifiers one by one; the whole name does
+// not: the caller applies makeCIdentifier() and adaptSize() as it needs, asks
+// isStringValidCVariableName(), and makes the name distinct.
+
+#ifndef NAMING_HXCNAMES_H
+#define NAMING_HXCNAMES_H
+
+#include "Control/HX_Allocated.h"
+#include "HX_Export.h"
+#include "Naming/HxCCIdentifier.h"
+#include "platform/containers/ab_tree.h"
+#include "platform/containers/dictionary.h"
+#include "platform/strings/KyCXString.h"
+
+class HX_BdBlock;
+class HX_Block;
+class HX_DataType;
+class HxCSrcRef;
+class HxCSymbol;
+class SC_Model;
+
+/// Light: its one datum tells whether the last name was complete. The keyword
+/// dictionary belongs to the process.
+///
+/// A macro bit set has one bit per macro, the eMacro... constants. A macro
+/// whose bit is in `retainedMacros` stays in the name as text, for a later call
+/// to expand; one whose bit is in `provisionalMacros` is expanded, but the name
+/// is not final. Either makes the name incomplete.
+class HX_UTILS_API HxCNames : public HX_Allocated {
+ public:
+  enum HxEMacroBitTag : unsigned int {
+    eMacroLabel = 0x1,             ///< $L
+    eMacroBlockName = 0x2,         ///< $B
+    eMacroSystemNumber = 0x4,      ///< $S
+    eMacroSystemId = 0x8,          ///< $I
+    eMacroModelName = 0x10,        ///< $M
+    eMacroSubsystemName = 0x20,    ///< $N
+    eMacroStateHierarchy = 0x40,   ///< $H
+    eMacroSFObjectName = 0x80,     ///< $O
+    eMacroSFObjectId = 0x100,      ///< $C
+    eMacroDdObjectName = 0x200,    ///< $D
+    eMacroTypeName = 0x400,        ///< $T
+    eMacroXName = 0x800,           ///< $X
+    eMacroChangeable = 0x1000,     ///< $R
+    eMacroLongTypeName = 0x80000,  ///< $(Type) and $(BaseType)
+  };
+
+  /// How substAllDollarZByValue() matches a macro name.
+  enum tagMacroKindEnum {
+    eMacroKindExact = 0,    ///< as written
+    eMacroKindAnyCase = 1,  ///< in any mix of upper and lower case
+    /// all in lower case: by the value; all in upper case: by the value in
+    /// upper case
+    eMacroKindCaseSelectsValue = 2
+  };
+
+  /// The kind of a word in the keyword dictionary.
+  enum tagHxEDictEntryType {
+    eDictCKeyword = 0,      ///< message 408 when used as an identifier
+    eDictBaseTypeName = 1,  ///< message 409
+    eDictUserTypeName = 2   ///< message 410
+  };
+
+  /// The base time unit of the operating system.
+  enum tagHxEOsekTimeBase { eOsekTimeBaseUs = 1, eOsekTimeBaseMs = 4 };
+
+  HxCNames() = default;
+  HxCNames(const HxCNames&) = default;
+  HxCNames& operator=(const HxCNames&) = default;
+  virtual ~HxCNames();
+
+  // --- Templates ---
+
+  /// Expands both names of \p id and sets its cook level to 2; an identifier
+  /// that is at level 2 already stays as it is.
+  ///
+  /// Block, subsystem, Stateflow object and data dictionary object are those of
+  /// the identifier's references. A template without ':' is expanded once, and
+  /// its actual name is marked changeable. An actual name that follows the
+  /// formal one has "$L used" and its siblings set from the expanded text.
+  ///
+  /// Messages, attached to the source reference of \p id or else of its
+  /// intermediate-view block, and left out with \p suppressMessages:
+  /// - 503 (warning) for an empty template, which becomes "$C_$O" for a
+  ///   Stateflow object and "$S_$B" else; without any reference an internal
+  ///   assertion instead, in any case;
+  /// - 1202 (warning) for a macro that is not expanded here: $P, $V, $v, $F,
+  ///   $f, $E and most extended ones;
+  /// - 1203 (warning) for an unknown macro.
+  /// The single-letter ones stay in the name; of an extended macro "$(Name)"
+  /// "__Name_" is left.
+  /// \param type  what $T, $(Type) and $(BaseType) speak of; may be null
+  /// \return false if a macro was retained or provisional
+  bool createNameFromForm(HxCCIdentifier& id, HX_DataType* type,
+                          unsigned int retainedMacros,
+                          unsigned int provisionalMacros,
+                          bool suppressMessages);
+
+  /// Replaces every macro "$" + \p macro in both cooked names of \p id by the
+  /// cooked name of \p value of the same type. Extended macros and the argument
+  /// of "$E(...)" are never looked into, but \p macro may itself be an extended
+  /// one with its parentheses, "(Task)".
+  ///
+  /// \p id takes over the references of \p value that are not null, and each
+  /// flag of its active name that is true. The macro E or e raises \p id to
+  /// cook level 1; so does a \p value at level 1 if \p id is at level 0.
+  /// \return whether anything was replaced
+  bool substAllDollarZByValue(HxCCIdentifier& id, const KyCXString& macro,
+                              const HxCCIdentifier& value,
+                              tagMacroKindEnum kind);
+
+  /// Expands the template of a file name: $B, $S, $I, $M, $N and $R, and the
+  /// extended macros; every other single-letter macro stays. Without a source
+  /// reference, and unless \p useModelContext, $B, $S and $I stay as well.
+  /// \return see createNameFromForm()
+  bool handleFileNameMacro(HxCCIdentifier& id, bool useModelContext);
+
+  /// Substitutes $x (the symbol's text), $f for a function or $v for any other
+  /// symbol (its name, $F and $V in upper case) and $t (the short name of its
+  /// type, empty without one), and sets the cook level to 3. In the actual name
+  /// each value is followed by "$R".
+  void handleSymbolNameMacro(HxCCIdentifier& id, HxCSymbol* symbol);
+
+  // --- Keywords and validity ---
+
+  /// Creates the keyword dictionary with the 32 keywords of C90, in place of
+  /// one that is there.
+  static void boot();
+  /// Destroys the keyword dictionary, if there is one.
+  static void shutdown();
+
+  /// Enters \p word; a word already there becomes one of this kind. Without a
+  /// dictionary an internal assertion fails and nothing is entered.
+  void addToKeywordDict(const KyCXString& word, tagHxEDictEntryType type);
+
+  /// Whether \p name may be used as a C variable: not empty, no word of the
+  /// dictionary, a valid C identifier. A word of the dictionary is reported
+  /// with message 408, 409 or 410 (error). Without a dictionary an internal
+  /// assertion fails, and the answer is that of the C rules alone.
+  bool isStringValidCVariableName(const KyCXString& name);
+
+  /// Whether \p name, a file name without its extension, is not empty and holds
+  /// only letters, digits, '_' and '-'. Nothing else counts: not a leading
+  /// digit, not a keyword, not the length.
+  bool isFileNameValid(KyCXString& name);
+  /// The same for the cooked active name.
+  bool isFileNameValid(HxCCIdentifier& identifier);
+
+  /// Appends '_' and the letter code of \p index: a, b, ... z, aa, ba, ... za,
+  /// ab, ..., the least significant letter first. A negative \p index counts
+  /// as 0. With the option that limits names on, the text is cut before, so
+  /// that the result has at most HxCSymbol::sm_MaxNameLength characters.
+  void appendSuffix(KyCXString& name, int index);
+
+  // --- Multirate names ---
+  //
+  // Each replaces macros in the cooked names of \p id with
+  // substAllDollarZByValue(). Messages are attached to the source reference of
+  // \p id or else to its data dictionary reference.
+
+  /// Replaces the time macros by \p period and \p offset (seconds; of a
+  /// negative offset its amount): "$(Time1ms)", "$(Period10us)",
+  /// "$(Offset1s)"... in a fixed unit, "$(Time)", "$(Period)" and "$(Offset)"
+  /// in the largest exact unit up to the value, with that unit ("10ms"). A time
+  /// is the period and, unless the offset is 0, '_' and the offset.
+  ///
+  /// A value that is not a multiple of the fixed unit is rounded and reported
+  /// with message 1206 (warning), one that is no whole number of microseconds
+  /// with 1207 (warning), each only where the macro occurs. A count beyond the
+  /// 32-bit range is saturated. If not \p cyclic, every time macro becomes
+  /// "ACYCLIC", and one message 1205 (error) is reported if there was any.
+  void replaceMultirateTimeName(HxCCIdentifier& id, double period,
+                                double offset, bool cyclic);
+
+  /// Replaces $(Task) by \p task, or by \p isr if \p task has an empty active
+  /// cooked name, and $(ISR) by \p isr, both as C identifiers. In the name of a
+  /// task itself (\p isTaskName) $(Task) becomes "__Task_" with message 1204
+  /// (error).
+  void replaceMultirateTaskISRName(HxCCIdentifier& id,
+                                   const HxCCIdentifier& task,
+                                   const HxCCIdentifier& isr, bool isTaskName);
+
+  /// Replaces $(PObj), $(Event), $(ISR), $(Msg), $(Ctr) by the second argument
+  /// as a C identifier.
+  void replaceMultirateObjName(HxCCIdentifier& id, const HxCCIdentifier& obj);
+  void replaceMultirateEventName(HxCCIdentifier& id,
+                                 const HxCCIdentifier& event);
+  void replaceMultirateISRName(HxCCIdentifier& id, const HxCCIdentifier& isr);
+  void replaceMultirateMsgName(HxCCIdentifier& id, const HxCCIdentifier& msg);
+  void replaceMultirateCtrName(HxCCIdentifier& id, const HxCCIdentifier& ctr);
+
+  /// Replaces $(MsgVar) by what follows the last '#' of \p text, without its
+  /// last character; by "1" if there is no '#'. The value is not made a C
+  /// identifier.
+  void replaceMultirateMsgVarName(HxCCIdentifier& id, const KyCXString& text);
+
+ private:
+  friend class HxCNamesTestAccess;
+
+  struct Context;
+  struct Scan;
+  struct MacroRow;
+  struct TimeBase;
+
+  static constexpr HxCCIdentifier::HxENameTypeTag kActive =
+      HxCCIdentifier::eActiveName;
+
+  // Engine.
+  void createSingleNameFromForm(HxCCIdentifier& id, HX_DataType* type,
+                                unsigned int retainedMacros,
+                                unsigned int provisionalMacros,
+                                bool suppressMessages);
+  Context deriveContext(HxCCIdentifier& id);
+  static void enterBlock(Context& context);
+  static void enterStateflowObject(Context& context);
+  static KyCXString templateOf(const HxCCIdentifier& id, const Context& context,
+                               bool suppressMessages);
+  void scanTemplate(Scan& scan);
+  static const MacroRow* findMacro(unsigned short letter);
+  void expandDollarD(Scan& scan);
+  static void keepForeignMacro(Scan& scan, unsigned short letter);
+  bool substAllDollarZByValue(HxCCIdentifier& id, const KyCXString& macro,
+                              const HxCCIdentifier& value,
+                              tagMacroKindEnum kind,
+                              HxCCIdentifier::HxENameTypeTag type);
+  static int findDollarELength(const KyCXString& text, int start);
+  void getRootDollarI(KyCXString& systemId);
+
+  // Evaluators: each appends its macro's value, its text if it is retained, or
+  // a placeholder, and returns the number of template characters it consumed.
+  bool isRetained(KyCXString& result, unsigned int retainedMacros,
+                  unsigned int provisionalMacros, unsigned int bit,
+                  const char* macro);
+  int evaluateLabelMacro(KyCXString& result, unsigned int retainedMacros,
+                         unsigned int provisionalMacros,
+                         const KyCXString& label, const HX_Block* block);
+  int evaluateBlockNameMacro(KyCXString& result, unsigned int retainedMacros,
+                             unsigned int provisionalMacros,
+                             const HX_Block* block, HX_BdBlock* ivBlock);
+  int evaluateSystemNumberMacro(KyCXString& result, unsigned int retainedMacros,
+                                unsigned int provisionalMacros, HX_Block* block,
+                                const KyCXString& systemId, bool& changeable);
+  int evaluateSystemIDMacro(KyCXString& result, unsigned int retainedMacros,
+                            unsigned int provisionalMacros,
+                            const KyCXString& systemId);
+  int evaluateModelNameMacro(KyCXString& result, unsigned int retainedMacros,
+                             unsigned int provisionalMacros);
+  int evaluateSubsystemNameMacro(KyCXString& result,
+                                 unsigned int retainedMacros,
+                                 unsigned int provisionalMacros);
+  int evaluateStateHierarchyMacro(KyCXString& result,
+                                  unsigned int retainedMacros,
+                                  unsigned int provisionalMacros,
+                                  const SC_Model* object);
+  int evaluateSFObjectNameMacro(KyCXString& result, unsigned int retainedMacros,
+                                unsigned int provisionalMacros,
+                                const SC_Model* object);
+  int evaluateSFObjectIDMacro(KyCXString& result, unsigned int retainedMacros,
+                              unsigned int provisionalMacros,
+                              const SC_Model* object,
+                              const KyCXString& systemId, bool& changeable);
+  int evaluateDdObjectNameMacro(KyCXString& result, unsigned int retainedMacros,
+                                unsigned int provisionalMacros,
+                                const KyCXString& ddName);
+  int evaluateXNameMacro(KyCXString& result, unsigned int retainedMacros,
+                         unsigned int provisionalMacros,
+                         const KyCXString& xValue);
+  int evaluateSFObjectRMacro(KyCXString& result, unsigned int retainedMacros,
+                             unsigned int provisionalMacros, bool& changeable);
+  int evaluateTypeNameMacro(KyCXString& result, unsigned int retainedMacros,
+                            unsigned int provisionalMacros, HX_DataType* type);
+  void evaluateLongTypeMacro(KyCXString& result, unsigned int retainedMacros,
+                             unsigned int provisionalMacros, HX_DataType* type);
+  void evaluateBaseTypeMacro(KyCXString& result, unsigned int retainedMacros,
+                             unsigned int provisionalMacros, HX_DataType* type);
+  static KyCXString getTypeNameInCode(HX_DataType* type);
+  int evaluateExtendedNameMacro(KyCXString& result, unsigned int retainedMacros,
+                                unsigned int provisionalMacros,
+                                KyCXString& form, int pos, HxCCIdentifier& id,
+                                HX_DataType* type, const HxCSrcRef* srcRef,
+                                const HxCSrcRef* reportRef,
+                                bool suppressMessages);
+  void evaluateComponentMacro(KyCXString& result, unsigned int retainedMacros,
+                              unsigned int provisionalMacros,
+                              HxCCIdentifier& id);
+
+  // Multirate names.
+  void replaceBaseTimeMacros(HxCCIdentifier& id, double period, double offset);
+  void replaceGenericTimeMacro(HxCCIdentifier& id, double period,
+                               double offset);
+  static bool findGenericTimeMacro(double value, KyCXString& text);
+  void replaceAcyclicMultirateTimeName(HxCCIdentifier& id);
+  bool replaceMacro(HxCCIdentifier& id, const char* macro,
+                    const KyCXString& text);
+  void replaceByIdentifier(HxCCIdentifier& id, const char* macro,
+                           const HxCCIdentifier& value);
+  // Chooses the unit for \p value; 1000000 and above changes nothing.
+  static void determineOsekBaseTime(double value, tagHxEOsekTimeBase& base,
+                                    KyCXString& unit);
+
+  static leda::dictionary<KyCXString, tagHxEDictEntryType, leda::ab_tree>*
+      s_pKeywordDict;
+
+  bool m_NameComplete = true;
+};
+
+#endif  // NAMING_HXCNAMES_H
