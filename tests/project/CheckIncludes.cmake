@@ -5,6 +5,7 @@
 # Prints one line per violation and fails if there was one. The form of the
 # table is told in include_edges.txt.
 cmake_minimum_required(VERSION 3.25)
+get_filename_component(ROOT ${ROOT} ABSOLUTE)
 
 set(violations 0)
 function(report text)
