@@ -261,7 +261,8 @@ KyCXString& KyCXString::replaceWhiteSpace(char by, bool collapse) {
       if (!white)
         *out++ = *unit;
       else if (!inRun || !collapse)
-        *out++ = static_cast<std::remove_reference_t<decltype(*unit)>>(by);
+        *out++ = static_cast<std::remove_reference_t<decltype(*unit)>>(
+            static_cast<unsigned char>(by));
       inRun = white;
     }
     return out;
