@@ -5,28 +5,31 @@
 
 namespace {
 
-constexpr std::int64_t kNanosecondsPerSecond = 1'000'000'000;
-constexpr std::int64_t kNanosecondsPerMillisecond = 1'000'000;
+constexpr std::int64_t kTicksPerMillisecond = kSystemCounterFrequency / 1000;
+constexpr std::uint32_t kNanosecondsPerTick =
+    1'000'000'000 / kSystemCounterFrequency;
 
-std::int64_t monotonicNanoseconds() {
+std::int64_t monotonicTicks() {
   timespec now{};
   clock_gettime(CLOCK_MONOTONIC, &now);
-  return std::int64_t{now.tv_sec} * kNanosecondsPerSecond + now.tv_nsec;
+  // Nanoseconds of a second fit 32 bits, where the division is cheapest.
+  return std::int64_t{now.tv_sec} * kSystemCounterFrequency +
+         static_cast<std::uint32_t>(now.tv_nsec) / kNanosecondsPerTick;
 }
 
 // The library is loaded as part of the process start.
-const std::int64_t s_processStart = monotonicNanoseconds();
+const std::int64_t s_processStart = monotonicTicks();
 
 }  // namespace
 
 std::int64_t HX_ProcessClock() {
   if (HX_ClockSource* source = HX_ClockSource::installed())
     return source->processClock();
-  return (monotonicNanoseconds() - s_processStart) / kNanosecondsPerMillisecond;
+  return (monotonicTicks() - s_processStart) / kTicksPerMillisecond;
 }
 
 int QueryPerformanceFrequency(std::int64_t* frequency) {
-  std::int64_t found = kNanosecondsPerSecond;
+  std::int64_t found = kSystemCounterFrequency;
   if (HX_ClockSource* source = HX_ClockSource::installed())
     found = source->counterFrequency();
   if (found == 0) return 0;
@@ -37,7 +40,7 @@ int QueryPerformanceFrequency(std::int64_t* frequency) {
 int QueryPerformanceCounter(std::int64_t* ticks) {
   HX_ClockSource* source = HX_ClockSource::installed();
   if (source == nullptr) {
-    *ticks = monotonicNanoseconds();
+    *ticks = monotonicTicks();
     return 1;
   }
   if (source->counterFrequency() == 0) return 0;
