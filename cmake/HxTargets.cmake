@@ -9,10 +9,15 @@ function(hx_target_defaults target)
     VISIBILITY_INLINES_HIDDEN ON
     VERIFY_INTERFACE_HEADER_SETS ON)
   if(NOT MSVC)
+    file(RELATIVE_PATH src_from_build ${CMAKE_BINARY_DIR} ${PROJECT_SOURCE_DIR}/src)
     target_compile_options(${target} PRIVATE
       -Wall -Wextra -Wpedantic -Wconversion -Wshadow
-      # Error codes show the path below src/, the same on every machine.
+      # Error codes show the path below src/, the same on every machine; a
+      # compiler cache may have made the path relative to the build folder.
       -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/src/=
+      -fmacro-prefix-map=${src_from_build}/=
+      # g++ 12 sees uninitialised reads in moved variants that are none.
+      $<$<CXX_COMPILER_ID:GNU>:-Wno-maybe-uninitialized>
       # A double operation rounds once, to double: no fused multiply-add, and
       # on 32-bit x86 no 80-bit intermediate results.
       -ffp-contract=off)

@@ -1,0 +1,33 @@
+// The base-2 logarithm of an integer, rounded down.
+//
+//   IMS_Log2(1023u);   // 9
+//   IMS_Log2(1024u);   // 10
+//
+// The result is the index of the highest set bit; 0 and 1 both give 0. A
+// negative value has no logarithm and gives -1, which is no index of a bit.
+
+#ifndef MATH_IMS_LOG2_H
+#define MATH_IMS_LOG2_H
+
+#include <bit>
+
+constexpr int IMS_Log2(unsigned int value) {
+  return static_cast<int>(std::bit_width(value | 1U)) - 1;
+}
+
+constexpr int IMS_Log2(long long value) {
+  if (value < 0) return -1;
+  return static_cast<int>(
+             std::bit_width(static_cast<unsigned long long>(value) | 1U)) -
+         1;
+}
+
+constexpr int IMS_Log2(int value) {
+  return IMS_Log2(static_cast<long long>(value));
+}
+
+constexpr int IMS_Log2(long value) {
+  return IMS_Log2(static_cast<long long>(value));
+}
+
+#endif  // MATH_IMS_LOG2_H
