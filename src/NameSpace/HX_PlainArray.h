@@ -1,0 +1,59 @@
+// A growing array of plain values whose memory may run out.
+//
+//   HX_PlainArray<Entry*> entries;
+//   if (!entries.append(entry)) return nullptr;   // unchanged
+//
+// Unlike std::vector it asks the library's allocation functions and says no
+// instead of throwing.
+
+#ifndef NAMESPACE_HX_PLAINARRAY_H
+#define NAMESPACE_HX_PLAINARRAY_H
+
+#include <cstring>
+#include <type_traits>
+
+#include "Control/HX_Allocated.h"
+
+/// Not copied: an array belongs to one owner. Indices are not checked.
+template <class Value>
+class HX_PlainArray {
+  static_assert(std::is_trivially_copyable_v<Value>);
+
+ public:
+  HX_PlainArray() = default;
+  HX_PlainArray(const HX_PlainArray&) = delete;
+  HX_PlainArray& operator=(const HX_PlainArray&) = delete;
+  ~HX_PlainArray() { HX_Free(m_Values); }
+
+  unsigned size() const { return m_Size; }
+  const Value& operator[](unsigned index) const { return m_Values[index]; }
+  const Value* begin() const { return m_Values; }
+  const Value* end() const { return m_Values + m_Size; }
+
+  /// \return false, with nothing changed, if there is no memory
+  bool append(const Value& value) {
+    if (m_Size == m_Capacity && !grow()) return false;
+    m_Values[m_Size++] = value;
+    return true;
+  }
+  /// Takes the last value away; the array must not be empty.
+  void dropLast() { --m_Size; }
+
+ private:
+  bool grow() {
+    const unsigned capacity = m_Capacity == 0 ? 4 : m_Capacity * 2;
+    void* room = HX_Allocate(capacity * sizeof(Value));
+    if (room == nullptr) return false;
+    if (m_Size != 0) std::memcpy(room, m_Values, m_Size * sizeof(Value));
+    HX_Free(m_Values);
+    m_Values = static_cast<Value*>(room);
+    m_Capacity = capacity;
+    return true;
+  }
+
+  Value* m_Values = nullptr;
+  unsigned m_Size = 0;
+  unsigned m_Capacity = 0;
+};
+
+#endif  // NAMESPACE_HX_PLAINARRAY_H

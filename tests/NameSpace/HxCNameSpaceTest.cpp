@@ -1,0 +1,284 @@
+#include "NameSpace/HxCNameSpace.h"
+
+#include <deque>
+#include <map>
+#include <random>
+
+#include "NameSpace/HX_FailingController.h"
+#include "NameSpace/HxCXStringIdServer.h"
+#include "platform/model/HxCSymbol.h"
+#include "support/HX_TestFixture.h"
+
+namespace {
+
+using testing::Each;
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::StartsWith;
+using Scope = HxCNameSpace::Scope;
+
+class NameSpaceTest : public HX_TestFixture {
+ protected:
+  NameSpaceTest() { m_Ids.boot(); }
+  ~NameSpaceTest() override { m_Ids.shutdown(); }
+
+  // Symbols by number; nothing looks into them.
+  HxCSymbol* symbol(unsigned number) {
+    while (m_Symbols.size() <= number)
+      m_Symbols.emplace_back("symbol", HxCSymbol::eVariable);
+    return &m_Symbols[number];
+  }
+
+  HxCXStringIdServer m_Ids;
+  std::deque<HxCSymbol> m_Symbols;
+};
+
+TEST_F(NameSpaceTest, HandleMakesOneScope) {
+  HxCNameSpace outer(&m_Ids), inner(&m_Ids);
+  EXPECT_EQ(inner.getDebugIndex(), outer.getDebugIndex() + 1);
+  EXPECT_EQ(HxCNameSpace(inner).getDebugIndex(), inner.getDebugIndex());
+  EXPECT_EQ(HxCNameSpace::sm_ObjectCount, inner.getDebugIndex() + 1);
+  Scope* const root = outer.newEnv();
+  EXPECT_EQ(outer.newScope(root), root);
+  EXPECT_THAT(messages(), IsEmpty());
+  EXPECT_EQ(outer.newEnv(), root);
+  EXPECT_THAT(messages(), ElementsAre(testing::HasSubstr("HxCNameSpace")));
+  Scope* const child = inner.newScope(root);
+  EXPECT_NE(child, root);
+  inner.defineString("i");
+  EXPECT_TRUE(outer.stringInEnv("i"));
+  EXPECT_FALSE(outer.stringInScope("i"));
+  delete root;
+}
+
+TEST_F(NameSpaceTest, NamesWithoutSymbolCountOnlyForPlainQueries) {
+  HxCNameSpace names(&m_Ids);
+  Scope* const root = names.newEnv();
+  HxCSymbol* found = symbol(0);
+  HxCSmbScopeData* data = nullptr;
+  int key = 0;
+  names.createIdn("x", key);
+  EXPECT_EQ(key, 'x');
+  EXPECT_TRUE(names.defineIdn(key));
+  EXPECT_FALSE(names.defineString("x", symbol(1)));
+  EXPECT_TRUE(names.stringInScope("x") && names.keyInScope(key));
+  EXPECT_TRUE(names.stringInEnv("x") && names.keyInEnv(key));
+  EXPECT_FALSE(names.stringInScope("x", found));
+  EXPECT_FALSE(names.stringInEnv("x", found) || names.keyInEnv(key, found));
+  EXPECT_FALSE(names.stringInEnv("x", data));
+  EXPECT_EQ(found, symbol(0));
+  EXPECT_TRUE(names.defineString("y", symbol(2)));
+  EXPECT_FALSE(names.defineString("y", symbol(3)));
+  EXPECT_TRUE(names.stringInScope("y", found));
+  EXPECT_EQ(found, symbol(2));
+  EXPECT_TRUE(names.stringInEnv("y", data));
+  data->incrCollisionCount();
+  data->setCollisionCount(data->getCollisionCount() - 3);
+  data->decrCollisionCount();
+  EXPECT_EQ(data->getCollisionCount(), -3);
+  auto& reports = recordDebugReports();
+  data->setSymbol(nullptr);
+  EXPECT_TRUE(names.stringInEnv("y", found));
+  EXPECT_EQ(found, nullptr);
+  EXPECT_THAT(reports, ElementsAre("symbol != 0"));
+  delete root;
+}
+
+TEST_F(NameSpaceTest, BreachedPreconditionsAssertAndGiveNothing) {
+  HxCNameSpace empty(&m_Ids), serverless(nullptr), scoped(&m_Ids);
+  Scope* const root = scoped.newEnv();
+  serverless.setScope(root);
+  const auto useless = [this](HxCNameSpace& names) {
+    HxCSymbol* found = symbol(0);
+    HxCSmbScopeData* data = nullptr;
+    return !names.defineString("a") && !names.defineString("a", found) &&
+           !names.stringInScope("a") && !names.stringInScope("a", found) &&
+           !names.stringInEnv("a") && !names.stringInEnv("a", data) &&
+           !names.stringInEnv("a", found) && !names.remove("a") &&
+           found == symbol(0);
+  };
+  EXPECT_TRUE(useless(empty) && useless(serverless));
+  HxCSymbol* found = nullptr;
+  HxCSmbScopeData* data = nullptr;
+  EXPECT_FALSE(empty.keyInScope(1) || empty.keyInEnv(1) || empty.defineIdn(1));
+  EXPECT_FALSE(empty.defineIdn(1, found) || empty.keyInEnv(1, found));
+  EXPECT_FALSE(empty.keyInEnv(1, data));
+  m_Ids.shutdown();
+  EXPECT_TRUE(useless(scoped));
+  EXPECT_THAT(messages(), Each(StartsWith("7/3 ")));
+  EXPECT_EQ(messages().size(), 30U);
+  EXPECT_FALSE(root->containsInScope(0));
+  delete root;
+}
+
+// A scope in the plainest form, and the searches as their definition reads.
+struct PlainScope {
+  PlainScope* parent;
+  std::vector<PlainScope*> children;
+  std::map<int, HxCSymbol*> entries;  // null: without scope data
+
+  bool outward(int key, HxCSymbol*& value) const {
+    for (const PlainScope* s = this; s != nullptr; s = s->parent)
+      if (s->entries.count(key) != 0) return value = s->entries.at(key), true;
+    return false;
+  }
+  bool holdsBelow(int key) const {
+    for (const PlainScope* c : children)
+      if (c->entries.count(key) != 0 || c->holdsBelow(key)) return true;
+    return false;
+  }
+  HxCSymbol* lookupBelow(int key) const {
+    for (const PlainScope* c : children) {
+      if (c->entries.count(key) != 0) return c->entries.at(key);
+      if (HxCSymbol* value = c->lookupBelow(key)) return value;
+    }
+    return nullptr;
+  }
+};
+
+struct ForestCase {
+  const char* why;
+  int steps;
+  unsigned irregular;  // per cent of the scopes listed elsewhere or not at all
+  unsigned chain;      // per cent of the scopes put into the latest one
+  unsigned failing;    // per cent of the allocations
+};
+
+const ForestCase kForestCases[] = {
+    {"trees", 3000, 0, 0, 0},
+    {"nested deeper than the counts reach", 1500, 0, 90, 0},
+    {"children that are not of their parent", 2000, 15, 20, 0},
+    {"some listed late, many not at all", 1500, 60, 40, 0},
+    {"running out of memory", 3000, 0, 40, 10},
+};
+
+// Grows a forest and the plain one side by side.
+class Forest {
+ public:
+  Forest(HxCXStringIdServer& ids, const ForestCase& row, unsigned seed)
+      : m_Names(&ids), m_Row(row), m_Random(seed) {}
+  ~Forest() {
+    for (std::size_t i = 0; i < m_Scopes.size(); ++i)
+      if (!m_IsOwned[i]) delete m_Scopes[i];
+  }
+
+  void step(HxCSymbol* symbol) {
+    switch (m_Plain.empty() ? 0 : random(20)) {
+      case 0:
+        return makeScope();
+      case 1:
+        return random(100) < m_Row.irregular ? listScope() : makeScope();
+      case 2:
+      case 3:
+      case 4:
+        return removeName();
+      default:
+        return defineName(symbol);
+    }
+  }
+
+  void compare() {
+    const std::size_t at = random(m_Plain.size());
+    const int key = randomKey();
+    SCOPED_TRACE(testing::Message() << "scope " << at << " key " << key);
+    const PlainScope& plain = m_Plain[at];
+    m_Names.setScope(m_Scopes[at]);
+    HxCSymbol* value = nullptr;
+    const bool isAround = plain.outward(key, value);
+    if (!isAround) value = plain.lookupBelow(key);
+    ASSERT_EQ(m_Names.keyInScope(key), plain.entries.count(key) != 0);
+    ASSERT_EQ(m_Names.keyInEnv(key), isAround || plain.holdsBelow(key));
+    HxCSmbScopeData* data = nullptr;
+    ASSERT_EQ(m_Names.keyInEnv(key, data), value != nullptr);
+    ASSERT_EQ(data == nullptr ? nullptr : data->getSymbol(), value);
+  }
+
+ private:
+  std::size_t random(std::size_t bound) { return m_Random() % bound; }
+  // Some common to many scopes, most not; negative ones too.
+  int randomKey() {
+    return random(2) == 0 ? static_cast<int>(random(4)) - 2
+                          : static_cast<int>(random(300)) * 1024 - 100000;
+  }
+  std::size_t randomParent() {
+    return random(100) < m_Row.chain ? m_Plain.size() - 1
+                                     : random(m_Plain.size());
+  }
+
+  void makeScope() {
+    const bool isRoot = m_Plain.empty() || random(40) == 0;
+    const std::size_t parent = isRoot ? 0 : randomParent();
+    Scope* const around = isRoot ? nullptr : m_Scopes[parent];
+    const bool byHand = random(100) < m_Row.irregular;
+    m_Names.setScope(nullptr);
+    Scope* const scope = byHand ? new Scope(around) : m_Names.newScope(around);
+    if (scope == nullptr) return;
+    m_Scopes.push_back(scope);
+    m_IsOwned.push_back(!byHand && !isRoot);
+    m_Plain.push_back({isRoot ? nullptr : &m_Plain[parent], {}, {}});
+    if (!byHand && !isRoot) m_Plain[parent].children.push_back(&m_Plain.back());
+  }
+
+  // Any older scope may list a younger one, so that no cycle arises.
+  void listScope() {
+    const std::size_t child = random(m_Plain.size());
+    if (child == 0) return;
+    std::size_t by = random(child);
+    if (random(2) == 0 && m_Plain[child].parent != nullptr)
+      while (&m_Plain[by] != m_Plain[child].parent) by = random(child);
+    // Every path doubles the plain search: keep them few.
+    if (m_Plain[by].children.size() > 3) return;
+    ASSERT_TRUE(m_Scopes[by]->addChild(m_Scopes[child]));
+    m_IsOwned[child] = true;
+    m_Plain[by].children.push_back(&m_Plain[child]);
+  }
+
+  void defineName(HxCSymbol* symbol) {
+    const std::size_t at = random(m_Plain.size());
+    const int key = randomKey();
+    const bool isNew = m_Plain[at].entries.count(key) == 0;
+    m_Names.setScope(m_Scopes[at]);
+    if (random(3) == 0) symbol = nullptr;
+    const bool isEntered = symbol == nullptr ? m_Names.defineIdn(key)
+                                             : m_Names.defineIdn(key, symbol);
+    ASSERT_TRUE(isEntered == isNew || (isNew && m_Row.failing != 0));
+    if (isEntered) m_Plain[at].entries.emplace(key, symbol);
+  }
+
+  void removeName() {
+    const std::size_t at = random(m_Plain.size());
+    const int key = randomKey();
+    HxCSmbScopeData* const data = m_Scopes[at]->lookupInScope(key);
+    m_Scopes[at]->removeKey(key);
+    delete data;
+    m_Plain[at].entries.erase(key);
+  }
+
+  HxCNameSpace m_Names;
+  const ForestCase& m_Row;
+  std::mt19937 m_Random;
+  std::vector<Scope*> m_Scopes;
+  std::vector<bool> m_IsOwned;
+  std::deque<PlainScope> m_Plain;
+};
+
+TEST_F(NameSpaceTest, SearchesAgreeWithThePlainWalkAndTreesReturnAllMemory) {
+  for (const ForestCase& row : kForestCases) {
+    for (unsigned seed = 1; seed <= 4; ++seed) {
+      SCOPED_TRACE(testing::Message() << row.why << ", seed " << seed);
+      HX_FailingController memory;
+      memory.setPercent(row.failing, seed);
+      {
+        Forest forest(m_Ids, row, seed);
+        for (unsigned i = 0; i < static_cast<unsigned>(row.steps); ++i) {
+          ASSERT_NO_FATAL_FAILURE(forest.step(symbol(i % 50)));
+          for (int query = 0; query < 3; ++query)
+            ASSERT_NO_FATAL_FAILURE(forest.compare());
+        }
+      }
+      EXPECT_EQ(memory.liveBlocks(), 0);
+    }
+  }
+}
+
+}  // namespace
