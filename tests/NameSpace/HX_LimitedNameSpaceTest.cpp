@@ -1,0 +1,226 @@
+#include "NameSpace/HX_LimitedNameSpace.h"
+
+#include <iterator>
+#include <map>
+#include <random>
+
+#include "NameSpace/HX_FailingController.h"
+#include "platform/model/HX_Options.h"
+#include "platform/model/HxCGlobal.h"
+#include "platform/model/HxCSymbol.h"
+#include "support/HX_TestFixture.h"
+
+namespace {
+
+class LimitedNameSpaceTest : public HX_TestFixture {
+ protected:
+  LimitedNameSpaceTest() { HxCGlobal::setOptions(&m_Options); }
+  ~LimitedNameSpaceTest() override { HxCGlobal::setOptions(nullptr); }
+
+  HX_OptionsExt m_Options;
+};
+
+struct Step {
+  char operation;  // '+' add, '-' remove, 'u' addUnique, 'd' derive, 'l' derive
+                   // with length adaption
+  const char* name;
+  const char* result = nullptr;
+};
+
+struct StepsCase {
+  const char* why;
+  bool limit;
+  std::vector<Step> steps;
+};
+
+#define HX_29 "abcdefghijklmnopqrstuvwxyz012"
+
+const StepsCase kStepsCases[] = {
+    {"free names stay", false, {{'d', "x", "x"}, {'u', "x", "x"}}},
+    {"variants in turn",
+     false,
+     {{'+', "x"}, {'u', "x", "x_a"}, {'u', "x", "x_b"}, {'u', "X", "X"}}},
+    {"deriving alone repeats itself",
+     false,
+     {{'+', "x"}, {'+', "x_a"}, {'d', "x", "x_b"}, {'d', "x", "x_b"}}},
+    {"a variant counts from its own start",
+     false,
+     {{'+', "x"}, {'u', "x", "x_a"}, {'u', "x_a", "x_a_a"}}},
+    {"a freed suffix is not used again",
+     false,
+     {{'+', "x"},
+      {'u', "x", "x_a"},
+      {'u', "x", "x_b"},
+      {'-', "x_a"},
+      {'u', "x", "x_c"}}},
+    {"adding again keeps the counter, removing resets it",
+     false,
+     {{'+', "x"},
+      {'u', "x", "x_a"},
+      {'u', "x", "x_b"},
+      {'-', "x_a"},
+      {'+', "x"},
+      {'u', "x", "x_c"},
+      {'-', "x"},
+      {'+', "x"},
+      {'u', "x", "x_a"}}},
+    {"the limit keeps 29 characters",
+     true,
+     {{'+', HX_29 "34"}, {'u', HX_29 "34", HX_29 "_a"}}},
+    {"a shortened free name is not derived",
+     false,
+     {{'l', HX_29 "3456", "abcdefghijklmno__tuvwxyz0123456"}}},
+    {"only the first variant is one of the shortened name",
+     true,
+     {{'+', "abcdefghijklmno__tuvwxyz0123456"},
+      {'+', "abcdefghijklmno__tuvwxyz01234_a"},
+      {'l', HX_29 "3456", HX_29 "_b"}}},
+};
+
+TEST_F(LimitedNameSpaceTest, FollowsTheCounters) {
+  for (const StepsCase& row : kStepsCases) {
+    SCOPED_TRACE(row.why);
+    m_Options.setLimitVariableNameLength(row.limit);
+    HX_LimitedNameSpace names;
+    for (const Step& step : row.steps) {
+      KyCXString s(step.name);
+      switch (step.operation) {
+        case '+':
+          names.add(&s);
+          break;
+        case '-':
+          names.remove(s);
+          break;
+        case 'u':
+          names.addUnique(&s);
+          break;
+        case 'd':
+          names.deriveUniqueString(s);
+          break;
+        default:
+          names.deriveUniqueStringAdaptLength(s);
+      }
+      if (step.result == nullptr) continue;
+      EXPECT_EQ(s, KyCXString(step.result));
+      EXPECT_EQ(names.isDefined(&s), step.operation == 'u');
+    }
+  }
+}
+
+// The set as its definition reads: every suffix is tried.
+struct PlainNames {
+  bool derive(KyCXString& s, bool addResult, bool adaptLength) {
+    HxCNames naming;
+    const KyCXString in = s;
+    if (adaptLength) shorten(s);
+    const auto base = counters.find(s);
+    if (base != counters.end()) {
+      int c = base->second;
+      for (;; ++c, s = in) {
+        naming.appendSuffix(s, c);
+        if (adaptLength) shorten(s);
+        if (counters.count(s) == 0) break;
+      }
+      base->second = c;
+    }
+    if (addResult) counters.emplace(s, 0);
+    return base != counters.end();
+  }
+  static void shorten(KyCXString& s) {
+    s.shortenString(HxCSymbol::sm_MaxNameLength, 2, '_',
+                    KyCXString::ePositionMiddle);
+  }
+
+  std::map<KyCXString, int> counters;
+};
+
+struct MixCase {
+  const char* why;
+  int shortest, longest;  // length of the drawn names
+  unsigned characters;    // taken from the front of kUnits
+  unsigned switching;     // per mille of steps that switch the limit option
+  unsigned removing;      // per cent of steps that remove
+};
+
+constexpr unsigned short kUnits[] = {'a', '_', 'z', 'Z', 0x100, 0x101, 0};
+
+const MixCase kMixCases[] = {
+    {"few bases, many variants", 1, 2, 2, 0, 5},
+    {"variants of variants, much removed", 1, 6, 3, 0, 40},
+    {"around the limit", 20, 40, 1, 5, 20},
+    {"long names, wide and zero units", 22, 36, 7, 5, 20},
+    {"one head under the limit", 31, 200, 1, 0, 2},
+};
+
+TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
+  for (const MixCase& row : kMixCases) {
+    for (unsigned seed = 1; seed <= 4; ++seed) {
+      SCOPED_TRACE(testing::Message() << row.why << ", seed " << seed);
+      HX_CountingController memory;
+      std::mt19937 random(seed);
+      m_Options.setLimitVariableNameLength(seed % 2 == 0);
+      HX_LimitedNameSpace names;
+      PlainNames plain;
+      for (int i = 0; i < 2500; ++i) {
+        std::vector<unsigned short> text(
+            static_cast<unsigned>(row.shortest) +
+            random() % static_cast<unsigned>(row.longest - row.shortest + 1));
+        for (auto& unit : text) unit = kUnits[random() % row.characters];
+        KyCXString s(text.data(), static_cast<int>(text.size()));
+        if (random() % 4 == 0 && !plain.counters.empty())
+          s = std::next(plain.counters.begin(),
+                        static_cast<long>(random() % plain.counters.size()))
+                  ->first;
+        if (random() % 1000 < row.switching)
+          m_Options.setLimitVariableNameLength(random() % 2 == 0);
+        if (random() % 500 == 0) {
+          const HX_LimitedNameSpace copy(names);
+          names = HX_LimitedNameSpace();
+          names = copy;
+        }
+        KyCXString expected = s;
+        ASSERT_EQ(names.isDefined(s), plain.counters.count(s) != 0);
+        if (random() % 100 < row.removing) {
+          names.remove(s);
+          plain.counters.erase(s);
+          continue;
+        }
+        bool derived = false;
+        const unsigned operation = random() % 8;
+        const bool isDerived =
+            plain.derive(expected, operation > 3, operation < 2);
+        if (operation > 3)
+          names.addUnique(s);
+        else if (operation < 2)
+          names.deriveUniqueStringAdaptLength(s, derived);
+        else
+          names.deriveUniqueString(&s, derived);
+        ASSERT_EQ(s, expected) << i;
+        ASSERT_EQ(derived, isDerived && operation <= 3) << i;
+      }
+      names = HX_LimitedNameSpace();
+      EXPECT_EQ(memory.liveBlocks(), 0);
+    }
+  }
+}
+
+TEST_F(LimitedNameSpaceTest, StaysSoundWithoutMemory) {
+  HX_FailingController memory;
+  memory.setPercent(20, 3);
+  {
+    HX_LimitedNameSpace names;
+    for (int i = 0; i < 500; ++i) {
+      KyCXString s(i % 5 == 0 ? HX_29 "3456" : "x"), before(s);
+      m_Options.setLimitVariableNameLength(i % 2 == 0);
+      bool derived = false;
+      const bool isTaken = names.isDefined(s);
+      names.deriveUniqueString(s, derived);
+      EXPECT_EQ(derived, isTaken);
+      EXPECT_FALSE(names.isDefined(s));
+      names.addUnique(before);
+    }
+  }
+  EXPECT_EQ(memory.liveBlocks(), 0);
+}
+
+}  // namespace
