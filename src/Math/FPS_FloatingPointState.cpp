@@ -1,0 +1,38 @@
+// Sets the state of the floating-point unit when the library is loaded.
+//
+// Nothing refers to this file, so users of the static library pull it in with a
+// linker option (see CMakeLists.txt).
+
+#include <cfenv>
+
+#if defined(__i386__) && defined(__GLIBC__)
+#include <fpu_control.h>
+#elif defined(_M_IX86)
+#include <float.h>
+#endif
+
+namespace {
+
+// Where doubles are computed by the SSE unit alone (64 bit), the x87 precision
+// stays: it would only spoil the host's long double.
+int setFloatingPointState() {
+#if defined(__i386__) && defined(__GLIBC__)
+  fpu_control_t control;
+  _FPU_GETCW(control);
+  control = static_cast<fpu_control_t>(
+      (control & ~(_FPU_EXTENDED | _FPU_RC_ZERO)) | _FPU_DOUBLE);
+  _FPU_SETCW(control);
+#elif defined(_M_IX86)
+  unsigned int control;
+  _controlfp_s(&control, _PC_53, _MCW_PC);
+#endif
+  return std::fesetround(FE_TONEAREST);
+}
+
+}  // namespace
+
+// 0 if the state could be set.
+extern "C" {
+extern const int hx_utils_floatingPointState;
+const int hx_utils_floatingPointState = setFloatingPointState();
+}

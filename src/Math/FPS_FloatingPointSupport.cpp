@@ -1,0 +1,241 @@
+#include "Math/FPS_FloatingPointSupport.h"
+
+#include <algorithm>
+#include <bit>
+#include <cmath>
+
+#include "Control/HX_SelfCheck.h"
+#include "Math/implMath/HX_NaturalLog.h"
+#include "platform/datatypes/DT_DataTypes.h"
+
+namespace {
+
+constexpr char kErrorCode[] = __FILE__ "_";
+
+constexpr int kUnsigned32 = 11;  // type codes of the data type server
+constexpr int kSigned32 = 15;
+
+constexpr double kDefaultTolerance = 0x1p-26;  // sqrt(2^-52)
+constexpr double kShortLn2 = 0.69314718055995;
+constexpr double kThirteenPlaces = 10000000000000.0;
+
+double s_NaN = 0.0;
+double s_PosInf = 0.0;
+double s_NegInf = 0.0;
+double s_Pi = 0.0;
+
+// A special value as it is handed back: registers of the 32-bit convention
+// turn a signalling NaN quiet, so it is made quiet everywhere.
+double returnSpecial(double x) { return x + x; }
+
+bool areEqual(double a, double b) {
+  return a == b || (std::isnan(a) && std::isnan(b));
+}
+
+bool areApproxEqual(double a, double b, double tolerance) {
+  if (!std::isfinite(a) || !std::isfinite(b)) return areEqual(a, b);
+  const double scale = std::max({1.0, std::fabs(a), std::fabs(b)});
+  return tolerance * scale > std::fabs(a - b);
+}
+
+long long satCastToInt64(double x) {
+  const int code = DT_GetINT64();
+  if (!(x < 0.0)) {
+    return DT_GetMax(code) > x ? static_cast<long long>(x)
+                               : DT_GetMaxAsInt64(code);
+  }
+  return DT_GetMin(code) < x ? static_cast<long long>(x)
+                             : DT_GetMinAsInt64(code);
+}
+
+// The truncation with the 64-bit bounds as a double again.
+double truncate(double x) { return static_cast<double>(satCastToInt64(x)); }
+
+int satCastToInt(double x) {
+  if (!(x < 0.0)) {
+    return x < 2147483647.0 ? static_cast<int>(x) : 2147483647;
+  }
+  return x > -2147483648.0 ? static_cast<int>(x) : -2147483647 - 1;
+}
+
+bool isIntegerValue(double x) {
+  return areApproxEqual(truncate(std::floor(x + 0.5)), x, kDefaultTolerance);
+}
+
+// The integer that the near-integer x stands for.
+double snap(double x) {
+  HX_Assert(isIntegerValue(x), kErrorCode);
+  const double nearest = std::floor(x + 0.5);
+  if (x > 0.0) return truncate(nearest > x ? x + 1.0 : x);
+  return truncate(nearest < x ? x - 1.0 : x);
+}
+
+double log2OfReal(double x) { return HX_NaturalLog(x) / kShortLn2; }
+
+bool isPowerOf2(double x, int& exponent) {
+  const auto bits = std::bit_cast<std::uint64_t>(x);
+  exponent = 0;
+  if (x == 0.0 || bits << 12 != 0) return false;
+  exponent = static_cast<int>(bits >> 52 & 0x7FF) - 1023;
+  return true;
+}
+
+}  // namespace
+
+void ModInit_FPS_FloatingPointSupport() {
+  s_NaN = std::fmod(1.0, 0.0);
+  s_PosInf = HUGE_VAL;
+  s_NegInf = -s_PosInf;
+  s_Pi = std::atan(1.0) * 4.0;
+  HX_Assert(std::isnan(s_NaN), kErrorCode);
+  HX_Assert(!std::isfinite(s_PosInf), kErrorCode);
+  HX_Assert(!std::isfinite(s_NegInf), kErrorCode);
+}
+
+double FPS_GetFlNaN() { return s_NaN; }
+double FPS_GetPosInf() { return s_PosInf; }
+double FPS_GetNegInf() { return s_NegInf; }
+double FPS_GetPi() { return s_Pi; }
+
+bool FPS_CastFloatToBool(double x) { return x != 0.0; }
+
+bool FPS_ValuesAreEqual(double a, double b) { return areEqual(a, b); }
+
+bool FPS_ValuesAreApproxEqual(double a, double b, double tol) {
+  return areApproxEqual(a, b, tol);
+}
+
+bool FPS_ValuesAreApproxEqual(double a, double b) {
+  return areApproxEqual(a, b, kDefaultTolerance);
+}
+
+bool FPS_IsIntegerValue(double x) { return isIntegerValue(x); }
+
+double FPS_RoundOffBits(double x, int bits) {
+  if (!std::isfinite(x)) return returnSpecial(x);
+  // Beyond these nothing changes any more; a negated minimum would overflow.
+  constexpr int kMostBits = 5000;
+  const int places = std::clamp(bits, -kMostBits, kMostBits);
+  int exponent = 0;
+  const double mantissa = std::frexp(x, &exponent);
+  const double rounded = std::floor(std::ldexp(mantissa, places) + 0.5);
+  return std::ldexp(std::ldexp(rounded, -places), exponent);
+}
+
+double FPS_RoundOffDigits(double x) {
+  if (!std::isfinite(x)) return returnSpecial(x);
+  return std::floor(x * kThirteenPlaces + 0.5) / kThirteenPlaces;
+}
+
+int FPS_SatCastToInt(double x) { return satCastToInt(x); }
+
+long long FPS_SatCastToInt64(double x) { return satCastToInt64(x); }
+
+std::uint32_t FPS_SatCastToULong(double x) {
+  if (!HX_Assert(!(x < 0.0), kErrorCode) || DT_GetMax(kUnsigned32) > x) {
+    return static_cast<std::uint32_t>(satCastToInt64(x));
+  }
+  return static_cast<std::uint32_t>(DT_GetMaxAsInt64(kUnsigned32));
+}
+
+double FPS_SatCutOffAfterPointDecimals(double x) { return truncate(x); }
+
+bool FPS_Fits32Bit(double x, double& limit) {
+  const bool isNegative = x < 0.0;
+  const double bound =
+      isNegative ? DT_GetMin(kSigned32) : DT_GetMax(kUnsigned32);
+  if (!(isNegative ? bound > x : bound < x)) return true;
+  limit = bound;
+  return false;
+}
+
+bool FPS_ConvertSpecialValueToInteger(double x, double* out) {
+  if (std::isfinite(x)) {
+    *out = 0.0;
+    return false;
+  }
+  *out = x < 0.0 ? DT_GetMin(DT_GetINT64()) : DT_GetMax(DT_GetINT64());
+  return true;
+}
+
+double FPS_Round(double x) { return truncate(x < 0.0 ? x - 0.5 : x + 0.5); }
+
+double FPS_RoundUp(double x) {
+  if (isIntegerValue(x)) return snap(x);
+  return truncate(x < 0.0 ? x : x + 1.0);
+}
+
+double FPS_RoundDown(double x) {
+  if (isIntegerValue(x)) return snap(x);
+  return truncate(x < 0.0 ? x - 1.0 : x);
+}
+
+double FPS_SimulinkAlikeModulo(double x, double y) {
+  if (y == 0.0) return std::isnan(x) ? returnSpecial(x) : x;
+  return x - std::floor(x / y) * y;
+}
+
+double FPS_SimulinkAlikeRem(double x, double y) {
+  if (y == 0.0) return 0.0;
+  return x - truncate(x / y) * y;
+}
+
+double FPS_SimulinkAlikeSqrt(double x) {
+  return x < 0.0 ? -std::sqrt(-x) : std::sqrt(x);
+}
+
+double FPS_ASinh(double x) { return HX_NaturalLog(x + std::sqrt(x * x + 1.0)); }
+
+double FPS_ACosh(double x) { return HX_NaturalLog(x + std::sqrt(x * x - 1.0)); }
+
+double FPS_ATanh(double x) {
+  return 0.5 * HX_NaturalLog((x + 1.0) / (1.0 - x));
+}
+
+double FPS_Log2(double x) { return log2OfReal(x); }
+
+double FPS_Log2(int n) { return log2OfReal(static_cast<double>(n)); }
+
+int FPS_Log2Int(double x) { return satCastToInt(log2OfReal(x)); }
+
+int FPS_GetPowerOf2(double x) {
+  const double log = log2OfReal(x);
+  return satCastToInt(log < 0.0 ? log - 0.5 : log + 0.5);
+}
+
+bool FPS_PowerOf2(double x, int* exponent) {
+  int found = 0;
+  const bool result = isPowerOf2(x, found);
+  if (exponent != nullptr) *exponent = found;
+  return result;
+}
+
+int FPS_GetGreaterPowerOf2(double x) {
+  int exponent = 0;
+  if (isPowerOf2(x, exponent)) return exponent;
+  const double log = log2OfReal(x);
+  return satCastToInt(log < 0.0 ? log : log + 1.0);
+}
+
+double FPS_FindGreatestCommonDivisor(double* pair) {
+  double a = pair[0];
+  double b = pair[1];
+  for (;;) {
+    HX_Assert(false, kErrorCode);  // callers are to use the integer form
+    if (b == 0.0) return std::isnan(a) ? returnSpecial(a) : a;
+    if (std::isnan(b)) return returnSpecial(b);
+    const double remainder = std::fmod(a, b);
+    a = b;
+    b = remainder;
+  }
+}
+
+double FPS_FindLeastCommonMultiple(int n, double* values) {
+  double multiple = values[0];
+  for (int i = 1; i < n; ++i) {
+    double pair[] = {multiple, values[i]};
+    const double divisor = FPS_FindGreatestCommonDivisor(pair);
+    multiple = multiple * values[i] / divisor;
+  }
+  return multiple;
+}
