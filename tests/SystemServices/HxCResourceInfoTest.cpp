@@ -1,0 +1,163 @@
+#include "SystemServices/ResourceInfo/HxCResourceInfo.h"
+
+#include "Trace/HxCTraceFallThrough.h"
+#include "platform/os/HX_VersionResource.h"
+#include "support/HX_TestFixture.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::MatchesRegex;
+
+constexpr char kPath[] = "/opt/hx/hx_codegen";
+
+class ResourceInfoTest : public HX_TestFixture {
+ protected:
+  ResourceInfoTest() { HxCTraceFallThrough::setVerbose(true); }
+  ~ResourceInfoTest() override {
+    HxCTraceFallThrough::setVerbose(false);
+    HX_UnloadModule("hx_codegen");
+  }
+
+  static HX_VersionResource resource() {
+    HX_VersionResource r;
+    r.setVersions({2, 3, 0, 0}, {0xFFFF, 0, 7, 8});
+    r.addTranslation(0x0407, 0x04E4);
+    r.addTranslation(0x0409, 0x04B0);
+    for (const char* name : {"CompanyName", "LegalCopyright", "ProductName"}) {
+      r.setText(0x0407, 0x04E4, name, std::string("de ") + name);
+      r.setText(0x0409, 0x04B0, name, std::string("en ") + name);
+    }
+    return r;
+  }
+  static void load(const HX_VersionResource& r) {
+    HX_LoadModule("hx_codegen", kPath, r.block());
+  }
+};
+
+TEST_F(ResourceInfoTest, ReadsNumbersAndTextsOfTheFirstTranslationOnce) {
+  load(resource());
+  HxCResourceInfo info;
+  EXPECT_EQ(info.getProdMajor(), -1);
+  EXPECT_EQ(info.getFileMaintenance(), -1);
+  EXPECT_EQ(info.getModuleName(), nullptr);
+  EXPECT_TRUE(info.retrieveResourceInfo());
+  const int numbers[] = {info.getProdMajor(), info.getProdMinor(),
+                         info.getProdSub(),   info.getProdMaintenance(),
+                         info.getFileMajor(), info.getFileMinor(),
+                         info.getFileSub(),   info.getFileMaintenance()};
+  EXPECT_THAT(numbers, ElementsAre(2, 3, 0, 0, 0xFFFF, 0, 7, 8));
+  EXPECT_EQ(*info.getFileVersion(), "65535.0.7.8");
+  EXPECT_EQ(*info.getModuleName(), kPath);
+  EXPECT_EQ(*info.getLegalCopyright(), "de LegalCopyright");
+  EXPECT_EQ(*info.getCompanyName(), "de CompanyName");
+  EXPECT_EQ(*info.getProductName(), "de ProductName");
+
+  HX_UnloadModule("hx_codegen");
+  const HxCResourceInfo copy(info);
+  EXPECT_TRUE(info.retrieveResourceInfo());
+  EXPECT_EQ(copy.getProductName(), info.getProductName());
+  EXPECT_THAT(messages(), IsEmpty());
+}
+
+TEST_F(ResourceInfoTest, ProductVersionLosesItsTrailingZeros) {
+  const struct {
+    HX_VersionResource::Version version;
+    const char* text;
+  } cases[] = {{{6, 1, 0, 0}, "6.1"},     {{2, 2, 1, 0}, "2.2.1"},
+               {{2, 2, 1, 3}, "2.2.1.3"}, {{2, 2, 0, 4}, "2.2.0.4"},
+               {{0, 0, 0, 0}, "0.0"},     {{0, 0, 0, 1}, "0.0.0.1"}};
+  for (const auto& c : cases) {
+    HX_VersionResource r;
+    r.setVersions(c.version, c.version);
+    load(r);
+    HxCResourceInfo info;
+    EXPECT_TRUE(info.retrieveResourceInfo());
+    EXPECT_EQ(*info.getProductVersion(), c.text);
+    EXPECT_EQ(*info.getCompanyName(), "") << "no translation at all";
+  }
+}
+
+TEST_F(ResourceInfoTest, MissingTextsAreEmpty) {
+  HX_VersionResource partial;
+  partial.setVersions({1, 0, 0, 0}, {1, 0, 0, 0});
+  partial.addTranslation(0x0C0A, 0x04B0);
+  partial.setText(0x0C0A, 0x04B0, "legalCOPYRIGHT", "");
+  partial.setText(0x0C0A, 0x04B0, "ProductName", "\xA9 100%s");
+  partial.setText(0x0409, 0x04B0, "CompanyName", "another language");
+  load(partial);
+  HxCResourceInfo info;
+  EXPECT_TRUE(info.retrieveResourceInfo());
+  EXPECT_EQ(*info.getLegalCopyright(), "");
+  EXPECT_EQ(*info.getCompanyName(), "");
+  EXPECT_EQ(*info.getProductName(), "\xA9 100%s");
+}
+
+TEST_F(ResourceInfoTest, FailuresAreTracedWithTheirPlaceAndLeakNothing) {
+  const std::string whole = resource().block();
+  HX_VersionResource noRoot, tooLarge = resource();
+  noRoot.addTranslation(0x0409, 0x04B0);
+  tooLarge.setText(1, 1, "x", std::string(0x10000, 'x'));
+  HX_CountingController controller;
+  struct Case {
+    const char* why;
+    std::string block;
+  };
+  const Case cases[] = {{"no version information", ""},
+                        {"too large to be written", tooLarge.block()},
+                        {"cut off", whole.substr(0, whole.size() - 1)},
+                        {"no fixed information", noRoot.block()}};
+  std::vector<std::string> places;
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.why);
+    clearMessages();
+    HX_LoadModule("hx_codegen", kPath, c.block);
+    HxCResourceInfo info;
+    EXPECT_FALSE(info.retrieveResourceInfo());
+    ASSERT_THAT(
+        messages(),
+        ElementsAre(MatchesRegex(
+            "1274/6 trace fall through - early abortion. .Internal: Module: "
+            "'SystemServices/ResourceInfo/HxCResourceInfo.cpp', Line: .*")));
+    places.push_back(messages()[0]);
+    EXPECT_TRUE(info.retrieveResourceInfo()) << "not repeated";
+    EXPECT_EQ(*info.getModuleName(), kPath);
+    EXPECT_EQ(info.getProdMajor(), -1);
+    EXPECT_EQ(info.getProductVersion(), nullptr);
+    EXPECT_EQ(info.getCompanyName(), nullptr);
+    EXPECT_EQ(controller.liveBlocks(), 0);
+  }
+  EXPECT_EQ(places[0], places[1]);
+  EXPECT_NE(places[1], places[2]);
+  EXPECT_NE(places[2], places[3]);
+}
+
+TEST_F(ResourceInfoTest, WithoutTheModuleTheExecutableIsAsked) {
+  HxCResourceInfo info;
+  EXPECT_FALSE(info.retrieveResourceInfo());
+  EXPECT_THAT(info.getModuleName()->cstring(),
+              MatchesRegex("/.*/test_SystemServices"));
+  HX_LoadModule("hx_codegen", std::string(300, 'p'), "");
+  HxCResourceInfo longPath;
+  longPath.retrieveResourceInfo();
+  EXPECT_EQ(longPath.getModuleName()->length(), 259);
+}
+
+// Every block that differs from a real one in a single byte is read without
+// leaving it; the sanitizers watch.
+TEST_F(ResourceInfoTest, DamagedBlocksAreReadWithoutHarm) {
+  const std::string whole = resource().block();
+  for (std::size_t at = 0; at < whole.size(); ++at) {
+    for (const char value : {'\0', '\1', '\x7F', '\xFF'}) {
+      std::string damaged = whole;
+      damaged[at] = value;
+      HX_LoadModule("hx_codegen", kPath, damaged);
+      HxCResourceInfo info;
+      info.retrieveResourceInfo();
+      EXPECT_EQ(*info.getModuleName(), kPath);
+    }
+  }
+}
+
+}  // namespace
