@@ -1,12 +1,30 @@
 // Access to the simulation tool's data.
+//
+//   HX_SimulinkInterface::setTree(&tree);
+//   mxArray* path = mxCreateString("cruise/Gain 1");
+//   mxArray* handle = HX_SimulinkInterface::getMxSlData(path, "Handle");
 
 #ifndef PLATFORM_MATLAB_HX_SIMULINKINTERFACE_H
 #define PLATFORM_MATLAB_HX_SIMULINKINTERFACE_H
 
-class HX_SimulinkInterface {
+#include "platform/HX_PlatformExport.h"
+#include "platform/matlab/HX_MxArray.h"
+
+class HX_SimulinkTree;
+class KyCXString;
+
+class HX_PLATFORM_API HX_SimulinkInterface {
  public:
   /// A handle that no block has.
   static constexpr double s_invalidHandle = -1.0;
+
+  /// The value of a parameter of the block that \p object names, a handle or a
+  /// path. A new array, owned by the caller; null for a null or unknown object,
+  /// an unknown parameter, and while there is no model.
+  static mxArray* getMxSlData(mxArray* object, const KyCXString& parameter);
+
+  /// Makes \p tree, which is not owned, the open model; null for none.
+  static void setTree(const HX_SimulinkTree* tree);
 };
 
 #endif  // PLATFORM_MATLAB_HX_SIMULINKINTERFACE_H

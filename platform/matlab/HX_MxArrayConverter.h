@@ -1,0 +1,19 @@
+// Converts values of the MATLAB workspace to values of the generator.
+
+#ifndef PLATFORM_MATLAB_HX_MXARRAYCONVERTER_H
+#define PLATFORM_MATLAB_HX_MXARRAYCONVERTER_H
+
+#include "platform/HX_PlatformExport.h"
+#include "platform/matlab/HX_MxArray.h"
+
+class KyCXString;
+
+/// Holds no data. An array of another kind, and null, cannot be converted: the
+/// result is false and the value is not written.
+class HX_PLATFORM_API HX_MxArrayConverter {
+ public:
+  bool mxArrayToString(const mxArray* array, KyCXString& text) const;
+  bool mxArrayToDouble(const mxArray* array, double& value) const;
+};
+
+#endif  // PLATFORM_MATLAB_HX_MXARRAYCONVERTER_H

@@ -1,0 +1,26 @@
+// Names a block that the model reader has read.
+//
+//   HX_BlockDataBase blocks;
+//   blocks.setSlBlockHandle(7, handle);
+//   const HX_InputBlockId id(blocks, 7);
+
+#ifndef PLATFORM_MODEL_HX_INPUTBLOCKID_H
+#define PLATFORM_MODEL_HX_INPUTBLOCKID_H
+
+class HX_BlockDataBase;
+
+/// The data base is not owned and outlives the identifier.
+class HX_InputBlockId {
+ public:
+  HX_InputBlockId(HX_BlockDataBase& blocks, int blockId)
+      : m_pBlocks(&blocks), m_BlockId(blockId) {}
+
+  int getBlockId() const { return m_BlockId; }
+  HX_BlockDataBase& getBlockDataBase() const { return *m_pBlocks; }
+
+ private:
+  HX_BlockDataBase* m_pBlocks;
+  int m_BlockId;
+};
+
+#endif  // PLATFORM_MODEL_HX_INPUTBLOCKID_H
