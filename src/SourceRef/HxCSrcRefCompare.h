@@ -1,0 +1,38 @@
+// How two source references relate: do they stem from the data dictionary, and
+// did a user script make the objects?
+//
+//   int which = 0;
+//   if (HxCSrcRefCompare().onlyOneFromDD(a, b, which)) use(which == 0 ? a : b);
+
+#ifndef SOURCEREF_HXCSRCREFCOMPARE_H
+#define SOURCEREF_HXCSRCREFCOMPARE_H
+
+#include "HX_Export.h"
+
+class HxCSrcRef;
+
+/// Holds no data. Every reference may be null, which stems from nowhere. An
+/// object of the data dictionary counts as made by a user script if its path
+/// contains "CGTmpData", in this case of letters.
+class HX_UTILS_API HxCSrcRefCompare {
+ public:
+  /// Both stem from the data dictionary.
+  bool bothFromDD(const HxCSrcRef* a, const HxCSrcRef* b) const;
+
+  /// Both stem from the data dictionary, from objects with different handles.
+  bool bothFromDDButDifferent(const HxCSrcRef* a, const HxCSrcRef* b) const;
+
+  /// Exactly one stems from the data dictionary.
+  /// \param[out] which  0 for \p a, 1 for \p b, -1 for neither; not written
+  ///   if both do
+  bool onlyOneFromDD(const HxCSrcRef* a, const HxCSrcRef* b, int& which) const;
+
+  /// Both stem from the data dictionary, from objects of user scripts.
+  bool bothFromUserScript(const HxCSrcRef* a, const HxCSrcRef* b) const;
+
+  /// bothFromDDButDifferent(), and neither object is from a user script.
+  bool differentDdSrcRefNotFromUserScript(const HxCSrcRef* a,
+                                          const HxCSrcRef* b) const;
+};
+
+#endif  // SOURCEREF_HXCSRCREFCOMPARE_H

@@ -1,0 +1,259 @@
+#include "SourceRef/HxCSrcRefSet.h"
+
+#include <algorithm>
+#include <array>
+#include <cstdlib>
+#include <memory>
+#include <new>
+#include <random>
+
+#include "SourceRef/HxCDdSrcRef.h"
+#include "SourceRef/HxCInputBlockSrcRef.h"
+#include "SourceRef/HxCInternalSrcRef.h"
+#include "SourceRef/HxCSrcRefCompare.h"
+#include "SourceRef/HxCSrcRefServer.h"
+#include "platform/datadictionary/HX_DdTree.h"
+#include "platform/model/HX_Block.h"
+#include "platform/model/HX_BlockDataBase.h"
+#include "platform/model/HX_InputBlockId.h"
+#include "support/HX_TestFixture.h"
+
+namespace {
+
+int s_heapBlocks = 0;  // asked for by new in the whole program
+
+}  // namespace
+
+[[gnu::noinline]] void* operator new(std::size_t size) {
+  ++s_heapBlocks;
+  if (void* block = std::malloc(size)) return block;
+  throw std::bad_alloc();
+}
+[[gnu::noinline]] void operator delete(void* block) noexcept {
+  std::free(block);
+}
+[[gnu::noinline]] void operator delete(void* block, std::size_t) noexcept {
+  std::free(block);
+}
+
+namespace {
+
+using SrcRefs = std::vector<const HxCSrcRef*>;
+using IteratorPtr = std::unique_ptr<HX_Iterator<const HxCSrcRef*>>;
+
+void expectThrowsMinusOne(const HX_Iterator<const HxCSrcRef*>& it) {
+  try {
+    it.currentItem();
+    ADD_FAILURE() << "nothing thrown";
+  } catch (int thrown) {
+    EXPECT_EQ(thrown, -1);
+  }
+}
+
+// Compares all that a set tells with the plain form.
+void expectHolds(const HxCSrcRefSet& set, const SrcRefs& expected) {
+  ASSERT_EQ(set.getSrcRefCnt(), static_cast<int>(expected.size()));
+  EXPECT_EQ(set.getASrcRef(), expected.empty() ? nullptr : expected.front());
+  SrcRefs visited;
+  set.forEach([&](const HxCSrcRef* ref) { visited.push_back(ref); });
+  EXPECT_EQ(visited, expected);
+  const IteratorPtr it(set.createIterator());
+  for (int pass = 0; pass < 2; ++pass) {
+    SrcRefs walked;
+    for (; !it->isDone(); it->next()) walked.push_back(it->currentItem());
+    EXPECT_EQ(walked, expected);
+    it->next();
+    EXPECT_TRUE(it->isDone());
+    expectThrowsMinusOne(*it);
+    it->first();
+  }
+}
+
+void addPlain(SrcRefs& plain, const HxCSrcRef* ref) {
+  if (ref != nullptr && std::count(plain.begin(), plain.end(), ref) == 0)
+    plain.push_back(ref);
+}
+
+class SrcRefSetTest : public HX_TestFixture {
+ protected:
+  ~SrcRefSetTest() override { HX_DdTree::instance().clear(); }
+};
+
+TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
+  const unsigned seed = std::random_device()();
+  SCOPED_TRACE(seed);
+  std::mt19937 random(seed);
+  const std::array<HxCSrcRef, 5> refs;
+  std::array<HxCSrcRefSet, 3> sets;
+  std::array<SrcRefs, 3> plains;
+  for (int step = 0; step < 2'000; ++step) {
+    const std::size_t to = random() % sets.size();
+    const std::size_t from = random() % sets.size();
+    const std::size_t ref = random() % (refs.size() + 1);
+    const HxCSrcRef* srcRef = ref < refs.size() ? &refs[ref] : nullptr;
+    switch (random() % 8) {
+      case 0:
+        sets[to].clear();
+        plains[to].clear();
+        break;
+      case 1:
+        sets[to] = sets[from];
+        plains[to] = plains[from];
+        break;
+      case 2:
+        sets[to] = srcRef;
+        plains[to].clear();
+        addPlain(plains[to], srcRef);
+        break;
+      case 3:
+        expectHolds(HxCSrcRefSet(sets[from]), plains[from]);
+        break;
+      case 4: {
+        sets[to].addSrcRef(sets[from]);
+        const SrcRefs added = plains[from];
+        for (const HxCSrcRef* r : added) addPlain(plains[to], r);
+        break;
+      }
+      default:
+        sets[to].addSrcRef(srcRef);
+        addPlain(plains[to], srcRef);
+    }
+    expectHolds(sets[to], plains[to]);
+    ASSERT_FALSE(HasFailure()) << "step " << step;
+  }
+}
+
+TEST_F(SrcRefSetTest, OneReferenceNeedsNoMemoryTheSecondDoes) {
+  const HxCSrcRef a;
+  const HxCSrcRef b;
+  HX_CountingController controller;
+  const int before = s_heapBlocks;
+  HxCSrcRefSet set;
+  set.addSrcRef(nullptr);
+  set.addSrcRef(&a);
+  set.addSrcRef(&a);
+  set.addSrcRef(nullptr);
+  HxCSrcRefSet copy(set);
+  copy.addSrcRef(set);
+  copy = set;
+  copy = HxCSrcRefSet();
+  copy.addSrcRef(set);
+  int visits = 0;
+  copy.forEach([&](const HxCSrcRef*) { ++visits; });
+  EXPECT_EQ(visits, 1);
+  EXPECT_EQ(s_heapBlocks, before);
+  EXPECT_EQ(controller.allocated(), 0);
+  copy.addSrcRef(&b);
+  EXPECT_GT(s_heapBlocks, before);
+  delete copy.createIterator();
+  EXPECT_EQ(controller.allocated(), 1);  // an iterator is the library's own
+  EXPECT_EQ(controller.liveBlocks(), 0);
+  controller.fail();
+  EXPECT_EQ(copy.createIterator(), nullptr);
+}
+
+TEST_F(SrcRefSetTest, ServerOwnsEachReferenceItHandsOut) {
+  HX_CountingController controller;
+  {
+    HxCSrcRefServer server;
+    EXPECT_TRUE(server.boot());
+    for (int count = 0; count < 3; ++count) {
+      HxCInternalSrcRef* ref = server.getSrcRef();
+      KyCXString text;
+      ref->toString(text);
+      EXPECT_STREQ(text.cstring(),
+                   "Internal: Module: 'file unknown!', Line: -1 Reason: cause "
+                   "unknown!");
+      ref->setLocation("a file name that needs memory of its own.cpp", 1);
+    }
+    EXPECT_TRUE(server.shutdown());
+    EXPECT_EQ(controller.liveBlocks(), 3);
+  }
+  EXPECT_EQ(controller.liveBlocks(), 0);
+  controller.fail();
+  HxCSrcRefServer server;
+  EXPECT_EQ(server.getSrcRef(), nullptr);
+}
+
+TEST_F(SrcRefSetTest, ServerSortsTheReferencesOfASet) {
+  const HX_Block block("b");
+  const HxCSrcRef* const b = block.getSrcRef();
+  HX_BlockDataBase blocks;
+  const HX_InputBlockId id(blocks, 1);
+  const HxCInputBlockSrcRef input(id);
+  const HxCDdSrcRef dd1(1);
+  const HxCDdSrcRef dd2(2);
+  const HxCInternalSrcRef internal;
+  const HxCSrcRef plain;
+  const struct {
+    SrcRefs refs;
+    std::array<const HxCSrcRef*, 3> found;  // block, dd, other
+  } rows[] = {
+      {{}, {nullptr, nullptr, nullptr}},
+      {{b}, {b, nullptr, nullptr}},
+      {{b, &dd1, &internal}, {b, &dd1, &internal}},
+      {{&dd1, &dd2, &internal, &plain}, {nullptr, &dd2, &plain}},
+      {{b, &input}, {&input, nullptr, nullptr}},
+      {{&input, &dd2, b, &dd1}, {b, &dd1, nullptr}},
+  };
+  for (const auto& row : rows) {
+    HxCSrcRefSet set;
+    for (const HxCSrcRef* ref : row.refs) set.addSrcRef(ref);
+    const HxCSrcRefSet* const given = row.refs.empty() ? nullptr : &set;
+    for (unsigned wanted = 0; wanted < 8; ++wanted) {
+      std::array<const HxCSrcRef*, 3> found{&plain, &plain, &plain};
+      std::array<const HxCSrcRef*, 3> expected = found;
+      const HxCSrcRef** places[3] = {};
+      for (unsigned i = 0; i < 3; ++i) {
+        if ((wanted >> i & 1) == 0) continue;
+        places[i] = &found[i];
+        expected[i] = row.found[i];
+      }
+      EXPECT_EQ(HxCSrcRefServer::getSpecificSrcRefFromSet(given, places[0],
+                                                          places[1], places[2]),
+                0);
+      EXPECT_EQ(found, expected);
+    }
+  }
+}
+
+// The references of the comparison table, by letter.
+TEST_F(SrcRefSetTest, ComparisonsOfAllPairs) {
+  HX_DdTree& tree = HX_DdTree::instance();
+  const HxCDdSrcRef x(tree.add("//DD0/Pool/CGTmpData/x"));
+  const HxCDdSrcRef y(tree.add("//DD0/Pool/CGTmpData/y"));
+  const HxCDdSrcRef v(tree.add("//DD0/Pool/cgtmpdata/v"));
+  const HxCDdSrcRef w(tree.add("//DD0/Pool/w"));
+  const HxCDdSrcRef sameAsW(w.getDdHandle());
+  const HxCSrcRef plain;
+  const struct {
+    const HxCSrcRef* a;
+    const HxCSrcRef* b;
+    const char* holds;  // d both, D different, u user script, n not from one
+    int which;          // 7: not written
+  } rows[] = {
+      {&x, &y, "dDu", 7},        {&x, &x, "du", 7},
+      {&x, &w, "dD", 7},         {&w, &x, "dD", 7},
+      {&v, &w, "dDn", 7},        {&w, &sameAsW, "d", 7},
+      {&w, nullptr, "", 0},      {nullptr, &w, "", 1},
+      {&x, &plain, "", 0},       {&plain, &x, "", 1},
+      {&plain, &plain, "", -1},  {nullptr, nullptr, "", -1},
+      {nullptr, &plain, "", -1},
+  };
+  const HxCSrcRefCompare compare;
+  for (const auto& row : rows) {
+    SCOPED_TRACE(&row - rows);
+    std::string holds;
+    if (compare.bothFromDD(row.a, row.b)) holds += 'd';
+    if (compare.bothFromDDButDifferent(row.a, row.b)) holds += 'D';
+    if (compare.bothFromUserScript(row.a, row.b)) holds += 'u';
+    if (compare.differentDdSrcRefNotFromUserScript(row.a, row.b)) holds += 'n';
+    EXPECT_EQ(holds, row.holds);
+    int which = 7;
+    EXPECT_EQ(compare.onlyOneFromDD(row.a, row.b, which),
+              row.which == 0 || row.which == 1);
+    EXPECT_EQ(which, row.which);
+  }
+}
+
+}  // namespace
