@@ -68,6 +68,11 @@ class HX_Block {
       m_pSrcRef.reset(new HxCBlockSrcRef(const_cast<HX_Block*>(this)));
     return m_pSrcRef.get();
   }
+  /// A second reference to the block of \p srcRef, with a number of its own;
+  /// owned by the caller. Null if there is no memory.
+  static HxCBlockSrcRef* dupSrcRef(const HxCBlockSrcRef& srcRef) {
+    return new HxCBlockSrcRef(srcRef);
+  }
 
   /// A block inside a masked library block may be named through its parent.
   void setNamedThroughParent(bool named) { m_NamedThroughParent = named; }

@@ -11,10 +11,12 @@ const HxCStateflowSrcRef* HxCStateflowSrcRef::isStateflow() const {
 }
 
 void HxCStateflowSrcRef::toString(KyCXString& text) const {
-  text = m_pObject->getSFName();
+  text = m_pObject != nullptr ? m_pObject->getSFName() : KyCXString();
 }
 
-int HxCStateflowSrcRef::getSfObjectId() const { return m_pObject->getId(); }
+int HxCStateflowSrcRef::getSfObjectId() const {
+  return m_pObject != nullptr ? m_pObject->getId() : -1;
+}
 
 HxCSrcRef* HxCStateflowSrcRef::clone() const {
   return new HxCStateflowSrcRef(m_pObject);

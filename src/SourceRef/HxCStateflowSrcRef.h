@@ -11,16 +11,17 @@ class SC_Model;
 /// keep the number, clones take a new one.
 class HX_UTILS_API HxCStateflowSrcRef : public HxCSrcRef {
  public:
-  /// No object: only assignment and the kind queries may be used.
+  /// No object.
   HxCStateflowSrcRef() = default;
   HxCStateflowSrcRef(const HxCStateflowSrcRef&) = default;
   HxCStateflowSrcRef& operator=(const HxCStateflowSrcRef&) = default;
   ~HxCStateflowSrcRef() override;
 
   const HxCStateflowSrcRef* isStateflow() const override;
-  /// The object's name with its path in the chart.
+  /// The object's name with its path in the chart; empty without an object.
   void toString(KyCXString& text) const override;
 
+  /// The object's number in the model; -1 without an object.
   virtual int getSfObjectId() const;
   SC_Model* getSfObject() const { return m_pObject; }
 
