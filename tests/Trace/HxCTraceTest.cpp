@@ -37,38 +37,35 @@ class TraceTest : public HX_TestFixture {
 };
 
 using Tracer = HxCTraceFallThrough;
-using Throw = bool (Tracer::*)() const;
-using ThrowAt = bool (Tracer::*)(const KyCXString&, int) const;
-using ThrowFor = bool (Tracer::*)(const KyCXString&, int,
-                                  const KyCXString&) const;
-
+// Calls the three overloads of each level; true if one did not return false.
 struct LevelRow {
   const char* head;  // row/severity of the message
-  Throw plain;
-  ThrowAt at;
-  ThrowFor because;
   bool isDeadly;
+  bool (*throwAll)(const Tracer&);
 };
 
 const LevelRow kLevels[] = {
-    {"1272/4", &Tracer::throwNote, &Tracer::throwNote, &Tracer::throwNote,
-     false},
-    {"1273/5", &Tracer::throwWarning, &Tracer::throwWarning,
-     &Tracer::throwWarning, false},
-    {"1274/6", &Tracer::throwError, &Tracer::throwError, &Tracer::throwError,
-     false},
-    {"1275/7", &Tracer::throwDeadly, &Tracer::throwDeadly, &Tracer::throwDeadly,
-     true},
+    {"1272/4", false,
+     [](const Tracer& t) {
+       return t.throwNote() || t.throwNote("x.cpp", 12) ||
+              t.throwNote("x.cpp", 12, "bad index");
+     }},
+    {"1273/5", false,
+     [](const Tracer& t) {
+       return t.throwWarning() || t.throwWarning("x.cpp", 12) ||
+              t.throwWarning("x.cpp", 12, "bad index");
+     }},
+    {"1274/6", false,
+     [](const Tracer& t) {
+       return t.throwError() || t.throwError("x.cpp", 12) ||
+              t.throwError("x.cpp", 12, "bad index");
+     }},
+    {"1275/7", true,
+     [](const Tracer& t) {
+       return t.throwDeadly() || t.throwDeadly("x.cpp", 12) ||
+              t.throwDeadly("x.cpp", 12, "bad index");
+     }},
 };
-
-// Calls the three overloads; true if one of them did not return false.
-bool throwAll(const LevelRow& level) {
-  Tracer t;
-  const bool plain = (t.*level.plain)();
-  const bool at = (t.*level.at)("x.cpp", 12);
-  const bool because = (t.*level.because)("x.cpp", 12, "bad index");
-  return plain || at || because;
-}
 
 TEST_F(TraceTest, VerboseLevelsReportPlaceAndFailADebugCheck) {
   const auto& reports = recordDebugReports();
@@ -76,7 +73,7 @@ TEST_F(TraceTest, VerboseLevelsReportPlaceAndFailADebugCheck) {
   for (const LevelRow& level : kLevels) {
     SCOPED_TRACE(level.head);
     clearMessages();
-    EXPECT_FALSE(throwAll(level));
+    EXPECT_FALSE(level.throwAll(Tracer()));
     const std::string head =
         std::string(level.head) +
         " trace fall through - early abortion. [Internal: Module: '";
@@ -95,7 +92,7 @@ TEST_F(TraceTest, OnlyDeadlyFallThroughsSpeakWhileNotVerbose) {
     SCOPED_TRACE(level.head);
     clearMessages();
     const HxCSrcRef before;
-    EXPECT_FALSE(throwAll(level));
+    EXPECT_FALSE(level.throwAll(Tracer()));
     EXPECT_EQ(HxCSrcRef().getSrcRefId(), before.getSrcRefId() + 1);
     const std::size_t expected = level.isDeadly ? 3 : 0;
     EXPECT_EQ(messages().size(), expected);
