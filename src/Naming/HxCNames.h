@@ -220,7 +220,6 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   struct Context;
   struct Scan;
   struct MacroRow;
-  struct TimeBase;
 
   static constexpr HxCCIdentifier::HxENameTypeTag kActive =
       HxCCIdentifier::eActiveName;
@@ -230,20 +229,21 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
                                 unsigned int retainedMacros,
                                 unsigned int provisionalMacros,
                                 bool suppressMessages);
-  Context deriveContext(HxCCIdentifier& id);
+  void deriveContext(HxCCIdentifier& id, Context& context);
   static void enterBlock(Context& context);
   static void enterStateflowObject(Context& context);
   static KyCXString templateOf(const HxCCIdentifier& id, const Context& context,
                                bool suppressMessages);
   void scanTemplate(Scan& scan);
   static const MacroRow* findMacro(unsigned short letter);
-  void expandDollarD(Scan& scan);
+  int expandDollarD(Scan& scan);
   static void keepForeignMacro(Scan& scan, unsigned short letter);
   bool substAllDollarZByValue(HxCCIdentifier& id, const KyCXString& macro,
                               const HxCCIdentifier& value,
                               tagMacroKindEnum kind,
                               HxCCIdentifier::HxENameTypeTag type);
   static int findDollarELength(const KyCXString& text, int start);
+  static int endOfForeignMacro(const KyCXString& text, int dollar);
   void getRootDollarI(KyCXString& systemId);
 
   // Evaluators: each appends its macro's value, its text if it is retained, or
@@ -294,6 +294,7 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   void evaluateBaseTypeMacro(KyCXString& result, unsigned int retainedMacros,
                              unsigned int provisionalMacros, HX_DataType* type);
   static KyCXString getTypeNameInCode(HX_DataType* type);
+  static KyCXString baseTypeName(HX_DataType* scalar);
   int evaluateExtendedNameMacro(KyCXString& result, unsigned int retainedMacros,
                                 unsigned int provisionalMacros,
                                 KyCXString& form, int pos, HxCCIdentifier& id,

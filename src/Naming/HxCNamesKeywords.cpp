@@ -1,5 +1,9 @@
 // Keyword dictionary, validity of names, and suffixes that make them distinct.
 
+#include <algorithm>
+#include <cstdint>
+#include <iterator>
+
 #include "Control/ERR_Messages.h"
 #include "Control/HX_SelfCheck.h"
 #include "Naming/HxCNames.h"
@@ -23,6 +27,23 @@ static_assert(sizeof kCKeywords / sizeof *kCKeywords == 32);
 
 constexpr int kLetters = 26;
 
+// For each first character the lengths of the dictionary's words, one bit per
+// length (the last one stands for all longer words): nearly every name that is
+// no word is turned away here.
+std::uint64_t s_wordLengths[256];
+
+std::uint64_t lengthBit(const KyCXString& text) {
+  return std::uint64_t{1} << std::min(text.length(), 63);
+}
+
+bool mayBeWord(const KyCXString& text) {
+  return (s_wordLengths[text[0] & 0xFF] & lengthBit(text)) != 0;
+}
+
+void noteWord(const KyCXString& text) {
+  s_wordLengths[text[0] & 0xFF] |= lengthBit(text);
+}
+
 // The letters of a bijective base-26 numeral, least significant first.
 KyCXString letterCode(int index) {
   KyCXString code;
@@ -43,25 +64,30 @@ void HxCNames::boot() {
   shutdown();
   s_pKeywordDict =
       new leda::dictionary<KyCXString, tagHxEDictEntryType, leda::ab_tree>;
-  for (const char* keyword : kCKeywords)
+  for (const char* keyword : kCKeywords) {
     s_pKeywordDict->insert(keyword, eDictCKeyword);
+    noteWord(keyword);
+  }
 }
 
 void HxCNames::shutdown() {
   delete s_pKeywordDict;
   s_pKeywordDict = nullptr;
+  std::fill(std::begin(s_wordLengths), std::end(s_wordLengths), 0);
 }
 
 void HxCNames::addToKeywordDict(const KyCXString& word,
                                 tagHxEDictEntryType type) {
   if (!HX_Assert(s_pKeywordDict != nullptr, kErrorCode)) return;
   s_pKeywordDict->insert(word, type);
+  noteWord(word);
 }
 
 bool HxCNames::isStringValidCVariableName(const KyCXString& name) {
   if (name.isEmpty()) return false;
   if (!HX_Assert(s_pKeywordDict != nullptr, kErrorCode))
     return name.isValidCIdentifier();
+  if (!mayBeWord(name)) return name.isValidCIdentifier();
   const auto entry = s_pKeywordDict->lookup(name);
   if (!entry) return name.isValidCIdentifier();
   switch (s_pKeywordDict->inf(entry)) {
