@@ -1,0 +1,210 @@
+#include <cmath>
+#include <random>
+
+#include "Math/FPS_FloatingPointSupport.h"
+#include "Naming/HX_NamingFixture.h"
+
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+class MultirateTest : public HX_NamingFixture {
+ protected:
+  std::string time(const std::string& form, double period, double offset,
+                   bool cyclic = true) {
+    HxCCIdentifier id((form + ":" + form).c_str());
+    id.setSourceRef(gain.getSrcRef());
+    names.replaceMultirateTimeName(id, period, offset, cyclic);
+    names.createNameFromForm(id, nullptr, 0, 0, true);
+    return formal(id);
+  }
+};
+
+struct TimeCase {
+  const char* form;
+  double period;
+  double offset;
+  const char* result;
+};
+
+const TimeCase kExactTimes[] = {
+    {"$(Time1ms)", 0.01, 0, "10"},
+    {"$(Time10ms)", 0.01, 0, "1"},
+    {"$(Period1us)", 0.01, 0, "10000"},
+    {"$(Offset1ms)", 0.01, 0, "0"},
+    {"$(Time1ms)", 0.01, 0.005, "10_5"},
+    {"$(Time)", 0.01, 0.005, "10ms_5ms"},
+    {"$(Period)$(Offset)", 0.01, -0.005, "10ms5ms"},
+    {"$(Time)", 120, 0, "2m"},
+    {"$(Time)", 90, 0, "90s"},
+    {"$(Time)", 1.5, 0, "1500ms"},
+    {"$(Time)", 0, 0, "0us"},
+    {"$(Time)", 172800, 0, "2d"},
+    {"$(Time)", 86400 + 3600, 0, "25h"},
+    {"$(Time)", 1e-6, 0, "1us"},
+    {"$(Time1d)", 86400, 0, "1"},
+    {"$(time1ms)", 0.01, 0, "__time1ms_"},
+};
+
+TEST_F(MultirateTest, ExactTimesGiveNoMessage) {
+  for (const TimeCase& row : kExactTimes) {
+    EXPECT_EQ(time(row.form, row.period, row.offset), row.result) << row.form;
+    EXPECT_THAT(messages(), IsEmpty()) << row.form;
+  }
+}
+
+TEST_F(MultirateTest, ImpreciseTimesAreReportedWhereTheyAreUsed) {
+  EXPECT_EQ(time("$(Time100ms)", 0.01, 0), "0");
+  EXPECT_EQ(time("$(Period10ms)_$(Offset10ms)", 0.01, 0.005), "1_1");
+  EXPECT_EQ(time("$(Time10ms)", 0.01, -0.005), "1_1");
+  const std::string tail =
+      " is used. The period time 0.010000 or offset 0.00%000 cannot be "
+      "represented precisely with this time base. [car/Ctrl/Speed Gain]";
+  const auto message = [&](const char* kind, const char* base, char offset) {
+    std::string text = tail;
+    text[text.find('%')] = offset;
+    return std::string("1206/1 A time name macro '") + kind +
+           "' with the time base " + base + text;
+  };
+  EXPECT_THAT(messages(), ElementsAre(message("Time", "100ms", '0'),
+                                      message("Offset", "10ms", '5'),
+                                      message("Time", "10ms", '5')));
+  clearMessages();
+  EXPECT_EQ(time("$(Time)", 0.0000005, 0), "1us");
+  EXPECT_EQ(time("$(Offset)", 0.0000005, 0), "0us");
+  EXPECT_EQ(time("$(Offset)x$(Time)", 1, 0.0000025), "3usx1s_3us");
+  EXPECT_THAT(
+      messages(),
+      ElementsAre("1207/1 The period 0.0000005000 cannot be represented "
+                  "precisely with the $(Time) name macro. "
+                  "[car/Ctrl/Speed Gain]",
+                  "1207/1 The offset 0.0000025000 cannot be represented "
+                  "precisely with the $(Time) name macro. "
+                  "[car/Ctrl/Speed Gain]"));
+}
+
+// Whole microseconds, exact as integers: the text times its unit must give the
+// value back, and the message must be there exactly when it does not.
+TEST_F(MultirateTest, TimesAgreeWithExactArithmetic) {
+  struct Unit {
+    const char* text;
+    std::int64_t microseconds;
+  };
+  const Unit bases[] = {
+      {"1us", 1},         {"10us", 10},       {"100us", 100},  {"1ms", 1000},
+      {"10ms", 10000},    {"100ms", 100000},  {"1s", 1000000}, {"1m", 60000000},
+      {"1h", 3600000000}, {"1d", 86400000000}};
+  const Unit units[] = {{"d", 86400000000}, {"h", 3600000000}, {"m", 60000000},
+                        {"s", 1000000},     {"ms", 1000},      {"us", 1}};
+  constexpr unsigned kSeed = 20;
+  SCOPED_TRACE(kSeed);
+  std::mt19937 random(kSeed);
+  for (int round = 0; round < 400; ++round) {
+    std::int64_t value = static_cast<std::int64_t>(random() % 2000);
+    for (const Unit& unit : bases)
+      if (random() % 3 == 0 && value < 1000000000 / unit.microseconds)
+        value *= unit.microseconds;
+    const double seconds = static_cast<double>(value) / 1e6;
+    SCOPED_TRACE(seconds);
+    for (const Unit& base : bases) {
+      clearMessages();
+      const std::string form = std::string("$(Period") + base.text + ")";
+      const std::int64_t count =
+          (value + base.microseconds / 2) / base.microseconds;
+      const bool isTie = value % base.microseconds * 2 == base.microseconds;
+      const std::string text = time(form, seconds, 0);
+      // The quotient of a tie may lie a rounding error below it.
+      const bool isBelowTie = isTie && text == std::to_string(count - 1);
+      ASSERT_EQ(text, std::to_string(isBelowTie ? count - 1 : count))
+          << base.text;
+      // Near zero the tolerance of the comparison is absolute: 2^-26 units.
+      const bool exact =
+          value % base.microseconds == 0 ||
+          static_cast<double>(value % base.microseconds) <
+              std::ldexp(static_cast<double>(base.microseconds), -26);
+      ASSERT_EQ(messages().empty(), exact) << base.text;
+    }
+    clearMessages();
+    const Unit* largest = units;
+    while (value % largest->microseconds != 0 ||
+           (value < largest->microseconds && largest->microseconds > 1))
+      ++largest;
+    ASSERT_EQ(time("$(Period)", seconds, 0),
+              std::to_string(value / largest->microseconds) + largest->text);
+    ASSERT_THAT(messages(), IsEmpty());
+  }
+}
+
+TEST_F(MultirateTest, CountsBeyondTheRangeAreSaturated) {
+  EXPECT_EQ(time("$(Period1us)", 1e6, 0), "2147483647");
+  EXPECT_EQ(time("$(Time)", 86400.0 * 1e10, 0), "2147483647d");
+}
+
+TEST_F(MultirateTest, NoncyclicTasksHaveNoTime) {
+  EXPECT_EQ(time("$(Period10ms)_$(Time)$(Offset1d)x$(Task)", 1, 0, false),
+            "ACYCLIC_ACYCLICACYCLICx__Task_");
+  EXPECT_THAT(messages(),
+              ElementsAre("1205/2 A time/period/offset name macro is used in a "
+                          "noncyclic task. Name template: "
+                          "$(Period10ms)_$(Time)$(Offset1d)x$(Task) "
+                          "[car/Ctrl/Speed Gain]"));
+  clearMessages();
+  time("$(Task)", 1, 0, false);
+  EXPECT_THAT(messages(), IsEmpty());
+}
+
+TEST_F(MultirateTest, TasksAndIsrsStandInForEachOther) {
+  const HxCCIdentifier task("fast task:fast task");
+  const HxCCIdentifier isr("irq-1:irq-1");
+  const auto replace = [&](const HxCCIdentifier& used, bool isTaskName) {
+    HxCCIdentifier id = identifier("$(Task)/$(ISR):x", gain.getSrcRef());
+    names.replaceMultirateTaskISRName(id, used, isr, isTaskName);
+    return formal(id);
+  };
+  EXPECT_EQ(replace(task, false), "fast_task/irq_1");
+  EXPECT_EQ(replace(HxCCIdentifier(), false), "irq_1/irq_1");
+  EXPECT_THAT(messages(), IsEmpty());
+  EXPECT_EQ(replace(task, true), "__Task_/irq_1");
+  EXPECT_THAT(messages(),
+              ElementsAre("1204/2 The $Task name macro is used in the task "
+                          "name template $(Task)/$(ISR). This is not allowed. "
+                          "[car/Ctrl/Speed Gain]"));
+}
+
+TEST_F(MultirateTest, ObjectsAreMadeCIdentifiers) {
+  const HxCCIdentifier value("a b:a b");
+  HxCCIdentifier id("$(PObj)$(Event)$(ISR)$(Msg)$(Ctr)$(MsgVar):x");
+  names.replaceMultirateObjName(id, value);
+  names.replaceMultirateEventName(id, value);
+  names.replaceMultirateISRName(id, value);
+  names.replaceMultirateMsgName(id, value);
+  names.replaceMultirateCtrName(id, value);
+  EXPECT_EQ(formal(id), "a_ba_ba_ba_ba_b$(MsgVar)");
+  const TimeCase rows[] = {{"abc", 0, 0, "1"},      {"msg#7;", 0, 0, "7"},
+                           {"a#b#12x", 0, 0, "12"}, {"a#", 0, 0, ""},
+                           {"#a b;", 0, 0, "a b"},  {"", 0, 0, "1"}};
+  for (const TimeCase& row : rows) {
+    HxCCIdentifier message("<$(MsgVar)>:x");
+    names.replaceMultirateMsgVarName(message, row.form);
+    EXPECT_EQ(formal(message), std::string("<") + row.result + ">");
+  }
+}
+
+TEST_F(MultirateTest, BaseTimeUnitChangesAtAThousandAndAMillion) {
+  const struct {
+    double value;
+    int base;
+    const char* unit;
+  } rows[] = {
+      {999, 1, "us"}, {1000, 4, "ms"}, {999999, 4, "ms"}, {1000000, 0, "?"}};
+  for (const auto& row : rows) {
+    auto base = static_cast<HxCNames::tagHxEOsekTimeBase>(0);
+    KyCXString unit("?");
+    HxCNamesTestAccess::osekBaseTime(row.value, base, unit);
+    EXPECT_EQ(base, row.base);
+    EXPECT_STREQ(unit.cstring(), row.unit);
+  }
+}
+
+}  // namespace
