@@ -63,7 +63,7 @@ KyCXString::KyCXString(char character) : KyCXString() {
 }
 
 KyCXString::KyCXString(const unsigned short* units, int length) : KyCXString() {
-  assignUnits(units, length);
+  assignUnits(units, std::max(length, 0));
 }
 
 KyCXString::KyCXString(int value, bool hexadecimal, bool shortest)
@@ -103,7 +103,11 @@ KyCXString::KyCXString(KyCXString&& other) noexcept : KyCXString() {
 
 KyCXString& KyCXString::operator=(const KyCXString& other) {
   if (this == &other) return *this;
-  if (other.m_Wide != nullptr)
+  // Copying the whole buffer beats asking for the length.
+  if (!ownsMemory() && !other.ownsMemory()) {
+    std::memcpy(m_Inline, other.m_Inline, sizeof m_Inline);
+    m_Length = other.m_Length;
+  } else if (other.m_Wide != nullptr)
     assignUnits(other.m_Wide, other.m_Length);
   else
     assignNarrow(other.m_Text, other.m_Length);
@@ -134,6 +138,7 @@ KyCXString& KyCXString::operator=(const char* text) {
 }
 
 KyCXString& KyCXString::operator+=(const KyCXString& text) {
+  if (m_Length == 0) return *this = text;
   if (m_Wide == nullptr && text.m_Wide == nullptr)
     appendNarrow(text.m_Text, text.m_Length);
   else
@@ -156,8 +161,9 @@ KyCXString& KyCXString::operator+=(char character) {
 
 KyCXString& KyCXString::appendSub(const KyCXString& text, int from, int to) {
   from = std::max(from, 0);
-  const int count = std::min(to, text.m_Length - 1) - from + 1;
-  if (count <= 0) return *this;
+  to = std::min(to, text.m_Length - 1);
+  if (to < from) return *this;
+  const int count = to - from + 1;
   if (m_Wide == nullptr && text.m_Wide == nullptr)
     appendNarrow(text.m_Text + from, count);
   else
@@ -193,7 +199,12 @@ int KyCXString::find(char character, int from) const {
 }
 
 bool KyCXString::startsWith(const KyCXString& text) const {
-  return text.m_Length <= m_Length && head(text.m_Length) == text;
+  if (text.m_Length > m_Length) return false;
+  if (m_Wide == nullptr)
+    return text.m_Wide == nullptr && narrow().starts_with(text.narrow());
+  for (int i = 0; i < text.m_Length; ++i)
+    if (m_Wide[i] != text[i]) return false;
+  return true;
 }
 
 KyCXString KyCXString::sub(int from, int to) const {
@@ -361,8 +372,12 @@ void KyCXString::makeRoom(int capacity) {
   if (capacity <= m_Capacity) return;
   capacity = std::max(capacity, m_Capacity + m_Capacity / 2);
   char* text = new char[sizeOf(capacity) + 1];
-  std::memcpy(text, m_Text, sizeOf(m_Length) + 1);
-  if (m_Text != m_Inline) delete[] m_Text;
+  if (m_Text == m_Inline) {
+    std::memcpy(text, m_Inline, sizeof m_Inline);
+  } else {
+    std::memcpy(text, m_Text, sizeOf(m_Length) + 1);
+    delete[] m_Text;
+  }
   m_Text = text;
   m_Capacity = capacity;
 }
@@ -391,12 +406,12 @@ void KyCXString::assignNarrow(const char* text, int length) {
 void KyCXString::assignUnits(const unsigned short* units, int length) {
   const bool wide = std::any_of(
       units, units + length, [](unsigned short unit) { return unit > 0xFF; });
+  makeRoom(length);
   unsigned short* kept = nullptr;
   if (wide) {
     kept = new unsigned short[sizeOf(length)];
     std::copy(units, units + length, kept);
   }
-  makeRoom(length);
   std::transform(units, units + length, m_Text, narrowed);
   setLength(length);
   delete[] std::exchange(m_Wide, kept);

@@ -38,7 +38,7 @@ class HX_PLATFORM_API KyCXString {
   KyCXString(const char* text);
   /// One character.
   explicit KyCXString(char character);
-  /// \p length units starting at \p units.
+  /// \p length units starting at \p units; none for a negative length.
   KyCXString(const unsigned short* units, int length);
   /// The digits of \p value: decimal, or hexadecimal in upper case (negative
   /// values then in two's complement). Unless \p shortest, zeros are put in
@@ -88,7 +88,9 @@ class HX_PLATFORM_API KyCXString {
   /// outside the text the part inside it, empty if there is none.
   KyCXString sub(int from, int to) const;
   /// The first \p count units; empty for a negative count.
-  KyCXString head(int count) const { return sub(0, count - 1); }
+  KyCXString head(int count) const {
+    return sub(0, count > 0 ? count - 1 : -1);
+  }
 
   /// The texts between the occurrences of \p separator, at least one: n
   /// separators give n + 1 parts, an empty text gives one empty part.

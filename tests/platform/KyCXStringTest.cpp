@@ -1,0 +1,290 @@
+#include "platform/strings/KyCXString.h"
+
+#include <climits>
+#include <random>
+
+#include "support/HX_TestFixture.h"
+
+namespace {
+
+using Units = std::u16string;
+
+// A random text of up to 60 units around the inline capacity, a third of them
+// with units above 255. Few different units make matches likely.
+Units randomUnits(std::mt19937& random) {
+  static const Units kAlphabet = u"ab_1 \tZ\u00E4<>\u20AC";
+  const std::size_t kinds = kAlphabet.size() - (random() % 3 == 0 ? 0 : 1);
+  Units units(random() % 4 == 0 ? random() % 60 : random() % 6, u'a');
+  for (char16_t& unit : units) unit = kAlphabet[random() % kinds];
+  return units;
+}
+
+KyCXString textOf(const Units& units) {
+  const std::vector<unsigned short> copy(units.begin(), units.end());
+  return KyCXString(copy.data(), static_cast<int>(copy.size()));
+}
+
+Units unitsOf(const KyCXString& text) {
+  Units units;
+  for (int i = 0; i < text.length(); ++i)
+    units += static_cast<char16_t>(text[i]);
+  return units;
+}
+
+Units plainSub(const Units& units, int from, int to) {
+  Units part;
+  for (int i = std::max(from, 0); i <= to && i < static_cast<int>(units.size());
+       ++i)
+    part += units[static_cast<std::size_t>(i)];
+  return part;
+}
+
+int plainFind(const Units& units, const Units& text, int from) {
+  const std::size_t at = units.find(text, static_cast<std::size_t>(from));
+  return at == Units::npos ? -1 : static_cast<int>(at);
+}
+
+Units plainReplace(Units units, const Units& what, const Units& by) {
+  for (std::size_t at = 0; !what.empty(); at += by.size()) {
+    at = units.find(what, at);
+    if (at == Units::npos) break;
+    units.replace(at, what.size(), by);
+  }
+  return units;
+}
+
+// Two texts and their plain models; each step changes or asks the first, with
+// the second or the first itself as argument.
+struct Walk {
+  std::mt19937 random;
+  KyCXString text[2];
+  Units plain[2];
+
+  explicit Walk(unsigned int seed) : random(seed) {}
+
+  void step() {
+    const std::size_t other = random() % 2;
+    const KyCXString& argument = text[other];
+    const Units argumentUnits = plain[other];
+    const int from = static_cast<int>(random() % 50) - 5;
+    const int to = static_cast<int>(random() % 50) - 5;
+    const Units old = plain[0];
+    switch (random() % 11) {
+      case 0:
+        text[0] = argument, plain[0] = argumentUnits;
+        break;
+      case 1:
+        if (old.size() < 500) text[0] += argument, plain[0] += argumentUnits;
+        break;
+      case 2:
+        text[0] = text[0].sub(from, to), plain[0] = plainSub(old, from, to);
+        break;
+      case 3:
+        if (old.size() > 500) break;
+        text[0].appendSub(argument, from, to);
+        plain[0] += plainSub(argumentUnits, from, to);
+        break;
+      case 4:
+        if (old.size() > 500) break;
+        text[0].replace(argument, text[1]);
+        plain[0] = plainReplace(old, argumentUnits, plain[1]);
+        break;
+      case 5:
+        text[0].replace("a", text[0]).trim(true, true);
+        plain[0] = plainReplace(old, u"a", old);
+        while (!plain[0].empty() && plain[0][0] <= u' ') plain[0].erase(0, 1);
+        while (!plain[0].empty() && plain[0].back() <= u' ')
+          plain[0].pop_back();
+        if (plain[0].size() > 500) text[0] = "", plain[0].clear();
+        break;
+      case 6: {
+        KyCXString moved(std::move(text[0]));
+        EXPECT_TRUE(text[0].isEmpty());
+        text[0] += 'x';
+        text[0] = std::move(moved);
+        break;
+      }
+      case 7:
+        std::swap(text[0], text[1]), std::swap(plain[0], plain[1]);
+        break;
+      case 8:
+        text[0] = text[0].cstring() + std::min(text[0].length(), 3);
+        plain[0] = plainSub(old, 3, INT_MAX - 1);
+        for (char16_t& unit : plain[0]) unit = unit > 0xFF ? u'?' : unit;
+        break;
+      default:
+        plain[0] = randomUnits(random), text[0] = textOf(plain[0]);
+    }
+  }
+
+  void check() {
+    EXPECT_EQ(unitsOf(text[0]), plain[0]);
+    std::string narrow;
+    for (char16_t unit : plain[0])
+      narrow += static_cast<char>(unit > 0xFF ? u'?' : unit);
+    EXPECT_EQ(text[0].cstring(), narrow);
+    const int from = static_cast<int>(random() % 4);
+    EXPECT_EQ(text[0].find(text[1], from), plainFind(plain[0], plain[1], from));
+    EXPECT_EQ(text[0].find('\xE4', from), plainFind(plain[0], u"\u00E4", from));
+    EXPECT_EQ(text[0].startsWith(text[1]), plain[0].starts_with(plain[1]));
+    EXPECT_EQ(text[0] == text[1], plain[0] == plain[1]);
+    EXPECT_EQ(text[0] < text[1], plain[0] < plain[1]);
+    EXPECT_EQ(text[0].compareWith(text[1]) > 0, plain[0] > plain[1]);
+    EXPECT_EQ(unitsOf(text[0] + text[1]), plain[0] + plain[1]);
+  }
+};
+
+TEST(CXStringTest, WalksAsThePlainTextDoes) {
+  const unsigned int seed = std::random_device()();
+  SCOPED_TRACE(testing::Message() << "seed " << seed);
+  Walk walk(seed);
+  for (int i = 0; i < 5000 && !testing::Test::HasFailure(); ++i) {
+    walk.step();
+    walk.check();
+  }
+}
+
+TEST(CXStringTest, DerivedTextsKeepTheirPromises) {
+  const unsigned int seed = std::random_device()();
+  SCOPED_TRACE(testing::Message() << "seed " << seed);
+  std::mt19937 random(seed);
+  for (int i = 0; i < 1000 && !testing::Test::HasFailure(); ++i) {
+    const KyCXString text = textOf(randomUnits(random));
+    SCOPED_TRACE(text.cstring());
+    for (bool collapse : {false, true}) {
+      KyCXString name(text);
+      name.makeCIdentifier(collapse);
+      EXPECT_EQ(name.isValidCIdentifier(), !text.isEmpty());
+      if (text.isValidCIdentifier()) {
+        EXPECT_EQ(name, text);
+      }
+    }
+
+    leda::array<KyCXString> parts;
+    text.split('_', parts);
+    KyCXString joined = parts[0];
+    for (int part = 1; part < parts.size(); ++part) joined += "_" + parts[part];
+    EXPECT_EQ(joined, text);
+    for (const KyCXString& part : parts) EXPECT_FALSE(part.contains("_"));
+
+    const int limit = static_cast<int>(random() % 40);
+    KyCXString shortened(text);
+    shortened.shortenString(limit, 2, '_', KyCXString::ePositionMiddle);
+    EXPECT_EQ(shortened.length(), std::min(limit, text.length()));
+    // The end tells derived names apart.
+    const int kept = limit > 2 ? (limit - 2) / 2 : limit;
+    EXPECT_EQ(shortened.sub(shortened.length() - kept, INT_MAX),
+              text.sub(text.length() - kept, INT_MAX));
+    if (text.length() <= limit) {
+      EXPECT_EQ(shortened, text);
+    }
+  }
+}
+
+TEST(CXStringTest, ChangesOfTheText) {
+  using Text = KyCXString;
+  const struct {
+    const char* before;
+    Text& (*change)(Text&);
+    const char* after;
+  } rows[] = {
+      {"1a b  c-\xE4",
+       [](Text& t) -> Text& { return t.makeCIdentifier(false); }, "_1a_b__c__"},
+      {"a  -b _", [](Text& t) -> Text& { return t.makeCIdentifier(true); },
+       "a_b__"},
+      {"", [](Text& t) -> Text& { return t.makeCIdentifier(false); }, ""},
+      {"abcdefghij",
+       [](Text& t) -> Text& {
+         return t.shortenString(7, 2, '_', Text::ePositionMiddle);
+       },
+       "abc__ij"},
+      {"abcdefghij",
+       [](Text& t) -> Text& {
+         return t.shortenString(7, 2, '_', Text::ePositionFront);
+       },
+       "__fghij"},
+      {"abcdefghij",
+       [](Text& t) -> Text& {
+         return t.shortenString(7, 2, '_', Text::ePositionBack);
+       },
+       "abcde__"},
+      {"abcdefghij",
+       [](Text& t) -> Text& {
+         return t.shortenString(10, 2, '_', Text::ePositionBack);
+       },
+       "abcdefghij"},
+      {"abcde",
+       [](Text& t) -> Text& {
+         return t.shortenString(2, 2, '_', Text::ePositionFront);
+       },
+       "de"},
+      {"abc",
+       [](Text& t) -> Text& {
+         return t.shortenString(-1, -1, '_', Text::ePositionBack);
+       },
+       ""},
+      {" \t\n\v\f\ra b ", [](Text& t) -> Text& { return t.trim(true, false); },
+       "a b "},
+      {" a b ", [](Text& t) -> Text& { return t.trim(false, true); }, " a b"},
+      {" \t ", [](Text& t) -> Text& { return t.trim(true, true); }, ""},
+      {"<<a>>", [](Text& t) -> Text& { return t.filterAngleBrackets(); },
+       "<a>"},
+      {"<a", [](Text& t) -> Text& { return t.filterAngleBrackets(); }, "<a"},
+      {"<", [](Text& t) -> Text& { return t.filterAngleBrackets(); }, "<"},
+      {"a \n b",
+       [](Text& t) -> Text& { return t.replaceWhiteSpace('.', false); },
+       "a...b"},
+      {"a \n b ",
+       [](Text& t) -> Text& { return t.replaceWhiteSpace('\xB7', true); },
+       "a\xB7"
+       "b\xB7"},
+      {"aaa", [](Text& t) -> Text& { return t.replace("aa", "aaa"); }, "aaaa"},
+      {"Az[\xC4{`@", [](Text& t) -> Text& { return t.toLower(); },
+       "az[\xC4{`@"},
+      {"Az[\xE4{`@", [](Text& t) -> Text& { return t.toUpper(); },
+       "AZ[\xE4{`@"}};
+  for (const auto& row : rows) {
+    SCOPED_TRACE(row.before);
+    Text text(row.before);
+    EXPECT_EQ(row.change(text), row.after);
+  }
+  EXPECT_EQ(unitsOf(textOf(u"A\u20ACZ\u0100").toLower()), u"a\u20ACz\u0100");
+  EXPECT_EQ(textOf(u"A\u20AC\u0141Z").makeCIdentifier(false), "A__Z");
+  EXPECT_EQ(textOf(u"A\u20AC\u0141Z").makeCIdentifier(true), "A_Z");
+  EXPECT_EQ(unitsOf(textOf(u"<\u20AC>").filterAngleBrackets()), u"\u20AC");
+  EXPECT_EQ(unitsOf(textOf(u"\u20AC \t\u0120").replaceWhiteSpace('.', true)),
+            u"\u20AC.\u0120");
+}
+
+TEST(CXStringTest, NumbersAreWrittenInTheWidthAsked) {
+  EXPECT_EQ(KyCXString(-5, false, true), "-5");
+  EXPECT_EQ(KyCXString(INT_MIN, false, false), "-2147483648");
+  EXPECT_EQ(KyCXString(42, false, false), "0000000042");
+  EXPECT_EQ(KyCXString(-1, true, true), "FFFFFFFF");
+  EXPECT_EQ(KyCXString(0xABC, true, false), "00000ABC");
+  EXPECT_EQ(KyCXString(0UL, false, true), "0");
+  EXPECT_EQ(KyCXString(~0UL, true, false).length(),
+            static_cast<int>(2 * sizeof(long)));
+  EXPECT_EQ(KyCXString(1UL, false, false).length(),
+            sizeof(long) == 4 ? 10 : 20);
+}
+
+TEST(CXStringTest, PositionsOutsideTheTextFindNothing) {
+  const KyCXString text("abc");
+  for (int position : {INT_MIN, -1, 3, INT_MAX}) EXPECT_EQ(text[position], 0);
+  EXPECT_EQ(text.sub(INT_MIN, INT_MAX), "abc");
+  for (int from : {INT_MIN, 0, 3, INT_MAX}) {
+    EXPECT_EQ(text.sub(from, INT_MIN), "");
+  }
+  EXPECT_EQ(text.head(INT_MIN), "");
+  EXPECT_EQ(text.find("", INT_MIN), 0);
+  EXPECT_EQ(text.find("", 3), 3);
+  EXPECT_EQ(text.find("", 4), -1);
+  EXPECT_EQ(text.find("c", INT_MAX), -1);
+  EXPECT_EQ(text.find('a', INT_MIN), 0);
+  EXPECT_EQ(KyCXString(static_cast<const char*>(nullptr)), "");
+  EXPECT_EQ(KyCXString(nullptr, -1), "");
+  EXPECT_EQ(leda::compare(KyCXString("a\xE4"), KyCXString("az")) > 0, true);
+}
+
+}  // namespace
