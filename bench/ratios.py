@@ -169,6 +169,8 @@ def main():
     parser.add_argument("--rounds", type=int, default=7)
     parser.add_argument("--seconds", type=float, default=0.1,
                         help="least time of one measurement")
+    parser.add_argument("--list", action="store_true",
+                        help="only print the programs that are needed")
     arguments = parser.parse_args()
 
     folders = arguments.folder or sorted(
@@ -176,6 +178,9 @@ def main():
     rows = read_rows(folders)
     if not rows:
         sys.exit("script/bench: no rows to measure")
+    if arguments.list:
+        print(*sorted({row["program"] for row in rows}))
+        return 0
     machine = describe_machine()
     figures = {}
     for folder in folders:
