@@ -1,12 +1,14 @@
 #include "SourceRef/HxCSrcRefSet.h"
 
 #include <algorithm>
+#include <cstddef>
 
 namespace {
 
 using SrcRefIterator = HX_Iterator<const HxCSrcRef*>;
 
-constexpr int kBehindTheEnd = -1;  // thrown by currentItem()
+constexpr int kBehindTheEnd = -1;          // thrown by currentItem()
+constexpr std::size_t kFirstCapacity = 4;  // few items have more sources
 
 class EmptyIterator : public SrcRefIterator {
  public:
@@ -35,22 +37,22 @@ class SingleIterator : public SrcRefIterator {
 
 class ListIterator : public SrcRefIterator {
  public:
-  explicit ListIterator(const leda::list<const HxCSrcRef*>& list)
-      : m_List(list), m_Item(list.first()) {}
+  explicit ListIterator(const std::vector<const HxCSrcRef*>& list)
+      : m_List(list) {}
 
-  void first() override { m_Item = m_List.first(); }
+  void first() override { m_Index = 0; }
   void next() override {
-    if (m_Item) m_Item = m_List.succ(m_Item);
+    if (!isDone()) ++m_Index;
   }
-  bool isDone() const override { return !m_Item; }
+  bool isDone() const override { return m_Index == m_List.size(); }
   const HxCSrcRef* currentItem() const override {
-    if (!m_Item) throw kBehindTheEnd;
-    return m_List[m_Item];
+    if (isDone()) throw kBehindTheEnd;
+    return m_List[m_Index];
   }
 
  private:
-  const leda::list<const HxCSrcRef*>& m_List;  // of the set
-  leda::list_item<const HxCSrcRef*> m_Item;
+  const std::vector<const HxCSrcRef*>& m_List;  // of the set
+  std::size_t m_Index = 0;
 };
 
 }  // namespace
@@ -82,7 +84,7 @@ void HxCSrcRefSet::appendNew(const HxCSrcRef* srcRef) {
     return;
   }
   if (m_IsSingle) changeToList();
-  m_Content.list->append(srcRef);
+  m_Content.list->push_back(srcRef);
 }
 
 bool HxCSrcRefSet::contains(const HxCSrcRef* srcRef) const {
@@ -93,13 +95,14 @@ bool HxCSrcRefSet::contains(const HxCSrcRef* srcRef) const {
 
 void HxCSrcRefSet::changeToList() {
   auto* list = new List;
-  list->append(m_Content.one);
+  list->reserve(kFirstCapacity);
+  list->push_back(m_Content.one);
   m_Content.list = list;
   m_IsSingle = false;
 }
 
 int HxCSrcRefSet::getSrcRefCnt() const {
-  if (!m_IsSingle) return m_Content.list->size();
+  if (!m_IsSingle) return static_cast<int>(m_Content.list->size());
   return m_Content.one != nullptr ? 1 : 0;
 }
 

@@ -10,11 +10,12 @@
 #ifndef SOURCEREF_HXCSRCREFSET_H
 #define SOURCEREF_HXCSRCREFSET_H
 
+#include <vector>
+
 #include "Control/HX_Allocated.h"
 #include "HX_Export.h"
 #include "SourceRef/HX_Iterator.h"
 #include "SourceRef/HxCSrcRef.h"
-#include "platform/containers/list.h"
 
 /// Each reference is in it once, in the order of insertion; two references are
 /// the same if they are the same object. References are neither copied nor
@@ -70,7 +71,9 @@ class HX_UTILS_API HxCSrcRefSet : public HX_Allocated {
 
  private:
   friend class HxCSrcRefServer;
-  using List = leda::list<const HxCSrcRef*>;
+  // Consecutive in memory: a search through linked items takes five times as
+  // long for 64 references.
+  using List = std::vector<const HxCSrcRef*>;
 
   void addToNonEmpty(const HxCSrcRef* srcRef);
   /// Adds a reference that is not null and known not to be there.
