@@ -10,9 +10,10 @@
 /// Milliseconds of elapsed time since the process started.
 HX_PLATFORM_API std::int64_t HX_ProcessClock();
 
-/// Ticks per second of the system's own high-resolution counter. At 100 ns a
-/// tick, an interval of ten days times 1000000 still fits into 64 bits.
-inline constexpr std::int64_t kSystemCounterFrequency = 10'000'000;
+/// Ticks per second of the system's own high-resolution counter. A tick is 64
+/// ns: nanoseconds become ticks by a shift, and an interval of six days times
+/// 1000000 still fits into 64 bits.
+inline constexpr std::int64_t kSystemCounterFrequency = 1'000'000'000 / 64;
 
 /// Ticks per second of the high-resolution counter.
 /// \return 1 if there is such a counter, else 0 with \p frequency untouched.

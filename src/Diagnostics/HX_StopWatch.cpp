@@ -172,20 +172,27 @@ void HX_StopWatch::stop() {
   const std::int64_t now = hx_detail::rawTime(m_PerformanceCounter);
   const std::int64_t interval = hx_detail::rawToMicroseconds(
       wrapSubtract(now, m_Start), m_PerformanceCounter, m_ProcessorFreq);
-  if (HX_TimingListener* listener = HX_TimingListener::installed())
-    listener->runEnded(m_Name,
-                       hx_detail::rawTimeToMicroseconds(
-                           m_Start, m_PerformanceCounter, m_ProcessorFreq),
-                       interval);
+  if (HX_TimingListener::installed() != nullptr) tellListener(interval);
   m_TotalTime = wrapAdd(m_TotalTime, interval);
   m_Calls = wrapAdd32(m_Calls, 1);
   m_Start = 0;
   updateRunningList();
-  addIntervalToActiveWatches(wrapSubtract(interval, m_SubWatchTime));
+  if (s_pRunning != nullptr)
+    addIntervalToActiveWatches(wrapSubtract(interval, m_SubWatchTime));
   m_SubWatchTime = 0;
 }
 
-void HX_StopWatch::addIntervalToActiveWatches(std::int64_t time) {
+// Kept out of stop(), which is measured along with what it measures.
+[[gnu::noinline]] void HX_StopWatch::tellListener(std::int64_t interval) const {
+  HX_TimingListener::installed()->runEnded(
+      m_Name,
+      hx_detail::rawTimeToMicroseconds(m_Start, m_PerformanceCounter,
+                                       m_ProcessorFreq),
+      interval);
+}
+
+[[gnu::noinline]] void HX_StopWatch::addIntervalToActiveWatches(
+    std::int64_t time) {
   // This watch has just stopped, so the list holds only others.
   for (HX_StopWatch* watch = s_pRunning; watch != nullptr;
        watch = watch->m_pNext)

@@ -81,6 +81,7 @@ class HX_UTILS_API HX_StopWatch : public HX_Allocated {
   void addIntervalToActiveWatches(std::int64_t time);
   static void terminate();
 
+  void tellListener(std::int64_t interval) const;
   void assignFields(const HX_StopWatch& other);
   static Registry& watches();
   static void unregister(int key);

@@ -6,15 +6,18 @@
 namespace {
 
 constexpr std::int64_t kTicksPerMillisecond = kSystemCounterFrequency / 1000;
-constexpr std::uint32_t kNanosecondsPerTick =
-    1'000'000'000 / kSystemCounterFrequency;
+constexpr std::int64_t kNanosecondsPerSecond = 1'000'000'000;
+constexpr std::int64_t kNanosecondsPerTick = 64;
+static_assert(kNanosecondsPerTick * kSystemCounterFrequency ==
+              kNanosecondsPerSecond);
 
 std::int64_t monotonicTicks() {
   timespec now{};
   clock_gettime(CLOCK_MONOTONIC, &now);
-  // Nanoseconds of a second fit 32 bits, where the division is cheapest.
-  return std::int64_t{now.tv_sec} * kSystemCounterFrequency +
-         static_cast<std::uint32_t>(now.tv_nsec) / kNanosecondsPerTick;
+  // Unsigned, so that the division is a shift; the clock is never negative.
+  const auto nanoseconds = static_cast<std::uint64_t>(
+      std::int64_t{now.tv_sec} * kNanosecondsPerSecond + now.tv_nsec);
+  return static_cast<std::int64_t>(nanoseconds / kNanosecondsPerTick);
 }
 
 // The library is loaded as part of the process start.
