@@ -1,0 +1,3 @@
+#include "DependencySorting/HxCDepSortComp.h"
+
+HxCDepSortComp::~HxCDepSortComp() = default;
