@@ -34,7 +34,7 @@ bool areEqual(double a, double b) {
 
 bool areApproxEqual(double a, double b, double tolerance) {
   if (!std::isfinite(a) || !std::isfinite(b)) return areEqual(a, b);
-  const double scale = std::max({1.0, std::fabs(a), std::fabs(b)});
+  const double scale = std::max(1.0, std::max(std::fabs(a), std::fabs(b)));
   return tolerance * scale > std::fabs(a - b);
 }
 
@@ -58,16 +58,39 @@ int satCastToInt(double x) {
   return x > -2147483648.0 ? static_cast<int>(x) : -2147483647 - 1;
 }
 
+// True for values whose rounding needs neither saturation nor the run-time's
+// floor; false for special values.
+bool isModerate(double x) { return std::fabs(x) < 0x1p62; }
+
+// floor(x + 0.5) of a moderate value; the sign of a zero is lost.
+double nearestInteger(double x) {
+  const double y = x + 0.5;
+  const double cut = static_cast<double>(static_cast<long long>(y));
+  return cut - static_cast<double>(cut > y);
+}
+
+bool isNear(double x, double nearest) {
+  const double scale =
+      std::max(1.0, std::max(std::fabs(nearest), std::fabs(x)));
+  return kDefaultTolerance * scale > std::fabs(nearest - x);
+}
+
 bool isIntegerValue(double x) {
+  if (isModerate(x)) return isNear(x, nearestInteger(x));
   return areApproxEqual(truncate(std::floor(x + 0.5)), x, kDefaultTolerance);
 }
 
-// The integer that the near-integer x stands for.
-double snap(double x) {
-  HX_Assert(isIntegerValue(x), kErrorCode);
-  const double nearest = std::floor(x + 0.5);
-  if (x > 0.0) return truncate(nearest > x ? x + 1.0 : x);
-  return truncate(nearest < x ? x - 1.0 : x);
+// Truncates x + step, or the step that snaps a near-integer to its integer.
+// Selects by arithmetic: which case a value is cannot be predicted.
+double snapOrTruncate(double x, int step) {
+  if (!isModerate(x)) return truncate(x);  // an integer as it is
+  const double nearest = nearestInteger(x);
+  const int isPositive = x > 0.0;
+  const int up = isPositive & static_cast<int>(nearest > x);
+  const int down = (1 - isPositive) & static_cast<int>(nearest < x);
+  const int chosen =
+      step + static_cast<int>(isNear(x, nearest)) * (up - down - step);
+  return static_cast<double>(static_cast<long long>(x + chosen));
 }
 
 double log2OfReal(double x) { return HX_NaturalLog(x) / kShortLn2; }
@@ -161,13 +184,11 @@ bool FPS_ConvertSpecialValueToInteger(double x, double* out) {
 double FPS_Round(double x) { return truncate(x < 0.0 ? x - 0.5 : x + 0.5); }
 
 double FPS_RoundUp(double x) {
-  if (isIntegerValue(x)) return snap(x);
-  return truncate(x < 0.0 ? x : x + 1.0);
+  return snapOrTruncate(x, static_cast<int>(!(x < 0.0)));
 }
 
 double FPS_RoundDown(double x) {
-  if (isIntegerValue(x)) return snap(x);
-  return truncate(x < 0.0 ? x - 1.0 : x);
+  return snapOrTruncate(x, -static_cast<int>(x < 0.0));
 }
 
 double FPS_SimulinkAlikeModulo(double x, double y) {

@@ -1,0 +1,184 @@
+#include "Math/IMS_IntegerMathSupport.h"
+
+#include <algorithm>
+#include <bit>
+#include <cmath>
+#include <limits>
+#include <utility>
+
+#include "Math/FPS_FloatingPointSupport.h"
+#include "platform/datatypes/HX_NumericalType.h"
+#include "platform/datatypes/HX_TypeSupport.h"
+
+namespace {
+
+using Unsigned = unsigned long long;
+constexpr long long kSmallest = std::numeric_limits<long long>::min();
+constexpr long long kLargest = std::numeric_limits<long long>::max();
+
+// The smallest value by -1 would trap.
+long long remainder(long long a, long long b) { return b == -1 ? 0 : a % b; }
+
+// The product may have wrapped to the smallest value.
+long long wrappedQuotient(Unsigned product, long long divisor) {
+  if (divisor == -1) return static_cast<long long>(0 - product);
+  return static_cast<long long>(product) / divisor;
+}
+
+Unsigned magnitude(long long v) {
+  return v < 0 ? 0 - static_cast<Unsigned>(v) : static_cast<Unsigned>(v);
+}
+
+Unsigned withoutTrailingZeros(Unsigned v) { return v >> std::countr_zero(v); }
+
+// Both odd. One subtraction per step: best while the processor learns the order
+// of the operands.
+Unsigned oddGcdBySubtraction(Unsigned a, Unsigned b) {
+  while (a != b) {
+    const Unsigned difference = a < b ? b - a : a - b;
+    b = std::min(a, b);
+    a = withoutTrailingZeros(difference);
+  }
+  return a;
+}
+
+// Both odd. A division per step removes more bits than the subtractions that
+// it replaces when their order is random.
+Unsigned oddGcdByDivision(Unsigned a, Unsigned b) {
+  if (a < b) std::swap(a, b);
+  while (b > 1) {
+    const Unsigned rest = a % b;
+    if (rest == 0) return b;
+    const Unsigned x = withoutTrailingZeros(rest);
+    const Unsigned y = withoutTrailingZeros(b - rest);
+    a = std::max(x, y);
+    b = std::min(x, y);
+  }
+  return b;
+}
+
+// Both above 0.
+Unsigned binaryGcd(Unsigned a, Unsigned b) {
+  constexpr int kSmallBits = 32;   // no preparation pays
+  constexpr int kSizeGapBits = 6;  // one division replaces many subtractions
+  constexpr int kLargeBits = 56;   // hardly a pair has a pattern to learn
+  const int shift = std::countr_zero(a | b);
+  a = withoutTrailingZeros(a);
+  b = withoutTrailingZeros(b);
+  if ((a | b) >> kSmallBits != 0) {
+    if (a < b) std::swap(a, b);
+    if (b >> kLargeBits != 0) return oddGcdByDivision(a, b) << shift;
+    if (a >> kSizeGapBits > b) {
+      a %= b;
+      if (a == 0) return b << shift;
+      a = withoutTrailingZeros(a);
+    }
+  }
+  return oddGcdBySubtraction(a, b) << shift;
+}
+
+long long greatestCommonDivisor(long long a, long long b) {
+  if (a == 0) return b;
+  if (b == 0) return a;
+  if ((a < 0) == (b < 0)) {
+    const Unsigned divisor = binaryGcd(magnitude(a), magnitude(b));
+    return static_cast<long long>(a < 0 ? 0 - divisor : divisor);
+  }
+  while (b != 0) {
+    const long long rest = remainder(a, b);
+    a = b;
+    b = rest;
+  }
+  return a;
+}
+
+// 2^exponent; 0 or infinity far off.
+double powerOf2(int exponent) { return std::ldexp(1.0, exponent); }
+
+}  // namespace
+
+long long IMS_AbsInt64(long long v) {
+  if (v == kSmallest) return kLargest;
+  return v < 0 ? -v : v;
+}
+
+bool IMS_FitsInt32(long long v) {
+  return v >= -2147483648LL && v <= 2147483647LL;
+}
+
+bool IMS_FitsUInt32(long long v) { return v >= 0 && v <= 4294967295LL; }
+
+bool IMS_Fits32Bit(long long v) {
+  return IMS_FitsInt32(v) || IMS_FitsUInt32(v);
+}
+
+long long IMS_GetLower32Bit(long long v) { return v & 4294967295LL; }
+
+long long IMS_GetUpper32Bit(long long v) { return v >> 32; }
+
+bool IMS_IsEven(long long v) { return (v & 1) == 0; }
+
+long long IMS_RoundDouble(double x) {
+  if (FPS_ValuesAreEqual(x, 0.0)) return 0;
+  return FPS_SatCastToInt64(x > 0.0 ? x + 0.5 : x - 0.5);
+}
+
+std::uint32_t IMS_RoundDoubleToULong(double x) {
+  return static_cast<std::uint32_t>(IMS_RoundDouble(x));
+}
+
+long long IMS_SimulinkAlikeSqrt(long long v) {
+  return FPS_SatCastToInt64(FPS_SimulinkAlikeSqrt(static_cast<double>(v)));
+}
+
+long long IMS_FindGreatestCommonDivisor(const long long* pair) {
+  return greatestCommonDivisor(pair[0], pair[1]);
+}
+
+long long IMS_FindLeastCommonMultiple(int n, const long long* values,
+                                      double limit) {
+  const double product =
+      static_cast<double>(values[0]) * static_cast<double>(values[1]);
+  if (!(std::fabs(product) < 0x1p63)) return 0;
+
+  long long multiple = values[0];
+  for (int i = 1; i < n; ++i) {
+    const long long value = values[i];
+    if (multiple == 0 || value == 0) return 0;
+    const long long divisor = greatestCommonDivisor(multiple, value);
+    if (divisor == value && remainder(value, multiple) != 0) return 0;
+    multiple = wrappedQuotient(
+        static_cast<Unsigned>(multiple) * static_cast<Unsigned>(value),
+        divisor);
+    if (static_cast<double>(multiple) > limit) return 0;
+  }
+  return multiple;
+}
+
+long long IMS_ShrinkValueToBaseType(long long v, const HX_NumericalType* type) {
+  const auto asDouble = static_cast<double>(v);
+  if (!(asDouble > type->getMaximum()) && !(asDouble < type->getMinimum())) {
+    return v;
+  }
+  const int width = type->getBitWidth();
+  if (width > 32) return v;
+  if (width < 1) return 0;
+
+  const Unsigned mask = (Unsigned{1} << width) - 1;
+  Unsigned masked = static_cast<Unsigned>(v) & mask;
+  const bool isSignSet = (masked >> (width - 1) & 1) != 0;
+  if (HX_TypeSupport::findHighestBitSetInInt64Value(v) > 7 &&
+      type->isSigned() && isSignSet) {
+    masked |= ~mask;
+  }
+  return static_cast<long long>(masked);
+}
+
+bool IMS_ValueMatchesSignednessAndWidth(double x, bool isSigned, int width) {
+  // Powers beyond these are 0 or infinite; a smaller width could not be
+  // reduced.
+  const int bits = std::clamp(width, -5000, 5000);
+  if (!isSigned) return !(x > powerOf2(bits) - 1.0);
+  if (x < 0.0) return !(std::fabs(x) > powerOf2(bits - 1));
+  return !(x > powerOf2(bits - 1) - 1.0);
+}

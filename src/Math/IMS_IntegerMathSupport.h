@@ -1,0 +1,91 @@
+// Arithmetic on 64-bit integers as the simulation does it: the counterparts of
+// FPS_FloatingPointSupport.
+//
+//   long long rates[] = {48000, 44100};
+//   IMS_FindGreatestCommonDivisor(rates);                // 300
+//   IMS_FindLeastCommonMultiple(2, rates, 1e9);          // 7056000
+//   IMS_FindLeastCommonMultiple(2, rates, 1e6);          // 0: above the limit
+//
+// No operation reports anything, and none faults for any argument. IMS_Log2 is
+// part of the module and comes with this header.
+
+#ifndef MATH_IMS_INTEGERMATHSUPPORT_H
+#define MATH_IMS_INTEGERMATHSUPPORT_H
+
+#include <cstdint>
+
+#include "HX_Export.h"
+#include "Math/IMS_Log2.h"
+
+class HX_NumericalType;
+
+/// |v|; the smallest value saturates to 9223372036854775807.
+HX_UTILS_API long long IMS_AbsInt64(long long v);
+
+/// True if \p v is a value of a signed 32-bit integer, of an unsigned one, of
+/// either.
+HX_UTILS_API bool IMS_FitsInt32(long long v);
+HX_UTILS_API bool IMS_FitsUInt32(long long v);
+HX_UTILS_API bool IMS_Fits32Bit(long long v);
+
+/// The low word, never negative, and the high word, with the sign of \p v:
+/// v == upper * 2^32 + lower.
+HX_UTILS_API long long IMS_GetLower32Bit(long long v);
+HX_UTILS_API long long IMS_GetUpper32Bit(long long v);
+
+HX_UTILS_API bool IMS_IsEven(long long v);
+
+/// Rounds half away from zero; saturates at the bounds of the type. NaN gives
+/// the largest value. The half is added in double, as in FPS_Round.
+HX_UTILS_API long long IMS_RoundDouble(double x);
+
+/// The low 32 bits of IMS_RoundDouble(x): wraps, does not saturate.
+HX_UTILS_API std::uint32_t IMS_RoundDoubleToULong(double x);
+
+/// The square root of |v|, truncated, with the sign of \p v. It is taken in
+/// double: above 2^52 it is one too large for some values just below a square.
+HX_UTILS_API long long IMS_SimulinkAlikeSqrt(long long v);
+
+/// The last divisor of Euclid's algorithm with truncating division on the two
+/// values of \p pair, which stay unchanged.
+///
+/// (a, 0) gives a. No absolute value is taken: for operands of equal sign the
+/// result has that sign, for others it has the sign that the number of steps
+/// leads to. The smallest value is divided like any other, also by -1.
+/// Cost: operands of equal sign take the binary algorithm of J. Stein (J. Comp.
+/// Phys. 1, 1967), with about one subtraction per bit.
+HX_UTILS_API long long IMS_FindGreatestCommonDivisor(const long long* pair);
+
+/// The least common multiple of \p n values, at least 2, or 0 if it cannot be
+/// formed within the bounds.
+///
+/// It cannot if it is above \p limit (a NaN limits nothing, and a negative
+/// multiple is never above a positive limit), if the product of the first two
+/// values reaches 2^63 in magnitude, computed in double, or if a value other
+/// than the first is a proper divisor of the multiple of those before it: 3, 6
+/// gives 6, but 6, 3 gives 0. Any value 0 gives 0 as well.
+/// Products after the first are not checked: they wrap to 64 bits.
+HX_UTILS_API long long IMS_FindLeastCommonMultiple(int n,
+                                                   const long long* values,
+                                                   double limit);
+
+/// \p v wrapped into the range of \p type: 40000 becomes -25536 in a signed
+/// 16-bit type.
+///
+/// A value in the range, compared in double, stays; so does every value if the
+/// type has more than 32 bits. A type of less than one bit gives 0.
+/// A value from 0 to 127 is cut, but never becomes negative: 12 wraps to 12 in
+/// a signed 4-bit type, and 140 to -4.
+HX_UTILS_API long long IMS_ShrinkValueToBaseType(long long v,
+                                                 const HX_NumericalType* type);
+
+/// True if \p x is not above the range of an integer with that signedness and
+/// bit width; fractions are allowed, and NaN is above no range.
+///
+/// An unsigned range has no lower bound here: negative values pass. The bounds
+/// are doubles, so from 54 bits on they are rounded up: 2^63 passes for a
+/// signed 64-bit type.
+HX_UTILS_API bool IMS_ValueMatchesSignednessAndWidth(double x, bool isSigned,
+                                                     int width);
+
+#endif  // MATH_IMS_INTEGERMATHSUPPORT_H
