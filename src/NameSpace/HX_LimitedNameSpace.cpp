@@ -56,9 +56,9 @@ bool isNeverCut(const KyCXString& name) {
 struct HX_LimitedNameSpace::Name : HX_Allocated {
   explicit Name(const KyCXString& name) : text(name) {}
 
-  KyCXString text;
   bool isDefined = false;  // in the set; else only the head of variants
   int counter = 0;
+  KyCXString text;
   // Suffix indices whose variants of this text are known to be in the set.
   HX_IndexRuns taken;
 };

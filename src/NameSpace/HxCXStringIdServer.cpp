@@ -1,85 +1,17 @@
 #include "NameSpace/HxCXStringIdServer.h"
 
-#include <cstdint>
+#include <algorithm>
 #include <cstring>
 
 #include "Control/HX_SelfCheck.h"
-#include "NameSpace/HX_KeyTable.h"
-#include "NameSpace/HX_PlainArray.h"
 #include "NameSpace/implNameSpace/HX_TextHash.h"
 #include "platform/strings/KyCXString.h"
 
 namespace {
 
 constexpr char kErrorCode[] = __FILE__ "_";
-constexpr unsigned kBucketBits = 10;
-constexpr unsigned kBucketCount = 1U << kBucketBits;
-
-// Followed in the same block by the text and its terminating zero.
-struct StringEntry {
-  std::int32_t length;  // without the zero
-  std::int32_t id;
-
-  char* text() { return reinterpret_cast<char*>(this + 1); }
-};
-
-unsigned bucketOf(const char* text, std::size_t length) {
-  unsigned sum = 0;
-  for (std::size_t i = 0; i < length; ++i)
-    sum += static_cast<unsigned>(static_cast<signed char>(text[i]));
-  return sum % kBucketCount;
-}
-
-StringEntry* newEntry(unsigned id, const char* text, std::size_t length) {
-  void* block = HX_Allocate(sizeof(StringEntry) + length + 1);
-  if (block == nullptr) return nullptr;
-  auto* entry = static_cast<StringEntry*>(block);
-  entry->length = static_cast<std::int32_t>(length);
-  entry->id = static_cast<std::int32_t>(id);
-  std::memcpy(entry->text(), text, length);
-  entry->text()[length] = 0;
-  return entry;
-}
 
 }  // namespace
-
-struct HxCXStringIdServer::Table : HX_Allocated {
-  Table() = default;
-  Table(const Table&) = delete;
-  Table& operator=(const Table&) = delete;
-  ~Table() {
-    for (const auto& bucket : m_Buckets)
-      for (StringEntry* entry : bucket) HX_Free(entry);
-  }
-
-  StringEntry* find(int hash, const char* text, std::size_t length) const {
-    const auto* slot = m_Index.find(hash, [=](StringEntry* entry) {
-      return static_cast<std::size_t>(entry->length) == length &&
-             std::memcmp(entry->text(), text, length) == 0;
-    });
-    return slot == nullptr ? nullptr : slot->value;
-  }
-
-  // Null, with nothing changed, if there is no memory.
-  StringEntry* add(int hash, const char* text, std::size_t length) {
-    const unsigned number = bucketOf(text, length);
-    auto& bucket = m_Buckets[number];
-    StringEntry* entry =
-        newEntry(number + (bucket.size() << kBucketBits), text, length);
-    if (entry == nullptr) return nullptr;
-    if (bucket.append(entry)) {
-      if (m_Index.add(hash, entry) != nullptr) return entry;
-      bucket.dropLast();
-    }
-    HX_Free(entry);
-    return nullptr;
-  }
-
-  // Strings of one bucket in the order of arrival, which is the id's upper
-  // part.
-  HX_PlainArray<StringEntry*> m_Buckets[kBucketCount];
-  HX_KeyTable<StringEntry*> m_Index;  // by the hash of the text
-};
 
 bool HxCXStringIdServer::boot() {
   if (m_pTable == nullptr) m_pTable = new Table;
@@ -87,6 +19,9 @@ bool HxCXStringIdServer::boot() {
 }
 
 bool HxCXStringIdServer::shutdown() {
+  if (m_pTable == nullptr) return true;
+  m_pTable->index.forEach([](const auto& slot) { HX_Free(slot.value); });
+  HX_Free(m_pTable->nearTexts);
   delete m_pTable;
   m_pTable = nullptr;
   return true;
@@ -111,17 +46,106 @@ bool HxCXStringIdServer::findOrAdd(const KyCXString& s, int& id) {
   const char* const text = s.cstring();
   const std::size_t length = std::strlen(text);
   const int hash = HX_TextHash(text, length);
-  const StringEntry* entry = m_pTable->find(hash, text, length);
-  if (entry == nullptr) entry = m_pTable->add(hash, text, length);
+  const auto* slot = m_pTable->index.find(hash, [=](Entry* entry) {
+    return static_cast<std::size_t>(entry->length) == length &&
+           std::memcmp(entry->text(), text, length) == 0;
+  });
+  const Entry* entry = slot != nullptr ? slot->value : add(hash, text, length);
   if (entry == nullptr) return false;
   id = entry->id;
   return true;
 }
 
-const char* HxCXStringIdServer::getString(int id) {
-  if (!HX_Assert(m_pTable != nullptr, kErrorCode)) return nullptr;
+unsigned HxCXStringIdServer::bucketOf(const char* text, std::size_t length) {
+  unsigned sum = 0;
+  for (std::size_t i = 0; i < length; ++i)
+    sum += static_cast<unsigned>(static_cast<signed char>(text[i]));
+  return sum % kBucketCount;
+}
+
+HxCXStringIdServer::Entry* HxCXStringIdServer::newEntry(unsigned id,
+                                                        const char* text,
+                                                        std::size_t length) {
+  void* block = HX_Allocate(sizeof(Entry) + length + 1);
+  if (block == nullptr) return nullptr;
+  auto* entry = static_cast<Entry*>(block);
+  entry->length = static_cast<std::int32_t>(length);
+  entry->id = static_cast<std::int32_t>(id);
+  std::memcpy(entry->text(), text, length);
+  entry->text()[length] = 0;
+  return entry;
+}
+
+// Null, with nothing changed, if there is no memory.
+HxCXStringIdServer::Entry* HxCXStringIdServer::add(int hash, const char* text,
+                                                   std::size_t length) {
+  const unsigned number = bucketOf(text, length);
+  unsigned& arrivals = m_pTable->buckets[number].arrivals;
+  Entry* entry = newEntry(number + arrivals * kBucketCount, text, length);
+  if (entry == nullptr) return nullptr;
+  auto* slot = m_pTable->index.add(hash, entry);
+  if (slot != nullptr &&
+      keepText(static_cast<unsigned>(entry->id), entry->text())) {
+    ++arrivals;
+    return entry;
+  }
+  if (slot != nullptr) m_pTable->index.erase(slot);
+  HX_Free(entry);
+  return nullptr;
+}
+
+// False, with nothing changed, if there is no memory.
+bool HxCXStringIdServer::keepText(unsigned id, const char* text) {
+  Table& table = *m_pTable;
+  if (id >= table.nearSize && table.nearUsed >= table.nearSize / 2) growNear();
+  const bool isNear = id < table.nearSize;
+  Bucket& bucket = table.buckets[id % kBucketCount];
+  if (!isNear || bucket.farTexts.size() != 0) {
+    if (bucket.farTexts.size() == 0) bucket.firstFar = bucket.arrivals;
+    if (!bucket.farTexts.append(text)) return false;
+  }
+  if (!isNear) return true;
+  table.nearTexts[id] = text;
+  ++table.nearUsed;
+  return true;
+}
+
+// Without memory, everything stays as it is.
+void HxCXStringIdServer::growNear() {
+  Table& table = *m_pTable;
+  const unsigned newSize =
+      table.nearSize == 0 ? 2 * kBucketCount : 2 * table.nearSize;
+  void* const room = HX_Allocate(newSize * sizeof(char*));
+  if (room == nullptr) return;
+  auto** const texts = static_cast<const char**>(room);
+  std::copy_n(table.nearTexts, table.nearSize, texts);
+  std::fill(texts + table.nearSize, texts + newSize, nullptr);
+  HX_Free(table.nearTexts);
+  table.nearTexts = texts;
+  table.nearSize = newSize;
+  for (unsigned number = 0; number < kBucketCount; ++number)
+    fillNear(table.buckets[number], number);
+}
+
+// Enters the far texts of a bucket that are near by now.
+void HxCXStringIdServer::fillNear(const Bucket& bucket, unsigned number) {
+  unsigned id = number + bucket.firstFar * kBucketCount;
+  for (const char* text : bucket.farTexts) {
+    if (id >= m_pTable->nearSize) return;
+    if (m_pTable->nearTexts[id] == nullptr) ++m_pTable->nearUsed;
+    m_pTable->nearTexts[id] = text;
+    id += kBucketCount;
+  }
+}
+
+const char* HxCXStringIdServer::textFarOff(int id) const {
   const unsigned bits = static_cast<unsigned>(id);
-  const auto& bucket = m_pTable->m_Buckets[bits % kBucketCount];
-  const unsigned arrival = bits >> kBucketBits;
-  return arrival < bucket.size() ? bucket[arrival]->text() : nullptr;
+  const Bucket& bucket = m_pTable->buckets[bits % kBucketCount];
+  const unsigned place = bits / kBucketCount - bucket.firstFar;
+  return place < bucket.farTexts.size() ? bucket.farTexts[place] : nullptr;
+}
+
+const char* HxCXStringIdServer::refuseText() {
+  HX_Assert(false, kErrorCode);
+  return nullptr;
 }

@@ -14,8 +14,13 @@
 #ifndef NAMESPACE_HXCXSTRINGIDSERVER_H
 #define NAMESPACE_HXCXSTRINGIDSERVER_H
 
+#include <cstddef>
+#include <cstdint>
+
 #include "Control/HX_Allocated.h"
 #include "HX_Export.h"
+#include "NameSpace/HX_KeyTable.h"
+#include "NameSpace/HX_PlainArray.h"
 
 class KyCXString;
 
@@ -57,10 +62,48 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
   /// The 8-bit form of the string with \p id, null if there is none. Valid
   /// until shutdown(), however many strings are added. Null after an internal
   /// assertion if the server is down.
-  const char* getString(int id);
+  const char* getString(int id) const {
+    if (m_pTable == nullptr) return refuseText();
+    const unsigned place = static_cast<unsigned>(id);
+    return place < m_pTable->nearSize ? m_pTable->nearTexts[place]
+                                      : textFarOff(id);
+  }
 
  private:
-  struct Table;
+  static constexpr unsigned kBucketCount = 1024;
+
+  // Followed in the same block by the text and its terminating zero.
+  struct Entry {
+    std::int32_t length;  // without the zero
+    std::int32_t id;
+
+    char* text() { return reinterpret_cast<char*>(this + 1); }
+  };
+
+  struct Bucket {
+    unsigned arrivals = 0;
+    unsigned firstFar = 0;  // the arrival that farTexts starts with
+    HX_PlainArray<const char*> farTexts;  // all arrivals since that one
+  };
+
+  struct Table : HX_Allocated {
+    HX_KeyTable<Entry*> index;  // by the hash of the text
+    Bucket buckets[kBucketCount];
+    // The text of each id below nearSize, null for ids not handed out. Where
+    // the buckets fill evenly, nearly all ids are near.
+    const char** nearTexts = nullptr;
+    unsigned nearSize = 0;
+    unsigned nearUsed = 0;
+  };
+
+  static unsigned bucketOf(const char* text, std::size_t length);
+  static Entry* newEntry(unsigned id, const char* text, std::size_t length);
+  Entry* add(int hash, const char* text, std::size_t length);
+  bool keepText(unsigned id, const char* text);
+  void growNear();
+  void fillNear(const Bucket& bucket, unsigned number);
+  const char* textFarOff(int id) const;
+  static const char* refuseText();
 
   Table* m_pTable = nullptr;  // null while down
 };
