@@ -70,10 +70,15 @@ const StepsCase kStepsCases[] = {
     {"a shortened free name is not derived",
      false,
      {{'l', HX_29 "3456", "abcdefghijklmno__tuvwxyz0123456"}}},
-    {"only the first variant is one of the shortened name",
+    {"taken variants of the shortened name do not count for the name",
      true,
      {{'+', "abcdefghijklmno__tuvwxyz0123456"},
-      {'+', "abcdefghijklmno__tuvwxyz01234_a"},
+      {'u', "abcdefghijklmno__tuvwxyz0123456",
+       "abcdefghijklmno__tuvwxyz01234_a"},
+      {'u', "abcdefghijklmno__tuvwxyz0123456",
+       "abcdefghijklmno__tuvwxyz01234_b"},
+      {'-', "abcdefghijklmno__tuvwxyz0123456"},
+      {'+', "abcdefghijklmno__tuvwxyz0123456"},
       {'l', HX_29 "3456", HX_29 "_b"}}},
 };
 

@@ -111,6 +111,16 @@ TEST_F(NameSpaceTest, BreachedPreconditionsAssertAndGiveNothing) {
   delete root;
 }
 
+TEST_F(NameSpaceTest, ScopesListedTwiceOrInACycleAreDestroyedOnce) {
+  HX_CountingController memory;
+  Scope* const root = new Scope(nullptr);
+  Scope* const child = new Scope(root);
+  for (Scope* scope : {child, child, root}) root->addChild(scope);
+  child->addChild(root);
+  delete root;
+  EXPECT_EQ(memory.liveBlocks(), 0);
+}
+
 // A scope in the plainest form, and the searches as their definition reads.
 struct PlainScope {
   PlainScope* parent;
