@@ -74,8 +74,8 @@ void reportImprecise(const HxCCIdentifier& id, const char* kind,
 
 }  // namespace
 
-// A text carries no references or flags, so that there is nothing to do where
-// the macro does not occur.
+// A text without a macro of its own carries neither references nor flags, so
+// that there is nothing to do where the macro does not occur.
 bool HxCNames::replaceMacro(HxCCIdentifier& id, const char* macro,
                             const KyCXString& text) {
   if (!contains(id, "$" + KyCXString(macro))) return false;
@@ -176,6 +176,7 @@ void HxCNames::replaceMultirateTaskISRName(HxCCIdentifier& id,
                                            const HxCCIdentifier& task,
                                            const HxCCIdentifier& isr,
                                            bool isTaskName) {
+  const HxCCIdentifier isrBefore(isr);  // isr may be the name changed here
   if (isTaskName) {
     if (replaceMacro(id, "(Task)", "__Task_"))
       ERR_Msg1204(messageRef(id), id.getRawName(kActive).cstring());
@@ -183,7 +184,7 @@ void HxCNames::replaceMultirateTaskISRName(HxCCIdentifier& id,
     const bool hasTask = !task.getCookedName(kActive).isEmpty();
     replaceByIdentifier(id, "(Task)", hasTask ? task : isr);
   }
-  replaceByIdentifier(id, "(ISR)", isr);
+  replaceByIdentifier(id, "(ISR)", isrBefore);
 }
 
 void HxCNames::replaceMultirateObjName(HxCCIdentifier& id,
@@ -220,7 +221,9 @@ void HxCNames::replaceMultirateMsgVarName(HxCCIdentifier& id,
     value = parts[parts.high()];
     value = value.head(value.length() - 1);
   }
-  replaceMacro(id, "(MsgVar)", value);
+  // The value may hold macros: its flags count even where nothing is replaced.
+  substAllDollarZByValue(id, "(MsgVar)", HxCCIdentifier(value),
+                         eMacroKindExact);
 }
 
 void HxCNames::determineOsekBaseTime(double value, tagHxEOsekTimeBase& base,

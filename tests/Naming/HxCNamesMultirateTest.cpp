@@ -1,4 +1,5 @@
 #include <cmath>
+#include <limits>
 #include <random>
 
 #include "Math/FPS_FloatingPointSupport.h"
@@ -139,6 +140,16 @@ TEST_F(MultirateTest, TimesAgreeWithExactArithmetic) {
 TEST_F(MultirateTest, CountsBeyondTheRangeAreSaturated) {
   EXPECT_EQ(time("$(Period1us)", 1e6, 0), "2147483647");
   EXPECT_EQ(time("$(Time)", 86400.0 * 1e10, 0), "2147483647d");
+  constexpr double kLargest = std::numeric_limits<double>::max();
+  for (double value : {kLargest, HUGE_VAL, std::nan("")}) {
+    for (const char* macro : {"$(Time1d)", "$(Time)"}) {
+      clearMessages();
+      const bool isGeneric = std::string(macro) == "$(Time)";
+      const std::string count = isGeneric ? "2147483647us" : "2147483647";
+      EXPECT_EQ(time(macro, value, -value), count + "_" + count) << value;
+      EXPECT_EQ(messages().size(), isGeneric ? 2U : 1U) << macro << value;
+    }
+  }
 }
 
 TEST_F(MultirateTest, NoncyclicTasksHaveNoTime) {
@@ -165,6 +176,9 @@ TEST_F(MultirateTest, TasksAndIsrsStandInForEachOther) {
   EXPECT_EQ(replace(task, false), "fast_task/irq_1");
   EXPECT_EQ(replace(HxCCIdentifier(), false), "irq_1/irq_1");
   EXPECT_THAT(messages(), IsEmpty());
+  HxCCIdentifier own("$(Task)/$(ISR):x");
+  names.replaceMultirateTaskISRName(own, task, own, false);
+  EXPECT_EQ(formal(own), "fast_task/__Task____ISR_");
   EXPECT_EQ(replace(task, true), "__Task_/irq_1");
   EXPECT_THAT(messages(),
               ElementsAre("1204/2 The $Task name macro is used in the task "
@@ -189,6 +203,10 @@ TEST_F(MultirateTest, ObjectsAreMadeCIdentifiers) {
     names.replaceMultirateMsgVarName(message, row.form);
     EXPECT_EQ(formal(message), std::string("<") + row.result + ">");
   }
+  HxCCIdentifier unused("none");
+  names.replaceMultirateMsgVarName(unused, "a#$N;");
+  unused.setCookLevel(HxCCIdentifier::eCookLevelFull);
+  EXPECT_TRUE(unused.getDollarNUsed(HxCCIdentifier::eFormalName));
 }
 
 TEST_F(MultirateTest, BaseTimeUnitChangesAtAThousandAndAMillion) {
