@@ -87,6 +87,21 @@ TEST_F(NameEngineTest, ForeignMacrosStayAndAreReported) {
   }
 }
 
+TEST_F(NameEngineTest, MacroLettersCountWithAllTheirBits) {
+  constexpr unsigned short kLowByteIsB = 0x142;
+  const unsigned short units[] = {'$', kLowByteIsB, '$', 0, '$', 'B'};
+  HxCCIdentifier id(KyCXString(units, 6));
+  id.setSourceRef(gain.getSrcRef());
+  const HxCCIdentifier value("v:v");
+  EXPECT_FALSE(names.substAllDollarZByValue(id, KyCXString(units + 4, 1), value,
+                                            HxCNames::eMacroKindAnyCase));
+  names.createNameFromForm(id, nullptr, 0, 0, false);
+  EXPECT_EQ(id.getCookedName(HxCCIdentifier::eFormalName),
+            KyCXString(units, 4) + "Speed_Gain");
+  ASSERT_EQ(messages().size(), 2U);
+  EXPECT_THAT(messages()[0], StartsWith("1203/1 The '$?' name macro"));
+}
+
 TEST_F(NameEngineTest, ContextFollowsTheReferences) {
   HX_BdBlock ivBlock("iv block", gain.getSrcRef());
   HX_BcPartitionContext partitionContext("p");
