@@ -18,9 +18,14 @@
 //   HxCNames names;
 //   if (!names.createNameFromForm(id, nullptr, 0, 0, false)) ...  // not final
 //
-// Values from the model become C identifiers one by one; the whole name does
-// not: the caller applies makeCIdentifier() and adaptSize() as it needs, asks
+// The values of $L, $B, $O, $(Type) and $(BaseType) become C identifiers, all
+// others are written as they are, and the whole name is not made one: the
+// caller applies makeCIdentifier() and adaptSize() as it needs, asks
 // isStringValidCVariableName(), and makes the name distinct.
+//
+// Where the object is missing, '_' and the letter stand for the value ("_B"),
+// "__Type_" and "__BaseType_" for the extended ones; $L, $I and $(Component)
+// then write nothing, and the number of $S is 0 as long as there is an id.
 
 #ifndef NAMING_HXCNAMES_H
 #define NAMING_HXCNAMES_H
@@ -45,7 +50,8 @@ class SC_Model;
 /// A macro bit set has one bit per macro, the eMacro... constants. A macro
 /// whose bit is in `retainedMacros` stays in the name as text, for a later call
 /// to expand; one whose bit is in `provisionalMacros` is expanded, but the name
-/// is not final. Either makes the name incomplete.
+/// is not final. Either makes the name incomplete; with both bits the macro
+/// stays as text. $D alone differs: provisional, it always becomes "_D".
 class HX_UTILS_API HxCNames : public HX_Allocated {
  public:
   enum HxEMacroBitTag : unsigned int {
@@ -92,12 +98,18 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   // --- Templates ---
 
   /// Expands both names of \p id and sets its cook level to 2; an identifier
-  /// that is at level 2 already stays as it is.
+  /// that is at level 2 already stays as it is, but one at level 3 is expanded
+  /// again.
   ///
   /// Block, subsystem, Stateflow object and data dictionary object are those of
-  /// the identifier's references. A template without ':' is expanded once, and
-  /// its actual name is marked changeable. An actual name that follows the
-  /// formal one has "$L used" and its siblings set from the expanded text.
+  /// the identifier's references. $R, $S, and $C of an object mark the name
+  /// changeable, also where $D falls back to them. An actual template that is
+  /// the formal one, with or without "$R" at one end, is not expanded for
+  /// itself: the actual name is a copy of the formal one, changeable if that is
+  /// or if there was an "$R". A template without ':' is such a case. The copy's
+  /// "$L used" and its siblings are what the getters of the formal name answer
+  /// after the expansion, at the level before it: below the threshold whether
+  /// the expanded text still holds the macro.
   ///
   /// Messages, attached to the source reference of \p id or else of its
   /// intermediate-view block, and left out with \p suppressMessages:
@@ -106,10 +118,19 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   ///   assertion instead, in any case;
   /// - 1202 (warning) for a macro that is not expanded here: $P, $V, $v, $F,
   ///   $f, $E and most extended ones;
-  /// - 1203 (warning) for an unknown macro.
-  /// The single-letter ones stay in the name; of an extended macro "$(Name)"
-  /// "__Name_" is left.
-  /// \param type  what $T, $(Type) and $(BaseType) speak of; may be null
+  /// - 1203 (warning) for an unknown macro, also a '$' at the end.
+  /// The single-letter ones stay in the name, an argument as in "$E(a-b)" as a
+  /// C identifier ("$E_a_b_"); of an extended macro "$(Name)" "__Name_" is
+  /// left. From a "$(" without ')' on, the text is copied silently.
+  ///
+  /// $(Component) is the first software component that refers to the variable;
+  /// nothing for an object that is no variable. Its messages are attached to
+  /// the data dictionary reference and never left out: 1209 (warning) if there
+  /// is no reference or no such component, 1210 (error) for each reference of a
+  /// further component.
+  /// \param type  what $T, $(Type) and $(BaseType) speak of; may be null, else
+  ///   HxCGlobal must have a data type server. A type of no known kind raises
+  ///   an internal assertion and writes nothing.
   /// \return false if a macro was retained or provisional
   bool createNameFromForm(HxCCIdentifier& id, HX_DataType* type,
                           unsigned int retainedMacros,
@@ -119,26 +140,31 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   /// Replaces every macro "$" + \p macro in both cooked names of \p id by the
   /// cooked name of \p value of the same type. Extended macros and the argument
   /// of "$E(...)" are never looked into, but \p macro may itself be an extended
-  /// one with its parentheses, "(Task)".
+  /// one with its parentheses, "(Task)". "$$" is copied. An empty \p macro
+  /// matches every '$'. \p value may be \p id.
   ///
-  /// \p id takes over the references of \p value that are not null, and each
-  /// flag of its active name that is true. The macro E or e raises \p id to
-  /// cook level 1; so does a \p value at level 1 if \p id is at level 0.
+  /// Whether or not anything is replaced, \p id takes over the references of
+  /// \p value that are not null, and each flag of its active name that is true;
+  /// and the macro E or e sets \p id to cook level 1, even from a higher one,
+  /// as does a \p value at level 1 if \p id is at level 0. A replaced L, E or N
+  /// in either case sets the "used" flag of that name.
   /// \return whether anything was replaced
   bool substAllDollarZByValue(HxCCIdentifier& id, const KyCXString& macro,
                               const HxCCIdentifier& value,
                               tagMacroKindEnum kind);
 
-  /// Expands the template of a file name: $B, $S, $I, $M, $N and $R, and the
-  /// extended macros; every other single-letter macro stays. Without a source
-  /// reference, and unless \p useModelContext, $B, $S and $I stay as well.
+  /// Expands the template of a file name: $B, $S, $I, $M, $N and $R; every
+  /// other single-letter macro stays, $(Type) and $(BaseType) as well, and the
+  /// other extended ones are treated as in every template. Without a source
+  /// reference, and unless \p useModelContext, $B, $S and $I stay, too.
   /// \return see createNameFromForm()
   bool handleFileNameMacro(HxCCIdentifier& id, bool useModelContext);
 
   /// Substitutes $x (the symbol's text), $f for a function or $v for any other
   /// symbol (its name, $F and $V in upper case) and $t (the short name of its
-  /// type, empty without one), and sets the cook level to 3. In the actual name
-  /// each value is followed by "$R".
+  /// type, empty without one), and sets the cook level to 3. $X and $T count as
+  /// $x and $t. Each value is put in as the template of an identifier: in the
+  /// actual name it is followed by "$R".
   void handleSymbolNameMacro(HxCCIdentifier& id, HxCSymbol* symbol);
 
   // --- Keywords and validity ---
@@ -175,19 +201,25 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   // --- Multirate names ---
   //
   // Each replaces macros in the cooked names of \p id with
-  // substAllDollarZByValue(). Messages are attached to the source reference of
-  // \p id or else to its data dictionary reference.
+  // substAllDollarZByValue(), whatever its cook level, and so takes over the
+  // references and flags of the identifiers given, which may be \p id itself. A
+  // text is put in as the template of an identifier: in the actual name it is
+  // followed by "$R", unless a ':' in it gives the two names apart. Messages
+  // are attached to the source reference of \p id or else to its data
+  // dictionary reference.
 
   /// Replaces the time macros by \p period and \p offset (seconds; of a
-  /// negative offset its amount): "$(Time1ms)", "$(Period10us)",
-  /// "$(Offset1s)"... in a fixed unit, "$(Time)", "$(Period)" and "$(Offset)"
-  /// in the largest exact unit up to the value, with that unit ("10ms"). A time
-  /// is the period and, unless the offset is 0, '_' and the offset.
+  /// negative offset its amount, a period is not negative): "$(Time1ms)",
+  /// "$(Period10us)", "$(Offset1s)"... in a fixed unit, "$(Time)", "$(Period)"
+  /// and "$(Offset)" in the largest exact unit up to the value, with that unit
+  /// ("10ms"). A time is the period and, unless the offset is 0, '_' and the
+  /// offset.
   ///
   /// A value that is not a multiple of the fixed unit is rounded and reported
   /// with message 1206 (warning), one that is no whole number of microseconds
   /// with 1207 (warning), each only where the macro occurs. A count beyond the
-  /// 32-bit range is saturated. If not \p cyclic, every time macro becomes
+  /// 32-bit range is saturated, that of a NaN is the largest one; NaN and the
+  /// infinities are reported. If not \p cyclic, every time macro becomes
   /// "ACYCLIC", and one message 1205 (error) is reported if there was any.
   void replaceMultirateTimeName(HxCCIdentifier& id, double period,
                                 double offset, bool cyclic);
