@@ -254,6 +254,9 @@ TEST(CXStringTest, ChangesOfTheText) {
   EXPECT_EQ(unitsOf(textOf(u"<\u20AC>").filterAngleBrackets()), u"\u20AC");
   EXPECT_EQ(unitsOf(textOf(u"\u20AC \t\u0120").replaceWhiteSpace('.', true)),
             u"\u20AC.\u0120");
+  // A character above 127 is a unit of its own, not a negative number.
+  EXPECT_EQ(unitsOf(textOf(u"\u20AC \t").replaceWhiteSpace('\xB7', false)),
+            u"\u20AC\u00B7\u00B7");
 }
 
 TEST(CXStringTest, NumbersAreWrittenInTheWidthAsked) {
