@@ -1,7 +1,7 @@
 #include "platform/strings/KyCXString.h"
 
 #include <algorithm>
-#include <charconv>
+#include <array>
 #include <cstddef>
 #include <limits>
 #include <string>
@@ -37,20 +37,34 @@ char narrowed(unsigned short unit) {
   return static_cast<char>(unit > 0xFF ? '?' : unit);
 }
 
+// Which characters may stand in a C identifier.
+constexpr auto kIdentifierCharacters = [] {
+  std::array<bool, 256> table{};
+  for (unsigned char c = 'a'; c <= 'z'; ++c) table[c] = table[c - 32] = true;
+  for (unsigned char c = '0'; c <= '9'; ++c) table[c] = true;
+  table['_'] = true;
+  return table;
+}();
+
 // Digits of a magnitude; zeros in front up to the digits of the largest one.
-std::string digits(unsigned long magnitude, unsigned long largest, int base,
-                   bool shortest) {
-  char buffer[24];
-  const auto text = [&](unsigned long value) {
-    char* end = std::to_chars(buffer, buffer + sizeof buffer, value, base).ptr;
-    return std::string(buffer, end);
-  };
-  const std::size_t width = shortest ? 0 : text(largest).size();
-  std::string result = text(magnitude);
-  if (result.size() < width) result.insert(0, width - result.size(), '0');
-  for (char& digit : result) digit = narrowed(upper(widened(digit)));
-  return result;
-}
+struct Digits {
+  Digits(unsigned long magnitude, unsigned long largest, int base,
+         bool shortest) {
+    int width = 1;
+    while (!shortest && (largest /= static_cast<unsigned>(base)) != 0) ++width;
+    do {
+      const auto digit = magnitude % static_cast<unsigned>(base);
+      *--first = "0123456789ABCDEF"[digit];
+      magnitude /= static_cast<unsigned>(base);
+      --width;
+    } while (magnitude != 0 || width > 0);
+  }
+  Digits(const Digits&) = delete;
+  Digits& operator=(const Digits&) = delete;
+
+  char text[24] = {};  // 64 bits have 20 decimal digits
+  char* first = text + sizeof text - 1;
+};
 
 }  // namespace
 
@@ -68,23 +82,25 @@ KyCXString::KyCXString(const unsigned short* units, int length) : KyCXString() {
 
 KyCXString::KyCXString(int value, bool hexadecimal, bool shortest)
     : KyCXString() {
+  constexpr unsigned int kLargestWord =
+      std::numeric_limits<unsigned int>::max();
+  constexpr unsigned int kLargest = std::numeric_limits<int>::max();
   const unsigned int bits = static_cast<unsigned int>(value);
-  if (hexadecimal) {
-    *this = digits(bits, std::numeric_limits<unsigned int>::max(), 16, shortest)
-                .c_str();
-    return;
+  if (value < 0 && !hexadecimal) {
+    *this += '-';
+    *this += Digits(0U - bits, kLargest, 10, shortest).first;
+  } else if (hexadecimal) {
+    *this += Digits(bits, kLargestWord, 16, shortest).first;
+  } else {
+    *this += Digits(bits, kLargest, 10, shortest).first;
   }
-  if (value < 0) *this = "-";
-  *this += digits(value < 0 ? 0U - bits : bits, std::numeric_limits<int>::max(),
-                  10, shortest)
-               .c_str();
 }
 
 KyCXString::KyCXString(unsigned long value, bool hexadecimal, bool shortest)
     : KyCXString() {
-  *this = digits(value, std::numeric_limits<unsigned long>::max(),
-                 hexadecimal ? 16 : 10, shortest)
-              .c_str();
+  *this += Digits(value, std::numeric_limits<unsigned long>::max(),
+                  hexadecimal ? 16 : 10, shortest)
+               .first;
 }
 
 KyCXString::KyCXString(const KyCXString& other) : m_Length(other.m_Length) {
@@ -137,8 +153,7 @@ KyCXString& KyCXString::operator=(const char* text) {
   return *this;
 }
 
-KyCXString& KyCXString::operator+=(const KyCXString& text) {
-  if (m_Length == 0) return *this = text;
+KyCXString& KyCXString::appendText(const KyCXString& text) {
   if (m_Wide == nullptr && text.m_Wide == nullptr)
     appendNarrow(text.m_Text, text.m_Length);
   else
@@ -153,7 +168,7 @@ KyCXString& KyCXString::operator+=(const char* text) {
   return *this;
 }
 
-KyCXString& KyCXString::operator+=(char character) {
+KyCXString& KyCXString::appendCharacter(char character) {
   if (m_Wide != nullptr) return *this += KyCXString(character);
   appendNarrow(&character, 1);
   return *this;
@@ -190,20 +205,25 @@ int KyCXString::find(const KyCXString& text, int from) const {
 int KyCXString::find(char character, int from) const {
   from = std::max(from, 0);
   if (from >= m_Length) return -1;
-  if (m_Wide == nullptr)
-    return static_cast<int>(narrow().find(character, sizeOf(from)));
+  if (m_Wide == nullptr) {
+    const void* found =
+        std::memchr(m_Text + from, character, sizeOf(m_Length - from));
+    if (found == nullptr) return -1;
+    return static_cast<int>(static_cast<const char*>(found) - m_Text);
+  }
   const unsigned short* begin = m_Wide;
   const unsigned short* end = begin + m_Length;
   const auto* found = std::find(begin + from, end, widened(character));
   return found == end ? -1 : static_cast<int>(found - begin);
 }
 
-bool KyCXString::startsWith(const KyCXString& text) const {
-  if (text.m_Length > m_Length) return false;
+bool KyCXString::matchesWholeAt(int position, const KyCXString& text) const {
+  if (position < 0 || position > m_Length - text.m_Length) return false;
   if (m_Wide == nullptr)
-    return text.m_Wide == nullptr && narrow().starts_with(text.narrow());
+    return text.m_Wide == nullptr && std::memcmp(m_Text + position, text.m_Text,
+                                                 sizeOf(text.m_Length)) == 0;
   for (int i = 0; i < text.m_Length; ++i)
-    if (m_Wide[i] != text[i]) return false;
+    if (m_Wide[position + i] != text[i]) return false;
   return true;
 }
 
@@ -298,6 +318,7 @@ KyCXString& KyCXString::replace(const KyCXString& what, const KyCXString& by) {
 }
 
 KyCXString& KyCXString::makeCIdentifier(bool collapse) {
+  if (isValidCIdentifier()) return *this;
   changeUnits([collapse](auto begin, auto end) {
     auto* out = begin;
     bool inRun = false;
@@ -320,13 +341,12 @@ KyCXString& KyCXString::makeCIdentifier(bool collapse) {
 bool KyCXString::isValidCIdentifier() const {
   if (isEmpty() || m_Wide != nullptr || isDigit((*this)[0])) return false;
   return std::all_of(m_Text, m_Text + m_Length, [](char character) {
-    return isValidForCIdentifier(widened(character));
+    return kIdentifierCharacters[static_cast<unsigned char>(character)];
   });
 }
 
 bool KyCXString::isValidForCIdentifier(const unsigned short& unit) {
-  return unit == '_' || isDigit(unit) ||
-         (upper(unit) >= 'A' && upper(unit) <= 'Z');
+  return unit < kIdentifierCharacters.size() && kIdentifierCharacters[unit];
 }
 
 KyCXString& KyCXString::shortenString(int maxLength, int fillCount, char fill,
@@ -417,17 +437,16 @@ void KyCXString::assignUnits(const unsigned short* units, int length) {
   delete[] std::exchange(m_Wide, kept);
 }
 
-// \p text may lie inside this object.
+// \p text may lie inside this object, before its end.
 void KyCXString::appendNarrow(const char* text, int length) {
   const int total = m_Length + length;
-  if (total > m_Capacity && text >= m_Text && text <= m_Text + m_Length) {
-    const std::ptrdiff_t offset = text - m_Text;
+  if (total > m_Capacity) {
+    const bool isOwn = text >= m_Text && text <= m_Text + m_Length;
+    const std::ptrdiff_t offset = isOwn ? text - m_Text : 0;
     makeRoom(total);
-    text = m_Text + offset;
-  } else {
-    makeRoom(total);
+    if (isOwn) text = m_Text + offset;
   }
-  std::memmove(m_Text + m_Length, text, sizeOf(length));
+  std::memcpy(m_Text + m_Length, text, sizeOf(length));
   setLength(total);
 }
 

@@ -14,6 +14,7 @@
 #ifndef PLATFORM_STRINGS_KYCXSTRING_H
 #define PLATFORM_STRINGS_KYCXSTRING_H
 
+#include <cstddef>
 #include <cstring>
 #include <string_view>
 
@@ -70,9 +71,29 @@ class HX_PLATFORM_API KyCXString {
   /// Never null; valid until the next change of this object.
   const char* cstring() const { return m_Text; }
 
-  KyCXString& operator+=(const KyCXString& text);
+  KyCXString& operator+=(const KyCXString& text) {
+    const int room = m_Capacity - m_Length;
+    if (m_Wide != nullptr || text.m_Wide != nullptr || text.m_Length > room)
+      return appendText(text);
+    std::memcpy(m_Text + m_Length, text.m_Text,
+                static_cast<std::size_t>(text.m_Length));
+    m_Length += text.m_Length;
+    m_Text[m_Length] = 0;
+    return *this;
+  }
   KyCXString& operator+=(const char* text);
-  KyCXString& operator+=(char character);
+  KyCXString& operator+=(char character) {
+    if (m_Wide != nullptr || m_Length == m_Capacity)
+      return appendCharacter(character);
+    m_Text[m_Length++] = character;
+    m_Text[m_Length] = 0;
+    return *this;
+  }
+  /// Appends one unit.
+  KyCXString& appendUnit(unsigned short unit) {
+    if (unit > 0xFF) return appendText(KyCXString(&unit, 1));
+    return *this += static_cast<char>(unit);
+  }
   /// Appends what sub() of \p text would give, without the copy.
   KyCXString& appendSub(const KyCXString& text, int from, int to);
 
@@ -82,7 +103,12 @@ class HX_PLATFORM_API KyCXString {
   int find(const KyCXString& text, int from = 0) const;
   int find(char character, int from = 0) const;
   bool contains(const KyCXString& text) const { return find(text, 0) >= 0; }
-  bool startsWith(const KyCXString& text) const;
+  bool startsWith(const KyCXString& text) const { return matchesAt(0, text); }
+  /// True if \p text stands at \p position, which may lie outside the text.
+  bool matchesAt(int position, const KyCXString& text) const {
+    if (!text.isEmpty() && (*this)[position] != text[0]) return false;
+    return matchesWholeAt(position, text);
+  }
 
   /// The units from \p from to \p to, both included; of a range that reaches
   /// outside the text the part inside it, empty if there is none.
@@ -157,7 +183,10 @@ class HX_PLATFORM_API KyCXString {
 
   bool ownsMemory() const { return m_Text != m_Inline || m_Wide != nullptr; }
   void release();
+  bool matchesWholeAt(int position, const KyCXString& text) const;
   void makeRoom(int capacity);
+  KyCXString& appendCharacter(char character);
+  KyCXString& appendText(const KyCXString& text);
   void assignNarrow(const char* text, int length);
   void assignUnits(const unsigned short* units, int length);
   void appendNarrow(const char* text, int length);

@@ -11,6 +11,12 @@ void shorten(KyCXString& name) {
                      KyCXString::ePositionMiddle);
 }
 
+bool containsMacro(const KyCXString& text, char letter) {
+  for (int at = text.find('$'); at >= 0; at = text.find('$', at + 1))
+    if (text[at + 1] == letter) return true;
+  return false;
+}
+
 }  // namespace
 
 HxCCIdentifier::HxCCIdentifier(const KyCXString& name) { setName(name); }
@@ -78,19 +84,19 @@ void HxCCIdentifier::adaptSize() {
 bool HxCCIdentifier::getDollarLUsed(HxENameTypeTag type) const {
   const Name& found = name(type);
   return m_CookLevel >= eCookLevelFull ? found.dollarLUsed
-                                       : found.cooked.contains("$L");
+                                       : containsMacro(found.cooked, 'L');
 }
 
 bool HxCCIdentifier::getDollarEUsed(HxENameTypeTag type) const {
   const Name& found = name(type);
   return m_CookLevel >= eCookLevelDollarE ? found.dollarEUsed
-                                          : found.cooked.contains("$E");
+                                          : containsMacro(found.cooked, 'E');
 }
 
 bool HxCCIdentifier::getDollarNUsed(HxENameTypeTag type) const {
   const Name& found = name(type);
   return m_CookLevel >= eCookLevelFull ? found.dollarNUsed
-                                       : found.cooked.contains("$N");
+                                       : containsMacro(found.cooked, 'N');
 }
 
 bool operator==(const HxCCIdentifier& a, const HxCCIdentifier& b) {

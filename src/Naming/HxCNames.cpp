@@ -103,11 +103,11 @@ void HxCNames::deriveContext(HxCCIdentifier& id, Context& context) {
   if (context.srcRef == nullptr && context.ivBlock != nullptr)
     context.srcRef = context.ivBlock->getSrcRef();
   context.reportRef = context.srcRef;
-  getRootDollarI(context.systemId);
   if (context.srcRef != nullptr) {
     enterBlock(context);
     enterStateflowObject(context);
   }
+  if (!context.hasSystemId) getRootDollarI(context.systemId);
   const HxCSrcRef* ddRef = id.getDdSourceRef();
   if (ddRef != nullptr && ddRef->isDd() != nullptr)
     HX_DataDictionary::getObjectName(ddRef->isDd()->getDdHandle(),
@@ -124,7 +124,7 @@ void HxCNames::enterBlock(Context& context) {
     blockRef = context.srcRef->isBlock();
   }
   context.block = blockRef->getBlock();
-  context.systemId = *context.block->getSubsystemId();
+  context.setSystemId(*context.block->getSubsystemId());
   HX_StateflowBlock* chartBlock = context.block->isStateflowBlock();
   if (chartBlock != nullptr && chartBlock->getChartState() != nullptr)
     context.srcRef = chartBlock->getChartState()->getStateflowSrcRef();
@@ -137,9 +137,9 @@ void HxCNames::enterStateflowObject(Context& context) {
   context.block = context.sfObject->getContainingBlock();
   const SC_State* chartState = SC_ModelAccess::getChartState(context.sfObject);
   if (chartState != nullptr)
-    context.systemId = chartState->getChart()->getSubsystemId();
+    context.setSystemId(chartState->getChart()->getSubsystemId());
   else if (context.block != nullptr)
-    context.systemId = *context.block->getSubsystemId();
+    context.setSystemId(*context.block->getSubsystemId());
 }
 
 void HxCNames::getRootDollarI(KyCXString& systemId) {
@@ -166,15 +166,16 @@ KyCXString HxCNames::templateOf(const HxCCIdentifier& id,
 }
 
 void HxCNames::scanTemplate(Scan& scan) {
-  while (scan.pos < scan.form.length()) {
-    const int dollar = scan.form.find('$', scan.pos);
-    if (dollar < 0) {
-      scan.result.appendSub(scan.form, scan.pos, scan.form.length() - 1);
-      return;
+  const KyCXString& form = scan.form;
+  while (scan.pos < form.length()) {
+    const unsigned short unit = form[scan.pos];
+    if (unit != '$') {
+      // Text between macros is short: unit by unit is the fastest way.
+      scan.result.appendUnit(unit);
+      ++scan.pos;
+      continue;
     }
-    scan.result.appendSub(scan.form, scan.pos, dollar - 1);
-    scan.pos = dollar;
-    const unsigned short letter = scan.form[dollar + 1];
+    const unsigned short letter = form[scan.pos + 1];
     if (const MacroRow* row = findMacro(letter))
       scan.pos += row->expand(scan);
     else

@@ -14,6 +14,10 @@ constexpr int kMacroLength = 2;  // '$' and the letter
 KyCXString number(int value) { return KyCXString(value, false, true); }
 
 void appendAsCIdentifier(KyCXString& result, const KyCXString& text) {
+  if (text.isValidCIdentifier()) {
+    result += text;
+    return;
+  }
   KyCXString name(text);
   result += name.makeCIdentifier(false);
 }
@@ -43,7 +47,7 @@ int HxCNames::evaluateLabelMacro(KyCXString& result,
   KyCXString text(label);
   text.trim(true, true).filterAngleBrackets().trim(true, true);
   if (!text.isEmpty())
-    result += text.makeCIdentifier(false);
+    appendAsCIdentifier(result, text);
   else if (block != nullptr)
     appendAsCIdentifier(result, block->getName());
   return kMacroLength;

@@ -13,10 +13,16 @@ struct HxCNames::Context {
   const HxCSrcRef* reportRef = nullptr;  ///< the reference before any move
   HX_Block* block = nullptr;
   SC_Model* sfObject = nullptr;
-  KyCXString systemId;
+  KyCXString systemId;  ///< of the block or chart, else of the root
   KyCXString ddName;
   HX_BdBlock* ivBlock = nullptr;
-  bool changeable = false;  ///< set by $R, $S and $C
+  bool changeable = false;   ///< set by $R, $S and $C
+  bool hasSystemId = false;  ///< a block or chart has set it, maybe to empty
+
+  void setSystemId(const KyCXString& id) {
+    systemId = id;
+    hasSystemId = true;
+  }
 };
 
 /// The state of the scan of one template.

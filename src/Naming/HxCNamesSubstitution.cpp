@@ -15,6 +15,43 @@ constexpr unsigned int kModelObjectMacros = HxCNames::eMacroBlockName |
                                             HxCNames::eMacroSystemNumber |
                                             HxCNames::eMacroSystemId;
 
+enum class Match { eNone, eValue, eUpper };
+
+// A macro name in the forms in which it is looked for.
+class MacroKey {
+ public:
+  MacroKey(const KyCXString& macro, HxCNames::tagMacroKindEnum kind)
+      : m_Kind(kind), m_pLower(&macro) {
+    if (kind == HxCNames::eMacroKindExact) return;
+    m_Lower = macro;
+    m_Lower.toLower();
+    m_pLower = &m_Lower;
+    if (kind == HxCNames::eMacroKindCaseSelectsValue) {
+      m_Upper = macro;
+      m_Upper.toUpper();
+    }
+  }
+
+  MacroKey(const MacroKey&) = delete;
+  MacroKey& operator=(const MacroKey&) = delete;
+
+  Match match(const KyCXString& text, int position) const {
+    if (m_Kind == HxCNames::eMacroKindAnyCase) {
+      KyCXString found = text.sub(position, position + m_pLower->length() - 1);
+      return found.toLower() == *m_pLower ? Match::eValue : Match::eNone;
+    }
+    if (text.matchesAt(position, *m_pLower)) return Match::eValue;
+    if (m_Kind == HxCNames::eMacroKindExact) return Match::eNone;
+    return text.matchesAt(position, m_Upper) ? Match::eUpper : Match::eNone;
+  }
+
+ private:
+  HxCNames::tagMacroKindEnum m_Kind;
+  const KyCXString* m_pLower;  // the macro itself where case matters
+  KyCXString m_Lower;
+  KyCXString m_Upper;  // only where upper case selects the value
+};
+
 bool isLetter(const KyCXString& macro, char upper) {
   return macro.length() == 1 && (macro[0] == upper || macro[0] == upper + 32);
 }
@@ -48,6 +85,7 @@ bool HxCNames::substAllDollarZByValue(HxCCIdentifier& id,
   if (value.getCookLevel() == HxCCIdentifier::eCookLevelDollarE &&
       id.getCookLevel() == HxCCIdentifier::eCookLevelRaw)
     id.setCookLevel(HxCCIdentifier::eCookLevelDollarE);
+  takeOver(id, value);
   const bool inActual = substAllDollarZByValue(id, macro, value, kind,
                                                HxCCIdentifier::eActualName);
   const bool inFormal = substAllDollarZByValue(id, macro, value, kind,
@@ -59,39 +97,28 @@ bool HxCNames::substAllDollarZByValue(HxCCIdentifier& id,
                                       const KyCXString& macro,
                                       const HxCCIdentifier& value,
                                       tagMacroKindEnum kind, NameType type) {
-  takeOver(id, value);
   const KyCXString& source = id.getCookedName(type);
   int dollar = source.find('$');
   if (dollar < 0) return false;
 
-  KyCXString lowerKey(macro);
-  KyCXString upperKey(macro);
-  if (kind != eMacroKindExact) {
-    lowerKey.toLower();
-    upperKey.toUpper();
-  }
+  const MacroKey key(macro, kind);
+  const KyCXString& replacement = value.getCookedName(type);
   KyCXString result;
   int copied = 0;  // the source is taken over up to here
   bool replaced = false;
-  while (dollar >= 0) {
-    KyCXString key = source.sub(dollar + 1, dollar + macro.length());
-    if (kind == eMacroKindAnyCase) key.toLower();
-    const bool isLower = key == lowerKey;
-    int next = 0;
-    if (isLower || key == upperKey) {
-      result.appendSub(source, copied, dollar - 1);
-      if (!isLower && kind == eMacroKindCaseSelectsValue) {
-        KyCXString upper(value.getCookedName(type));
-        result += upper.toUpper();
-      } else {
-        result += value.getCookedName(type);
-      }
-      next = copied = dollar + macro.length() + 1;
-      replaced = true;
-    } else {
+  for (int next = 0; dollar >= 0; dollar = source.find('$', next)) {
+    const Match match = key.match(source, dollar + 1);
+    if (match == Match::eNone) {
       next = endOfForeignMacro(source, dollar);
+      continue;
     }
-    dollar = source.find('$', next);
+    result.appendSub(source, copied, dollar - 1);
+    if (match == Match::eUpper)
+      result += KyCXString(replacement).toUpper();
+    else
+      result += replacement;
+    next = copied = dollar + macro.length() + 1;
+    replaced = true;
   }
   if (!replaced) return false;
   result.appendSub(source, copied, source.length() - 1);
