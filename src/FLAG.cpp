@@ -24,31 +24,37 @@ const char* nameOf(const FLAG_flag_info& row) {
   return STR_IsNullOrEmpty(row.flagName) ? "<unknown flag name>" : row.flagName;
 }
 
-void reportConflict(int row, unsigned int conflicts, int rowCount,
-                    const FLAG_flag_info* rows, const char* suffix) {
+struct Conflict {
+  int row;             // rowOfFlag()
+  unsigned int flags;  // those of the field that conflict; 0 without a row
+};
+
+Conflict findConflict(unsigned int field, unsigned int flag, int rowCount,
+                      const FLAG_flag_info* rows) {
+  const int row = rowOfFlag(flag, rowCount);
+  return {row, row < 0 ? 0 : field & rows[row].excludedFlags};
+}
+
+std::string describe(const Conflict& conflict, int rowCount,
+                     const FLAG_flag_info* rows, const char* suffix) {
   std::string report = "Flag conflict found ! Flag ";
-  report += nameOf(rows[row]);
+  report += nameOf(rows[conflict.row]);
   report += " excludes flag(s): ";
-  for (; conflicts != 0; conflicts &= conflicts - 1) {
+  for (unsigned int conflicts = conflict.flags; conflicts != 0;
+       conflicts &= conflicts - 1) {
     const int other = rowOfFlag(FLAG_GetIthFlag(conflicts, 1), rowCount);
     if (other < 0) continue;
     report += nameOf(rows[other]);
     report += ' ';
   }
   report += suffix;
-  ERR_Msg1292(report.c_str());
+  return report;
 }
 
-// The flags of field that conflict with flag, which are reported; row receives
-// rowOfFlag().
-unsigned int findConflict(const unsigned int* field, unsigned int flag,
-                          int rowCount, const FLAG_flag_info* rows, int& row,
-                          const char* suffix) {
-  row = rowOfFlag(flag, rowCount);
-  if (row < 0) return 0;
-  const unsigned int conflicts = *field & rows[row].excludedFlags;
-  if (conflicts != 0) reportConflict(row, conflicts, rowCount, rows, suffix);
-  return conflicts;
+void report(const Conflict& conflict, int rowCount, const FLAG_flag_info* rows,
+            const char* suffix) {
+  if (conflict.flags == 0) return;
+  ERR_Msg1292(describe(conflict, rowCount, rows, suffix).c_str());
 }
 
 }  // namespace
@@ -64,32 +70,36 @@ unsigned int* FLAG_NewField() {
   return field;
 }
 
+// NOLINTNEXTLINE(readability-non-const-parameter): see FLAG.h
 unsigned int* FLAG_DupFlagField(unsigned int* field) {
   unsigned int* copy = FLAG_NewField();
   if (copy != nullptr) *copy = *field;
   return copy;
 }
 
+// NOLINTNEXTLINE(readability-non-const-parameter): see FLAG.h
 int FLAG_CheckFlag(unsigned int* field, unsigned int flag, int rowCount,
                    const FLAG_flag_info* rows) {
-  int row = 0;
-  return static_cast<int>(findConflict(field, flag, rowCount, rows, row, ""));
+  const Conflict conflict = findConflict(*field, flag, rowCount, rows);
+  report(conflict, rowCount, rows, "");
+  return static_cast<int>(conflict.flags);
 }
 
 int FLAG_SaveSetFlag(unsigned int* field, unsigned int flag, int rowCount,
                      const FLAG_flag_info* rows) {
-  int row = 0;
-  const unsigned int conflicts =
-      findConflict(field, flag, rowCount, rows, row, ". Didn't set flag.");
-  if (row >= 0 && conflicts == 0) *field |= flag;
-  return static_cast<int>(conflicts);
+  const Conflict conflict = findConflict(*field, flag, rowCount, rows);
+  report(conflict, rowCount, rows, ". Didn't set flag.");
+  if (conflict.row >= 0 && conflict.flags == 0) *field |= flag;
+  return static_cast<int>(conflict.flags);
 }
 
 void FLAG_ForceSetFlag(unsigned int* field, unsigned int flag, int rowCount,
                        const FLAG_flag_info* rows) {
   *field |= flag;
-  int row = 0;
-  if (findConflict(field, flag, rowCount, rows, row,
-                   ". Clearing bad flag(s).") != 0)
-    *field &= ~flag;
+  const Conflict conflict = findConflict(*field, flag, rowCount, rows);
+  if (conflict.flags == 0) return;
+  const std::string text =
+      describe(conflict, rowCount, rows, ". Clearing bad flag(s).");
+  *field &= ~flag;  // before the report: who receives it may read the field
+  ERR_Msg1292(text.c_str());
 }

@@ -46,6 +46,9 @@ inline bool isFlagField(const unsigned int* field,
 
 }  // namespace hx_detail
 
+// A field is an unsigned int* in every signature, also where it is only read:
+// NOLINTBEGIN(readability-non-const-parameter)
+
 /// A new field without flags, owned by the caller: a block of the memory
 /// controller, which must be installed. Null, after the assertion of
 /// FLAG_ClearAll(), if there is no memory.
@@ -127,10 +130,12 @@ HX_UTILS_API int FLAG_CheckFlag(unsigned int* field, unsigned int flag,
 HX_UTILS_API int FLAG_SaveSetFlag(unsigned int* field, unsigned int flag,
                                   int rowCount, const FLAG_flag_info* rows);
 
-/// Sets \p flag; if it then conflicts, reports that and clears \p flag again,
-/// even one that had been set before the call. A flag whose row is missing
+/// Sets \p flag; if it then conflicts, clears \p flag again, even one that had
+/// been set before the call, and reports that. A flag whose row is missing
 /// stays set. A row that excludes its own flag conflicts always.
 HX_UTILS_API void FLAG_ForceSetFlag(unsigned int* field, unsigned int flag,
                                     int rowCount, const FLAG_flag_info* rows);
+
+// NOLINTEND(readability-non-const-parameter)
 
 #endif  // FLAG_H

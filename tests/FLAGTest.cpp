@@ -1,5 +1,6 @@
 #include "FLAG.h"
 
+#include "platform/messages/HX_MessageHandler.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -123,8 +124,13 @@ TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
     EXPECT_EQ(field, row.saved);
     expectMessages(". Didn't set flag.");
     field = row.held;
+    unsigned int seen = row.forced;  // by who receives the report
+    HX_MessageHandler::instance().setSink(
+        [&](const HX_Message&) { seen = field; });
     FLAG_ForceSetFlag(&field, row.flag, 4, kRows);
+    HX_MessageHandler::instance().setSink({});
     EXPECT_EQ(field, row.forced);
+    EXPECT_EQ(seen, row.forced);
     expectMessages(". Clearing bad flag(s).");
   }
 }
