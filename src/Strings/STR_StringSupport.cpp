@@ -11,6 +11,8 @@
 
 namespace {
 
+constexpr int kDefaultPrecision = 6;  // of printf
+
 char* allocate(std::size_t size) {
   return static_cast<char*>(
       pHXMemory->allocMemBlock(static_cast<unsigned long>(size)));
@@ -82,11 +84,15 @@ char* STR_IntToString(int value) {
 }
 
 char* STR_DoubleToString(double value, int precision) {
-  const int length = std::snprintf(nullptr, 0, "%.*f", precision, value);
+  const int digits = precision < 0 ? kDefaultPrecision : precision;
+  const int length = std::snprintf(nullptr, 0, "%.*f", digits, value);
   if (length < 0) return nullptr;  // more than INT_MAX characters
-  const std::size_t size = static_cast<std::size_t>(length) + 1;
-  char* result = allocate(size);
-  if (result != nullptr) std::snprintf(result, size, "%.*f", precision, value);
+  char* result = allocate(static_cast<std::size_t>(length) + 1);
+  if (result == nullptr) return nullptr;
+  // Not printf(), which would write the decimal point of the locale.
+  *std::to_chars(result, result + length, value, std::chars_format::fixed,
+                 digits)
+       .ptr = 0;
   return result;
 }
 

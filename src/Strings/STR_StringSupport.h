@@ -42,8 +42,9 @@ HX_UTILS_API char* STR_ConcatenateNStrings(const char* first, ...);
 HX_UTILS_API char* STR_IntToString(int value);
 
 /// Decimal with \p precision digits after the point, no point for 0, rounded as
-/// printf does; a negative precision counts as 6. The infinities and NaN read
-/// "inf", "-inf", "nan" and "-nan". Every finite value is written out in full.
+/// printf does, whatever the locale; a negative precision counts as 6. The
+/// infinities and NaN read "inf", "-inf", "nan" and "-nan". Every finite value
+/// is written out in full.
 HX_UTILS_API char* STR_DoubleToString(double value, int precision);
 
 /// A copy of \p s; null for null.

@@ -1,7 +1,8 @@
 #include "Strings/STR_StringSupport.h"
 
 #include <climits>
-#include <cmath>
+#include <clocale>
+#include <cstdio>
 #include <cstring>
 #include <limits>
 
@@ -56,11 +57,20 @@ TEST_F(StringSupportTest, NumbersAreWrittenInFull) {
               {9.996, 2, "10.00"},
               {0.5, -1, "0.500000"},
               {4294967296.0, 1, "4294967296.0"}};
+  // A locale with a decimal comma must not show; skipped where none is there.
+  std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
   for (const auto& row : rows)
     EXPECT_EQ(taken(STR_DoubleToString(row.value, row.precision)), row.text);
-  EXPECT_EQ(taken(STR_DoubleToString(std::nan(""), 3)), "nan");
-  const double largest = std::numeric_limits<double>::max();
-  EXPECT_EQ(taken(STR_DoubleToString(-largest, 2)).size(), 1U + 309 + 3);
+  std::setlocale(LC_NUMERIC, "C");
+
+  using Limits = std::numeric_limits<double>;
+  for (double value : {Limits::max(), -Limits::min(), -Limits::infinity(),
+                       Limits::quiet_NaN(), -Limits::quiet_NaN(), 2.5, 1e22})
+    for (int precision : {0, 1, 17, 1080}) {
+      char expected[1500];
+      std::snprintf(expected, sizeof expected, "%.*f", precision, value);
+      EXPECT_EQ(taken(STR_DoubleToString(value, precision)), expected);
+    }
 }
 
 TEST_F(StringSupportTest, EqualityKnowsNullAndAsciiCase) {
