@@ -81,7 +81,8 @@ class HX_UTILS_API HxCDebugServer : public HX_Allocated {
   /// 0 for a value outside the enumeration.
   std::int64_t getCounter(ScEDebugCounter counter) const;
 
-  /// Starts and counts an interval; ignored while the clock is running.
+  /// Starts and counts an interval; ignored while the clock is running. Where
+  /// the raw time is 0, the start is counted but the clock does not run.
   void clockStart(ScEDebugClock clock);
   /// Ends the interval; ignored while the clock is not running.
   void clockStop(ScEDebugClock clock);

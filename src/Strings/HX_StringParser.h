@@ -27,10 +27,12 @@ class HX_UTILS_API HX_StringParser : public HX_Allocated {
   /// \p keys the last one receives the value; of equal keys in \p str the last
   /// value counts. An empty separator counts as one that does not occur.
   /// \param[out] values  one slot per key; the slot of a key that does not
-  ///   occur keeps what it held, and is empty if it is new.
+  ///   occur keeps what it held, and is empty if it is new. No other argument
+  ///   may be one of its texts.
   /// \return the last item (or, of a pair, its key) that was not recognised, in
-  ///   lower case and without surrounding white space; empty if there was none.
-  ///   An item that is all white space does not count.
+  ///   lower case and without surrounding white space (a key: blanks); empty
+  ///   if there was none or if it was a pair without a key. An item that is all
+  ///   white space does not count.
   KyCXString parseKeyValuePairs(const KyCXString& str,
                                 const KyCXString& keyValueSep,
                                 const KyCXString& pairSep,

@@ -29,9 +29,11 @@ class HX_UTILS_API HX_BuildNumber : public HX_Allocated {
   /// \p isFirstKind, otherwise ".B" and the build counter, and nothing for a
   /// release.
   /// \param buildDate  as __DATE__ gives it, "Mmm dd yyyy" with a blank for a
-  ///     leading 0 of the day; stored as year-month-day. A text that is not of
-  ///     three or four parts (the second empty) is stored as it is, an unknown
-  ///     month name stays.
+  ///     leading 0 of the day; stored as year-month-day. The text is divided at
+  ///     each blank: of three parts, the first is the month, then come day and
+  ///     year; of four the second, whatever it holds, is skipped and the day
+  ///     gets a leading 0. A text of any other number of parts is stored as it
+  ///     is, an unknown month name stays.
   /// \return true
   bool definedBuildNumber(int majorVersion, int minorVersion, int thirdNumber,
                           int buildCounter, const KyCXString& buildId,

@@ -3,8 +3,8 @@
 //   HX_SystemCall system;
 //   const double start = system.getTimeStamp();
 //   ...
-//   const double seconds = system.getDeltaTimeInSec(start,
-//   system.getTimeStamp());
+//   const double end = system.getTimeStamp();
+//   const double seconds = system.getDeltaTimeInSec(start, end);
 
 #ifndef SYSTEMSERVICES_HX_SYSTEMCALL_H
 #define SYSTEMSERVICES_HX_SYSTEMCALL_H

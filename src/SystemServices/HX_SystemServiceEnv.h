@@ -11,7 +11,8 @@ class HX_SystemFileIo;
 
 /// Owns the services until they are released or it is destroyed. Copies share
 /// the services: all but one of them must give them up with disown() before
-/// they are destroyed.
+/// they are destroyed or the services released. Assignment forgets the target's
+/// own services without releasing them.
 class HX_UTILS_API HX_SystemServiceEnv : public HX_Allocated {
  public:
   HX_SystemServiceEnv() = default;

@@ -36,6 +36,7 @@ TEST(StringParserTest, PairsFillTheSlotsOfTheirKeys) {
       {"a=1;Bogus=2;Flag", "=", ";", "a", "1,", "flag"},
       {"flag; Bogus =2", "=", ";", "a", "-,", "bogus"},
       {"x;\t ;", "=", ";", "a", "-,", "x"},  // white space is no item
+      {"x; =5", "=", ";", "a", "-,", ""},    // an empty key is
       {"a=1;a=2", "=", ";", "a", "2,", ""},
       {"a=1", "=", ";", "A,a,b", "-,1,-,", ""},  // the last of equal keys
       {"a->1 AND b->2", "->", "and", "a,b", "1,2,", ""},

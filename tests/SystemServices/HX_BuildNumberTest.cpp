@@ -52,6 +52,7 @@ TEST_F(BuildNumberTest, BuildDateTakesStandardForm) {
       {"Xyz 14 2007", "2007-Xyz-14"},   {"mar  4 2007", "2007-mar-04"},
       {"2007-03-14", "2007-03-14"},     {"Mar 2007", "Mar 2007"},
       {"Mar   4 2007", "Mar   4 2007"}, {"", ""},
+      {"Mar 14 2007 ", "-03-02007"},    {" 4 2007", "2007--4"},
   };
   for (const auto& [date, standard] : cases) {
     HX_BuildNumber build;
