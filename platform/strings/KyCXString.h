@@ -71,6 +71,10 @@ class HX_PLATFORM_API KyCXString {
   /// Never null; valid until the next change of this object.
   const char* cstring() const { return m_Text; }
 
+  /// Makes room for \p length units below 256, so that appending up to there
+  /// asks for no more memory. The text stays.
+  void reserve(int length) { makeRoom(length); }
+
   KyCXString& operator+=(const KyCXString& text) {
     const int room = m_Capacity - m_Length;
     if (m_Wide != nullptr || text.m_Wide != nullptr || text.m_Length > room)

@@ -1,5 +1,7 @@
 #include "Naming/HxCCIdentifier.h"
 
+#include <utility>
+
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
 #include "platform/model/HxCSymbol.h"
@@ -57,6 +59,10 @@ bool HxCCIdentifier::setName(const KyCXString& name) {
 void HxCCIdentifier::setCookedName(const KyCXString& name,
                                    HxENameTypeTag type) {
   this->name(type).cooked = name;
+}
+
+void HxCCIdentifier::setCookedName(KyCXString&& name, HxENameTypeTag type) {
+  this->name(type).cooked = std::move(name);
 }
 
 void HxCCIdentifier::addPrefix(const KyCXString& prefix) {

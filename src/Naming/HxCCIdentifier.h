@@ -65,6 +65,7 @@ class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
   }
   /// The raw name stays.
   void setCookedName(const KyCXString& name, HxENameTypeTag type);
+  void setCookedName(KyCXString&& name, HxENameTypeTag type);
 
   /// Puts the text before, or after, all four names.
   void addPrefix(const KyCXString& prefix);

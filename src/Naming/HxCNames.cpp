@@ -3,6 +3,7 @@
 #include "Naming/HxCNames.h"
 
 #include <array>
+#include <utility>
 
 #include "Control/ERR_Messages.h"
 #include "Control/HX_SelfCheck.h"
@@ -23,6 +24,8 @@
 namespace {
 
 constexpr char kErrorCode[] = __FILE__ "_";
+
+constexpr int kLongForm = 40;
 
 enum class Follows { eNo, eAsIs, eChangeable };
 
@@ -87,14 +90,18 @@ void HxCNames::createSingleNameFromForm(HxCCIdentifier& id, HX_DataType* type,
                                         unsigned int retainedMacros,
                                         unsigned int provisionalMacros,
                                         bool suppressMessages) {
+  Context context;
+  deriveContext(id, context);
+  const KyCXString& cooked = id.getCookedName(kActive);
+  const KyCXString standIn =
+      cooked.isEmpty() ? standInForm(context, suppressMessages) : KyCXString();
+  const KyCXString& form = cooked.isEmpty() ? standIn : cooked;
   Scan scan{
-      *this, id, type, retainedMacros, provisionalMacros, suppressMessages,
-      {},    {}, {}};
-  deriveContext(id, scan.context);
-  scan.form = templateOf(id, scan.context, suppressMessages);
+      *this,   id,   type, retainedMacros, provisionalMacros, suppressMessages,
+      context, form, {}};
   scanTemplate(scan);
-  id.setCookedName(scan.result, kActive);
-  if (scan.context.changeable) id.setIdentifierChangeable(true, kActive);
+  id.setCookedName(std::move(scan.result), kActive);
+  if (context.changeable) id.setIdentifierChangeable(true, kActive);
 }
 
 void HxCNames::deriveContext(HxCCIdentifier& id, Context& context) {
@@ -153,11 +160,9 @@ void HxCNames::getRootDollarI(KyCXString& systemId) {
     systemId = HxCGlobal::getOptions()->getHxSystemID();
 }
 
-// The cooked active name, or what stands in for an empty one.
-KyCXString HxCNames::templateOf(const HxCCIdentifier& id,
-                                const Context& context, bool suppressMessages) {
-  const KyCXString& form = id.getCookedName(kActive);
-  if (!form.isEmpty()) return form;
+// What stands in for an empty template.
+KyCXString HxCNames::standInForm(const Context& context,
+                                 bool suppressMessages) {
   if (HX_Assert(context.reportRef != nullptr, kErrorCode) && !suppressMessages)
     ERR_Msg503(context.reportRef);
   const bool forStateflow =
@@ -167,6 +172,8 @@ KyCXString HxCNames::templateOf(const HxCCIdentifier& id,
 
 void HxCNames::scanTemplate(Scan& scan) {
   const KyCXString& form = scan.form;
+  // Where the template does not fit into a text object, neither will the name.
+  if (form.length() >= kLongForm) scan.result.reserve(2 * form.length());
   while (scan.pos < form.length()) {
     const unsigned short unit = form[scan.pos];
     if (unit != '$') {

@@ -264,8 +264,7 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   void deriveContext(HxCCIdentifier& id, Context& context);
   static void enterBlock(Context& context);
   static void enterStateflowObject(Context& context);
-  static KyCXString templateOf(const HxCCIdentifier& id, const Context& context,
-                               bool suppressMessages);
+  static KyCXString standInForm(const Context& context, bool suppressMessages);
   void scanTemplate(Scan& scan);
   static const MacroRow* findMacro(unsigned short letter);
   int expandDollarD(Scan& scan);
@@ -329,8 +328,9 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   static KyCXString baseTypeName(HX_DataType* scalar);
   int evaluateExtendedNameMacro(KyCXString& result, unsigned int retainedMacros,
                                 unsigned int provisionalMacros,
-                                KyCXString& form, int pos, HxCCIdentifier& id,
-                                HX_DataType* type, const HxCSrcRef* srcRef,
+                                const KyCXString& form, int pos,
+                                HxCCIdentifier& id, HX_DataType* type,
+                                const HxCSrcRef* srcRef,
                                 const HxCSrcRef* reportRef,
                                 bool suppressMessages);
   void evaluateComponentMacro(KyCXString& result, unsigned int retainedMacros,

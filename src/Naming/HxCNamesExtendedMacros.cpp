@@ -155,7 +155,7 @@ void searchComponent(unsigned long handle, const KyCXString& variable,
 
 int HxCNames::evaluateExtendedNameMacro(
     KyCXString& result, unsigned int retainedMacros,
-    unsigned int provisionalMacros, KyCXString& form, int pos,
+    unsigned int provisionalMacros, const KyCXString& form, int pos,
     HxCCIdentifier& id, HX_DataType* type, const HxCSrcRef*,
     const HxCSrcRef* reportRef, bool suppressMessages) {
   constexpr int kFrame = 3;  // '$' and both parentheses

@@ -33,8 +33,8 @@ struct HxCNames::Scan {
   unsigned int retained;
   unsigned int provisional;
   bool suppressMessages;
-  Context context;
-  KyCXString form;  ///< the template
+  Context& context;
+  const KyCXString& form;  ///< the template
   KyCXString result;
   int pos = 0;
 };

@@ -1,6 +1,7 @@
 
 
 #include "Naming/HX_NamingFixture.h"
+#include "support/HX_HeapCount.h"
 
 namespace {
 
@@ -210,12 +211,18 @@ TEST_F(NameEngineTest, OnlyLevelTwoIsLeftAlone) {
   EXPECT_TRUE(names.createNameFromForm(id, nullptr, 0, 0, false));
 }
 
-TEST_F(NameEngineTest, ANameAsksForNoMemory) {
-  HxCCIdentifier id = identifier("$S_$B", gain.getSrcRef());
+TEST_F(NameEngineTest, ANameAsksForMemoryOnceAtMost) {
+  gain.getSrcRef();  // made on demand
   HX_CountingController controller;
-  names.createNameFromForm(id, nullptr, 0, 0, false);
-  EXPECT_EQ(formal(id), "Sa3_Speed_Gain");
-  EXPECT_EQ(controller.allocated(), 0);
+  for (const char* longPart : {"", "_and_a_text_longer_than_a_name_may_be"}) {
+    const std::string form = std::string("$S_$B_$M_$N_$O") + longPart;
+    HxCCIdentifier id = identifier(form.c_str(), gain.getSrcRef());
+    const int before = HX_HeapBlocks();
+    names.createNameFromForm(id, nullptr, 0, 0, false);
+    const int blocks = HX_HeapBlocks() - before;
+    EXPECT_LE(blocks, *longPart == 0 ? 0 : 2) << "for both names";
+    EXPECT_EQ(controller.allocated(), 0);
+  }
 }
 
 }  // namespace

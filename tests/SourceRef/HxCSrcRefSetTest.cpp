@@ -2,9 +2,7 @@
 
 #include <algorithm>
 #include <array>
-#include <cstdlib>
 #include <memory>
-#include <new>
 #include <random>
 
 #include "SourceRef/HxCDdSrcRef.h"
@@ -16,25 +14,8 @@
 #include "platform/model/HX_Block.h"
 #include "platform/model/HX_BlockDataBase.h"
 #include "platform/model/HX_InputBlockId.h"
+#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
-
-namespace {
-
-int s_heapBlocks = 0;  // asked for by new in the whole program
-
-}  // namespace
-
-[[gnu::noinline]] void* operator new(std::size_t size) {
-  ++s_heapBlocks;
-  if (void* block = std::malloc(size)) return block;
-  throw std::bad_alloc();
-}
-[[gnu::noinline]] void operator delete(void* block) noexcept {
-  std::free(block);
-}
-[[gnu::noinline]] void operator delete(void* block, std::size_t) noexcept {
-  std::free(block);
-}
 
 namespace {
 
@@ -127,7 +108,7 @@ TEST_F(SrcRefSetTest, OneReferenceNeedsNoMemoryTheSecondDoes) {
   const HxCSrcRef a;
   const HxCSrcRef b;
   HX_CountingController controller;
-  const int before = s_heapBlocks;
+  const int before = HX_HeapBlocks();
   HxCSrcRefSet set;
   set.addSrcRef(nullptr);
   set.addSrcRef(&a);
@@ -141,10 +122,10 @@ TEST_F(SrcRefSetTest, OneReferenceNeedsNoMemoryTheSecondDoes) {
   int visits = 0;
   copy.forEach([&](const HxCSrcRef*) { ++visits; });
   EXPECT_EQ(visits, 1);
-  EXPECT_EQ(s_heapBlocks, before);
+  EXPECT_EQ(HX_HeapBlocks(), before);
   EXPECT_EQ(controller.allocated(), 0);
   copy.addSrcRef(&b);
-  EXPECT_GT(s_heapBlocks, before);
+  EXPECT_GT(HX_HeapBlocks(), before);
   delete copy.createIterator();
   EXPECT_EQ(controller.allocated(), 1);  // an iterator is the library's own
   EXPECT_EQ(controller.liveBlocks(), 0);
