@@ -17,7 +17,11 @@
 /// Holds no data. No operation reports a message. Letter case is that of ASCII.
 class HX_UTILS_API HX_StringParser : public HX_Allocated {
  public:
-  enum remove_etp { eRemoveLeading = 0, eRemoveTrailing = 1, eRemoveBoth = 2 };
+  enum remove_etp : int {
+    eRemoveLeading = 0,
+    eRemoveTrailing = 1,
+    eRemoveBoth = 2
+  };
 
   /// Reads pairs such as "Name = Foo ; SIZE=3" for a list of known \p keys.
   ///

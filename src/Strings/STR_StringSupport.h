@@ -14,12 +14,13 @@
 
 #include "HX_Export.h"
 
-enum STR_case_sensitive_etp {
+// With a fixed type, so that values outside the enumerations are defined.
+enum STR_case_sensitive_etp : int {
   STR_CASE_SENSITIVE = 0,
   STR_CASE_INSENSITIVE = 1  ///< 'A' to 'Z' equal 'a' to 'z'; no other letter
 };
 
-enum STR_process_mode_tp {
+enum STR_process_mode_tp : int {
   STR_WHITESPACE_TO_BLANK = 0,
   STR_WHITESPACE_TO_UNDERSCORE = 1,
   STR_INVALID_TO_UNDERSCORE = 2

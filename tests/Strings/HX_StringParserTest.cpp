@@ -8,18 +8,18 @@ TEST(StringParserTest, RemoveCharsTrimsTheChosenEnds) {
   const struct {
     const char* text;
     const char* chars;
-    const char* trimmed[4];  // leading, trailing, both, unknown mode
+    const char* trimmed[4];  // leading, trailing, both, unknown modes
   } rows[] = {{"  ab  ", " ", {"ab  ", "  ab", "ab", "  ab  "}},
               {"xxx", "x", {"", "", "", "xxx"}},
               {"", "x", {"", "", "", ""}},
               {"xyaxyx", "yx", {"axyx", "xya", "a", "xyaxyx"}},
               {"aba", "", {"aba", "aba", "aba", "aba"}}};
   for (const auto& row : rows)
-    for (int mode = 0; mode < 4; ++mode)
+    for (int mode : {0, 1, 2, 3, 4, -1})
       EXPECT_EQ(HX_StringParser().removeChars(
                     row.text, row.chars,
                     static_cast<HX_StringParser::remove_etp>(mode)),
-                row.trimmed[mode])
+                row.trimmed[mode < 0 || mode > 3 ? 3 : mode])
           << row.text << " in mode " << mode;
 }
 

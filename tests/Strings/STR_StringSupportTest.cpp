@@ -87,8 +87,10 @@ TEST_F(StringSupportTest, EqualityKnowsNullAndAsciiCase) {
   for (const auto& row : rows) {
     SCOPED_TRACE(row.a == nullptr ? "(null)" : row.a);
     EXPECT_EQ(STR_StringsAreEqual(row.a, row.b, STR_CASE_SENSITIVE), row.equal);
-    EXPECT_EQ(STR_StringsAreEqual(row.a, row.b, STR_CASE_INSENSITIVE),
-              row.equalWithoutCase);
+    for (int mode : {1, 2, -1, INT_MAX})
+      EXPECT_EQ(STR_StringsAreEqual(row.a, row.b,
+                                    static_cast<STR_case_sensitive_etp>(mode)),
+                row.equalWithoutCase);
   }
   EXPECT_TRUE(STR_IsNullOrEmpty(nullptr));
   EXPECT_TRUE(STR_IsNullOrEmpty(""));
@@ -115,7 +117,7 @@ TEST_F(StringSupportTest, EachByteIsValidOrReplaced) {
     EXPECT_EQ(processed(STR_INVALID_TO_UNDERSCORE), isValid ? ch : '_');
     EXPECT_EQ(processed(STR_WHITESPACE_TO_UNDERSCORE), isWhite ? '_' : ch);
     EXPECT_EQ(processed(STR_WHITESPACE_TO_BLANK), isWhite ? ' ' : ch);
-    EXPECT_EQ(processed(3), isWhite ? ' ' : ch);
+    for (int mode : {3, -1}) EXPECT_EQ(processed(mode), isWhite ? ' ' : ch);
   }
 }
 
