@@ -20,7 +20,7 @@ HX_UTILS_API void* HX_Allocate(std::size_t size) noexcept;
 HX_UTILS_API void HX_Free(void* block) noexcept;
 
 /// Empty base class. A failed allocation makes the new expression null, no
-/// constructor runs and nothing is thrown.
+/// constructor runs and nothing is thrown. Arrays are left to the global new.
 class HX_Allocated {
  public:
   static void* operator new(std::size_t size) noexcept {

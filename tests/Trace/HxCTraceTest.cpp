@@ -127,6 +127,14 @@ TEST_F(TraceTest, ControlReportsOnlyWithBothSwitchesOn) {
                                       "unknown!]"),
                     testing::EndsWith("'y.cpp', Line: 7 Reason: late]")));
   }
+  for (bool develops : {true, false}) {
+    HxCControl::setFallThrough(!develops);
+    develops ? HxCControl::setDevelopBehaviour()
+             : HxCControl::setProductionCodeBehaviour();
+    clearMessages();
+    control.traceFallThrough();
+    EXPECT_EQ(messages().size(), develops ? 1U : 0U);
+  }
 }
 
 TEST_F(TraceTest, TraceFileAppendsExactRecords) {
