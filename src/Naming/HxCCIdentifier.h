@@ -26,14 +26,14 @@ class HxCSrcRef;
 class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
  public:
   /// Selects one of the two names. Any other value addresses the actual name.
-  enum HxENameTypeTag {
+  enum HxENameTypeTag : int {
     eActiveName = 0,  ///< the formal name while it is active, else the actual
     eActualName = 1,
     eFormalName = 2
   };
 
   /// How far the identifier has been expanded.
-  enum HxECookLevelTag {
+  enum HxECookLevelTag : int {
     eCookLevelRaw = 0,      ///< nothing expanded
     eCookLevelDollarE = 1,  ///< $E substituted
     eCookLevelFull = 2,     ///< both templates expanded

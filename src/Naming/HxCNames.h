@@ -72,7 +72,7 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   };
 
   /// How substAllDollarZByValue() matches a macro name.
-  enum tagMacroKindEnum {
+  enum tagMacroKindEnum : int {
     eMacroKindExact = 0,    ///< as written
     eMacroKindAnyCase = 1,  ///< in any mix of upper and lower case
     /// all in lower case: by the value; all in upper case: by the value in
@@ -81,14 +81,14 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   };
 
   /// The kind of a word in the keyword dictionary.
-  enum tagHxEDictEntryType {
+  enum tagHxEDictEntryType : int {
     eDictCKeyword = 0,      ///< message 408 when used as an identifier
     eDictBaseTypeName = 1,  ///< message 409
     eDictUserTypeName = 2   ///< message 410
   };
 
   /// The base time unit of the operating system.
-  enum tagHxEOsekTimeBase { eOsekTimeBaseUs = 1, eOsekTimeBaseMs = 4 };
+  enum tagHxEOsekTimeBase : int { eOsekTimeBaseUs = 1, eOsekTimeBaseMs = 4 };
 
   HxCNames() = default;
   HxCNames(const HxCNames&) = default;
