@@ -1,0 +1,88 @@
+#include "host/HX_Profile.h"
+
+#include <algorithm>
+#include <fstream>
+#include <nlohmann/json.hpp>
+
+#include "Trace/HxCTransformationTracer.h"
+#include "host/HX_Version.h"
+#include "platform/matlab/HX_MexInterface.h"
+
+namespace fs = std::filesystem;
+
+namespace {
+
+constexpr char kTransformations[] = "HX_Transformations.txt";
+
+}  // namespace
+
+HX_Profile::HX_Profile(const std::string& folder)
+    : m_IsOn(!folder.empty()), m_Start(fs::current_path()) {
+  if (!m_IsOn) return;
+  fs::create_directories(folder);
+  fs::current_path(folder);
+  fs::remove(kTransformations);  // the tracer appends, as the protocol does
+  fs::remove("HX_DebugProtocol.txt");
+  HX_SetCommandWindow([](const char*) {});
+  HxCTransformationTracer::boot(kTransformations);
+  m_Server.boot();
+  HX_TimingListener::install(this);
+}
+
+HX_Profile::~HX_Profile() {
+  HX_TimingListener::install(nullptr);
+  HxCTransformationTracer::shutdown();
+  m_Server.shutdown();
+}
+
+void HX_Profile::setModel(const std::string& name) {
+  if (!m_IsOn) return;
+  HX_BuildNumber build = HX_BuildOfProgram();
+  std::string text = name;  // the server takes a text that it could change
+  m_Server.setModelInfo(&build, text.data());
+  m_Server.logModelInfo();
+}
+
+void HX_Profile::note(const std::string& text) {
+  char format[] = "%s";
+  if (m_IsOn) m_Server.protocolEntry(format, text.c_str());
+}
+
+void HX_Profile::finish() {
+  if (!m_IsOn) return;
+  m_Server.printCurrentResults("Results");
+  HX_StopWatch::endStopWatches();
+  HxCTransformationTracer::shutdown();
+
+  std::int64_t origin = 0;
+  for (const Event& event : m_Events)
+    origin = origin == 0 ? event.start : std::min(origin, event.start);
+  nlohmann::ordered_json events = nlohmann::ordered_json::array();
+  for (const Event& event : m_Events)
+    events.push_back({{"name", event.name},
+                      {"ph", "X"},
+                      {"ts", event.start - origin},
+                      {"dur", event.duration},
+                      {"pid", 1},
+                      {"tid", 1}});
+  std::ofstream("HX_Trace.json", std::ios::binary)
+      << nlohmann::ordered_json{{"traceEvents", events}}.dump(1) << '\n';
+}
+
+void HX_Profile::runEnded(const char* name, std::int64_t start,
+                          std::int64_t duration) {
+  // A phase is both a run time and, around it, a stop watch: shown once.
+  if (!m_Events.empty() && m_Events.back().name == name) m_Events.pop_back();
+  m_Events.push_back({name, start, duration});
+}
+
+HX_Profile::Phase::Phase(HX_Profile& profile, const char* name)
+    : m_Profile(profile), m_Watch(profile.m_Watches.emplace_back(name)) {
+  m_Watch.start();
+  if (m_Profile.m_IsOn) m_Profile.m_Server.runTimeStart(name);
+}
+
+HX_Profile::Phase::~Phase() {
+  if (m_Profile.m_IsOn) m_Profile.m_Server.runTimeEnd(m_Watch.getName());
+  m_Watch.stop();
+}

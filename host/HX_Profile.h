@@ -1,0 +1,76 @@
+// What took how long in a run, and the files that tell it.
+//
+//   HX_Profile profile("profile");   // "" measures, but writes nothing
+//   {
+//     HX_Profile::Phase phase(profile, "Form names");
+//     ...
+//   }
+//   profile.finish();
+
+#ifndef HOST_HX_PROFILE_H
+#define HOST_HX_PROFILE_H
+
+#include <cstdint>
+#include <filesystem>
+#include <list>
+#include <string>
+#include <vector>
+
+#include "Diagnostics/HX_StopWatch.h"
+#include "Diagnostics/HX_TimingListener.h"
+#include "Diagnostics/HxCDebugServer.h"
+
+/// One per process. With a folder it makes that folder the working directory,
+/// where the library's servers write their files: HX_StopWatch.html,
+/// HX_DebugLog.txt, HX_DebugProtocol.txt and HX_Transformations.txt. Beside
+/// them stands HX_Trace.json, complete events of the trace-event format, in
+/// microseconds.
+class HX_Profile : private HX_TimingListener {
+ public:
+  /// Throws std::filesystem::filesystem_error for a folder that cannot be made
+  /// or entered.
+  explicit HX_Profile(const std::string& folder);
+  HX_Profile(const HX_Profile&) = delete;
+  HX_Profile& operator=(const HX_Profile&) = delete;
+  ~HX_Profile() override;
+
+  /// The working directory at the start, where the user's paths count from.
+  const std::filesystem::path& start() const { return m_Start; }
+
+  void setModel(const std::string& name);
+  /// A line of the protocol.
+  void note(const std::string& text);
+  /// Writes what the servers still hold.
+  void finish();
+
+  /// Measures while it lives.
+  class Phase {
+   public:
+    Phase(HX_Profile& profile, const char* name);
+    Phase(const Phase&) = delete;
+    Phase& operator=(const Phase&) = delete;
+    ~Phase();
+
+   private:
+    HX_Profile& m_Profile;
+    HX_StopWatch& m_Watch;
+  };
+
+ private:
+  struct Event {
+    std::string name;
+    std::int64_t start;     // microseconds
+    std::int64_t duration;  // microseconds
+  };
+
+  void runEnded(const char* name, std::int64_t start,
+                std::int64_t duration) override;
+
+  bool m_IsOn;
+  std::filesystem::path m_Start;
+  HxCDebugServer m_Server;
+  std::list<HX_StopWatch> m_Watches;  // stay registered until the report
+  std::vector<Event> m_Events;
+};
+
+#endif  // HOST_HX_PROFILE_H
