@@ -5,8 +5,8 @@
 //   sorting.setSortingCriteriaAndInit(criteria);
 //   for (HxCDepSortNode* node : all) sorting.add(node);
 //   sorting.addDependency(element, structure);   // the element comes first
-//   if (!sorting.sort()) return false;           // a cycle, reported to the
-//   user for (HxCDepSortNode* node : sorting.getNodes()) emit(node);
+//   if (!sorting.sort()) return false;           // a cycle, and reported
+//   for (HxCDepSortNode* node : sorting.getNodes()) emit(node);
 //
 // The order depends only on the calls, the names and the criteria:
 //
