@@ -19,6 +19,11 @@
 
 #include "Control/HX_Allocated.h"
 
+/// The product with the golden ratio; its upper bits are the well-spread ones.
+inline unsigned HX_SpreadKey(int key) {
+  return static_cast<unsigned>(key) * 0x9E3779B1U;
+}
+
 /// Not copied: a table belongs to one owner. A key may be added repeatedly,
 /// with different values; a match tells them apart.
 template <class Value>
@@ -97,9 +102,7 @@ class HX_KeyTable {
 
  private:
   unsigned capacity() const { return m_Slots == nullptr ? 0 : m_Mask + 1; }
-  unsigned placeOf(int key) const {
-    return (static_cast<unsigned>(key) * 0x9E3779B1U) >> m_Shift;
-  }
+  unsigned placeOf(int key) const { return HX_SpreadKey(key) >> m_Shift; }
   Slot* freeSlotFor(int key) {
     unsigned at = placeOf(key);
     while (m_Slots[at].uses != 0) at = (at + 1) & m_Mask;

@@ -21,6 +21,7 @@
 #include <type_traits>
 
 #include "Control/HX_Allocated.h"
+#include "NameSpace/HX_KeyFilter.h"
 #include "NameSpace/HX_KeyTable.h"
 #include "NameSpace/HX_PlainArray.h"
 
@@ -109,6 +110,7 @@ class HxCObjectEnvironment : public HX_Allocated {
   // The definitions of a key in all scopes below, while counted. A count
   // travels up only along parents that list their child.
   HX_KeyTable<Nothing> m_Below;
+  HX_KeyFilter m_BelowFilter;
   int m_Level = 0;  // listing parents above
   bool m_IsListedByParent = false;
   bool m_HasExactCounts = true;  // false here: false in all listing parents
@@ -192,7 +194,9 @@ bool HxCObjectEnvironment<T>::searchAround(int key, T& value) const {
 template <class T>
 bool HxCObjectEnvironment<T>::searchBelow(int key, Wanted wanted,
                                           T& value) const {
-  if (isCounted() && m_Below.find(key) == nullptr) return false;
+  if (isCounted() &&
+      (!m_BelowFilter.mayHold(key) || m_Below.find(key) == nullptr))
+    return false;
   for (const Child& child : m_Children) {
     if (const auto* slot = child.scope->m_Entries.find(key)) {
       value = slot->value;
@@ -223,6 +227,7 @@ bool HxCObjectEnvironment<T>::changeCount(int key, int change) {
   if (slot == nullptr) {
     if ((slot = m_Below.add(key, Nothing{})) == nullptr) return false;
     slot->uses = static_cast<unsigned>(change);
+    m_BelowFilter.noteAdded(key, m_Below);
     return true;
   }
   const unsigned uses = slot->uses + static_cast<unsigned>(change);

@@ -1,5 +1,6 @@
 #include "NameSpace/HxCNameSpace.h"
 
+#include <algorithm>
 #include <deque>
 #include <map>
 #include <random>
@@ -152,14 +153,16 @@ struct ForestCase {
   unsigned irregular;  // per cent of the scopes listed elsewhere or not at all
   unsigned chain;      // per cent of the scopes put into the latest one
   unsigned failing;    // per cent of the allocations
+  unsigned names;      // from which those of a scope are drawn
 };
 
 const ForestCase kForestCases[] = {
-    {"trees", 3000, 0, 0, 0},
-    {"nested deeper than the counts reach", 1500, 0, 90, 0},
-    {"children that are not of their parent", 2000, 15, 20, 0},
-    {"some listed late, many not at all", 1500, 60, 40, 0},
-    {"running out of memory", 3000, 0, 40, 10},
+    {"trees", 3000, 0, 0, 0, 300},
+    {"nested deeper than the counts reach", 1500, 0, 90, 0, 300},
+    {"children that are not of their parent", 2000, 15, 20, 0, 300},
+    {"some listed late, many not at all", 1500, 60, 40, 0, 300},
+    {"running out of memory", 3000, 0, 40, 10, 300},
+    {"so many names that a filter forms", 6000, 0, 0, 0, 3000},
 };
 
 // Grows a forest and the plain one side by side.
@@ -188,7 +191,10 @@ class Forest {
   }
 
   void compare() {
-    const std::size_t at = random(m_Plain.size());
+    // Half of them from the outermost scopes, which know the most names.
+    const std::size_t at =
+        random(random(2) == 0 ? m_Plain.size()
+                              : std::min<std::size_t>(m_Plain.size(), 8));
     const int key = randomKey();
     SCOPED_TRACE(testing::Message() << "scope " << at << " key " << key);
     const PlainScope& plain = m_Plain[at];
@@ -207,8 +213,9 @@ class Forest {
   std::size_t random(std::size_t bound) { return m_Random() % bound; }
   // Some common to many scopes, most not; negative ones too.
   int randomKey() {
-    return random(2) == 0 ? static_cast<int>(random(4)) - 2
-                          : static_cast<int>(random(300)) * 1024 - 100000;
+    return random(2) == 0
+               ? static_cast<int>(random(4)) - 2
+               : static_cast<int>(random(m_Row.names)) * 1024 - 100000;
   }
   std::size_t randomParent() {
     return random(100) < m_Row.chain ? m_Plain.size() - 1
