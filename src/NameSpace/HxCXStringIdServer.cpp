@@ -20,7 +20,9 @@ bool HxCXStringIdServer::boot() {
 
 bool HxCXStringIdServer::shutdown() {
   if (m_pTable == nullptr) return true;
-  m_pTable->index.forEach([](const auto& slot) { HX_Free(slot.value); });
+  // In the order in which they lie in memory, as far as it goes: in that of the
+  // index, giving them back took a fifth of the time.
+  for (Entry* entry : m_pTable->entries) HX_Free(entry);
   HX_Free(m_pTable->nearTexts);
   delete m_pTable;
   m_pTable = nullptr;
@@ -83,6 +85,10 @@ HxCXStringIdServer::Entry* HxCXStringIdServer::add(int hash, const char* text,
   unsigned& arrivals = m_pTable->buckets[number].arrivals;
   Entry* entry = newEntry(number + arrivals * kBucketCount, text, length);
   if (entry == nullptr) return nullptr;
+  if (!m_pTable->entries.append(entry)) {
+    HX_Free(entry);
+    return nullptr;
+  }
   auto* slot = m_pTable->index.add(hash, entry);
   if (slot != nullptr &&
       keepText(static_cast<unsigned>(entry->id), entry->text())) {
@@ -90,6 +96,7 @@ HxCXStringIdServer::Entry* HxCXStringIdServer::add(int hash, const char* text,
     return entry;
   }
   if (slot != nullptr) m_pTable->index.erase(slot);
+  m_pTable->entries.dropLast();
   HX_Free(entry);
   return nullptr;
 }

@@ -87,7 +87,8 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
   };
 
   struct Table : HX_Allocated {
-    HX_KeyTable<Entry*> index;  // by the hash of the text
+    HX_KeyTable<Entry*> index;      // by the hash of the text
+    HX_PlainArray<Entry*> entries;  // in the order of arrival; owned
     Bucket buckets[kBucketCount];
     // The text of each id below nearSize, null for ids not handed out. Where
     // the buckets fill evenly, nearly all ids are near.
