@@ -22,13 +22,11 @@ namespace {
 using SrcRefs = std::vector<const HxCSrcRef*>;
 using IteratorPtr = std::unique_ptr<HX_Iterator<const HxCSrcRef*>>;
 
-void expectThrowsMinusOne(const HX_Iterator<const HxCSrcRef*>& it) {
-  try {
-    it.currentItem();
-    ADD_FAILURE() << "nothing thrown";
-  } catch (int thrown) {
-    EXPECT_EQ(thrown, -1);
-  }
+int thrownBy(const HX_Iterator<const HxCSrcRef*>& it) try {
+  it.currentItem();
+  return 0;
+} catch (int thrown) {
+  return thrown;
 }
 
 // Compares all that a set tells with the plain form.
@@ -45,14 +43,9 @@ void expectHolds(const HxCSrcRefSet& set, const SrcRefs& expected) {
     EXPECT_EQ(walked, expected);
     it->next();
     EXPECT_TRUE(it->isDone());
-    expectThrowsMinusOne(*it);
+    EXPECT_EQ(thrownBy(*it), -1);
     it->first();
   }
-}
-
-void addPlain(SrcRefs& plain, const HxCSrcRef* ref) {
-  if (ref != nullptr && std::count(plain.begin(), plain.end(), ref) == 0)
-    plain.push_back(ref);
 }
 
 class SrcRefSetTest : public HX_TestFixture {
@@ -72,34 +65,29 @@ TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
     const std::size_t from = random() % sets.size();
     const std::size_t ref = random() % (refs.size() + 1);
     const HxCSrcRef* srcRef = ref < refs.size() ? &refs[ref] : nullptr;
-    switch (random() % 8) {
-      case 0:
-        sets[to].clear();
-        plains[to].clear();
-        break;
-      case 1:
-        sets[to] = sets[from];
-        plains[to] = plains[from];
-        break;
-      case 2:
-        sets[to] = srcRef;
-        plains[to].clear();
-        addPlain(plains[to], srcRef);
-        break;
-      case 3:
-        expectHolds(HxCSrcRefSet(sets[from]), plains[from]);
-        break;
-      case 4: {
-        sets[to].addSrcRef(sets[from]);
-        const SrcRefs added = plains[from];
-        for (const HxCSrcRef* r : added) addPlain(plains[to], r);
-        break;
-      }
-      default:
-        sets[to].addSrcRef(srcRef);
-        addPlain(plains[to], srcRef);
+    const unsigned action = random() % 8;
+    SrcRefs added{srcRef};
+    if (action == 0) {
+      sets[to].clear();
+      added.clear();
+    } else if (action == 1) {
+      sets[to] = srcRef;
+    } else if (action == 2) {
+      sets[to] = sets[from];
+      added = plains[from];
+    } else if (action == 3) {
+      sets[to].addSrcRef(sets[from]);
+      added = plains[from];
+    } else {
+      sets[to].addSrcRef(srcRef);
     }
-    expectHolds(sets[to], plains[to]);
+    SrcRefs& plain = plains[to];
+    if (action < 3) plain.clear();
+    for (const HxCSrcRef* r : added)
+      if (r != nullptr && std::count(plain.begin(), plain.end(), r) == 0)
+        plain.push_back(r);
+    expectHolds(sets[to], plain);
+    expectHolds(HxCSrcRefSet(sets[from]), plains[from]);
     ASSERT_FALSE(HasFailure()) << "step " << step;
   }
 }
@@ -110,10 +98,8 @@ TEST_F(SrcRefSetTest, OneReferenceNeedsNoMemoryTheSecondDoes) {
   HX_CountingController controller;
   const int before = HX_HeapBlocks();
   HxCSrcRefSet set;
-  set.addSrcRef(nullptr);
-  set.addSrcRef(&a);
-  set.addSrcRef(&a);
-  set.addSrcRef(nullptr);
+  for (const HxCSrcRef* ref : {static_cast<const HxCSrcRef*>(nullptr), &a, &a})
+    set.addSrcRef(ref);
   HxCSrcRefSet copy(set);
   copy.addSrcRef(set);
   copy = set;
@@ -171,7 +157,6 @@ TEST_F(SrcRefSetTest, ServerSortsTheReferencesOfASet) {
     std::array<const HxCSrcRef*, 3> found;  // block, dd, other
   } rows[] = {
       {{}, {nullptr, nullptr, nullptr}},
-      {{b}, {b, nullptr, nullptr}},
       {{b, &dd1, &internal}, {b, &dd1, &internal}},
       {{&dd1, &dd2, &internal, &plain}, {nullptr, &dd2, &plain}},
       {{b, &input}, {&input, nullptr, nullptr}},
@@ -184,14 +169,13 @@ TEST_F(SrcRefSetTest, ServerSortsTheReferencesOfASet) {
     for (unsigned wanted = 0; wanted < 8; ++wanted) {
       std::array<const HxCSrcRef*, 3> found{&plain, &plain, &plain};
       std::array<const HxCSrcRef*, 3> expected = found;
-      const HxCSrcRef** places[3] = {};
-      for (unsigned i = 0; i < 3; ++i) {
-        if ((wanted >> i & 1) == 0) continue;
-        places[i] = &found[i];
+      const auto place = [&](unsigned i) -> const HxCSrcRef** {
+        if ((wanted >> i & 1) == 0) return nullptr;
         expected[i] = row.found[i];
-      }
-      EXPECT_EQ(HxCSrcRefServer::getSpecificSrcRefFromSet(given, places[0],
-                                                          places[1], places[2]),
+        return &found[i];
+      };
+      EXPECT_EQ(HxCSrcRefServer::getSpecificSrcRefFromSet(given, place(0),
+                                                          place(1), place(2)),
                 0);
       EXPECT_EQ(found, expected);
     }

@@ -1,6 +1,5 @@
 #include "SourceRef/HxCSrcRef.h"
 
-#include <functional>
 #include <limits>
 #include <memory>
 #include <sstream>
@@ -22,7 +21,6 @@
 
 namespace {
 
-using testing::ElementsAre;
 using SrcRefPtr = std::unique_ptr<HxCSrcRef>;
 
 std::string textOf(const HxCSrcRef& ref, const char* before = "abc") {
@@ -45,33 +43,37 @@ std::string kindsOf(const HxCSrcRef& ref) {
   return kinds;
 }
 
-struct ClassRow {
-  const char* name;
-  const HxCSrcRef* original;
-  std::function<HxCSrcRef*()> copy;
-  std::function<const HxCSrcRef*()> assignToOther;
-  const char* kinds;
-  const char* text;  // after toString() on "abc"
-  bool copyKeepsId;
-  bool cloneKeepsId;
-  const char* cloneKinds;
-  const char* cloneText;
-};
+template <class T>
+HxCSrcRef* copyOf(const T& ref) {
+  return new T(ref);
+}
+HxCSrcRef* copyOf(const HxCBlockSrcRef& ref) {
+  return HX_Block::dupSrcRef(ref);
+}
+
+// What a clone has of its original: all, all but the number, the number only.
+enum class CloneHas { eAll, eNewId, eIdOnly };
 
 template <class T>
-ClassRow row(const char* name, const T& original, T& other, const char* kinds,
-             const char* text, bool cloneKeepsId, const char* cloneKinds,
-             const char* cloneText) {
-  return {name,
-          &original,
-          [&] { return new T(original); },
-          [&] { return &(other = original); },
-          kinds,
-          text,
-          true,
-          cloneKeepsId,
-          cloneKinds,
-          cloneText};
+void expectRules(const T& original, T& other, const char* kinds,
+                 const char* text, CloneHas has, bool copyKeepsId = true) {
+  SCOPED_TRACE(kinds);
+  const int id = original.getSrcRefId();
+  const auto expectLooks = [&](const HxCSrcRef& ref, bool isPlain, int refId) {
+    EXPECT_EQ(kindsOf(ref), isPlain ? "s" : kinds);
+    EXPECT_EQ(textOf(ref), isPlain ? "abcUnknown source" : text);
+    EXPECT_EQ(ref.getSrcRefId(), refId);
+  };
+  expectLooks(original, false, id);
+  const int next = HxCSrcRef().getSrcRefId() + 1;
+  expectLooks(*SrcRefPtr(copyOf(original)), false, copyKeepsId ? id : next);
+  const int afterCopy = HxCSrcRef().getSrcRefId() + 1;
+  EXPECT_EQ(afterCopy, next + (copyKeepsId ? 1 : 2));
+  const HxCSrcRef& base = original;
+  expectLooks(*SrcRefPtr(base.clone()), has == CloneHas::eIdOnly,
+              has == CloneHas::eNewId ? afterCopy : id);
+  other = original;
+  expectLooks(other, false, id);
 }
 
 class SrcRefTest : public HX_TestFixture {
@@ -93,62 +95,26 @@ class SrcRefTest : public HX_TestFixture {
 };
 
 TEST_F(SrcRefTest, EachClassHasItsKindTextAndNumberRules) {
-  const HxCSrcRef plain;
-  HxCSrcRef otherPlain;
-  const HxCInternalSrcRef internal("x.cpp", 12, "bad index");
-  HxCInternalSrcRef otherInternal;
-  const HxCDdSrcRef dd(HX_DdTree::instance().add("//DD0/Pool/Ctrl/speed"));
-  HxCDdSrcRef otherDd;
+  HxCSrcRef plain;
+  expectRules(HxCSrcRef(), plain, "s", "abcUnknown source", CloneHas::eAll);
+  HxCInternalSrcRef internal;
+  expectRules(HxCInternalSrcRef("x.cpp", 12, "bad index"), internal, "si",
+              "Internal: Module: 'x.cpp', Line: 12 Reason: bad index",
+              CloneHas::eIdOnly);
+  HxCDdSrcRef dd;
+  expectRules(HxCDdSrcRef(HX_DdTree::instance().add("//DD0/Pool/Ctrl/speed")),
+              dd, "sd", "//DD0/Pool/Ctrl/speed", CloneHas::eAll);
   m_State.setSFName("Chart/Idle");
-  HxCStateflowSrcRef otherState;
+  HxCStateflowSrcRef state;
+  expectRules(*m_State.getStateflowSrcRef(), state, "sc", "Chart/Idle",
+              CloneHas::eNewId);
   HX_BlockDataBase blocks;
-  const HX_InputBlockId id(blocks, 7);
-  const HX_InputBlockId otherId(blocks, 8);
-  const HxCInputBlockSrcRef input(id);
-  HxCInputBlockSrcRef otherInput(otherId);
+  const HX_InputBlockId id(blocks, 7), otherId(blocks, 8);
+  HxCInputBlockSrcRef input(otherId);
+  expectRules(HxCInputBlockSrcRef(id), input, "sn", "abc", CloneHas::eNewId);
   const HX_Block other("other");
-  const HxCBlockSrcRef& block = blockRef(m_Gain);
-
-  const char* const internalText =
-      "Internal: Module: 'x.cpp', Line: 12 Reason: bad index";
-  const ClassRow rows[] = {
-      row("plain", plain, otherPlain, "s", "abcUnknown source", true, "s",
-          "abcUnknown source"),
-      row("internal", internal, otherInternal, "si", internalText, true, "s",
-          "abcUnknown source"),
-      row("data dictionary", dd, otherDd, "sd", "//DD0/Pool/Ctrl/speed", true,
-          "sd", "//DD0/Pool/Ctrl/speed"),
-      row("Stateflow", *m_State.getStateflowSrcRef(), otherState, "sc",
-          "Chart/Idle", false, "sc", "Chart/Idle"),
-      row("input block", input, otherInput, "sn", "abc", false, "sn", "abc"),
-      {"block", &block, [&] { return HX_Block::dupSrcRef(block); },
-       [&] { return &(blockRef(other) = block); }, "sb", "my model/a/b   c",
-       false, false, "sb", "my model/a/b   c"},
-  };
-  for (const ClassRow& r : rows) {
-    SCOPED_TRACE(r.name);
-    const int id1 = r.original->getSrcRefId();
-    EXPECT_EQ(kindsOf(*r.original), r.kinds);
-    EXPECT_EQ(textOf(*r.original), r.text);
-
-    const int next = HxCSrcRef().getSrcRefId() + 1;
-    const SrcRefPtr copy(r.copy());
-    EXPECT_EQ(copy->getSrcRefId(), r.copyKeepsId ? id1 : next);
-    EXPECT_EQ(kindsOf(*copy), r.kinds);
-    EXPECT_EQ(textOf(*copy), r.text);
-
-    const int afterCopy = HxCSrcRef().getSrcRefId() + 1;
-    EXPECT_EQ(afterCopy, next + (r.copyKeepsId ? 1 : 2));
-    const SrcRefPtr clone(r.original->clone());
-    EXPECT_EQ(clone->getSrcRefId(), r.cloneKeepsId ? id1 : afterCopy);
-    EXPECT_EQ(kindsOf(*clone), r.cloneKinds);
-    EXPECT_EQ(textOf(*clone), r.cloneText);
-
-    const HxCSrcRef* assigned = r.assignToOther();
-    EXPECT_NE(assigned, r.original);
-    EXPECT_EQ(assigned->getSrcRefId(), id1);
-    EXPECT_EQ(textOf(*assigned), r.text);
-  }
+  expectRules(*m_Gain.getSrcRef(), blockRef(other), "sb", "my model/a/b   c",
+              CloneHas::eNewId, false);
 }
 
 TEST_F(SrcRefTest, ABlockReferenceMayLoseItsBlock) {
@@ -160,8 +126,7 @@ TEST_F(SrcRefTest, ABlockReferenceMayLoseItsBlock) {
   EXPECT_EQ(textOf(ref), "");
   const int next = HxCSrcRef().getSrcRefId() + 1;
   const SrcRefPtr clone(static_cast<const HxCSrcRef&>(ref).clone());
-  EXPECT_EQ(kindsOf(*clone), "s");
-  EXPECT_EQ(textOf(*clone), "abcUnknown source");
+  EXPECT_EQ(kindsOf(*clone) + textOf(*clone), "sabcUnknown source");
   EXPECT_EQ(clone->getSrcRefId(), next);
 }
 
@@ -185,28 +150,19 @@ TEST_F(SrcRefTest, InternalReferencesTellWhatIsKnown) {
 }
 
 TEST_F(SrcRefTest, DdReferencesShowPathScriptObjectOrHandle) {
-  const unsigned long script =
-      HX_DdTree::instance().add("//DD0/CGTmpData/hxscript_Ctrl/3/Gain_Var");
+  const std::string script = "//DD0/CGTmpData/hxscript_Ctrl/3/Gain_Var";
+  const unsigned long handle = HX_DdTree::instance().add(script.c_str());
   const unsigned long largest = std::numeric_limits<unsigned long>::max();
-  const struct {
-    unsigned long handle;
-    std::string path;
-    std::string text;
-  } rows[] = {
-      {script, "//DD0/CGTmpData/hxscript_Ctrl/3/Gain_Var",
-       "User script object Gain_Var of block Ctrl"},
-      {4711, "Handle: 4711", "Handle: 4711"},
-      {0, "Handle: 0", "Handle: 0"},
-      {largest, "Handle: " + std::to_string(largest),
-       "Handle: " + std::to_string(largest)},
-  };
-  for (const auto& r : rows) {
-    const HxCDdSrcRef ref(r.handle);
+  for (const unsigned long each : {handle, 4711UL, 0UL, largest}) {
+    const HxCDdSrcRef ref(each);
+    const std::string plain = "Handle: " + std::to_string(each);
     KyCXString path("abc");
     ref.getDdPath(path);
-    EXPECT_EQ(path.cstring(), r.path);
-    EXPECT_EQ(textOf(ref), r.text);
-    EXPECT_EQ(ref.getDdHandle(), r.handle);
+    EXPECT_EQ(path.cstring(), each == handle ? script : plain);
+    EXPECT_EQ(textOf(ref), each == handle
+                               ? "User script object Gain_Var of block Ctrl"
+                               : plain);
+    EXPECT_EQ(ref.getDdHandle(), each);
   }
   EXPECT_EQ(HxCDdSrcRef().getDdHandle(), 0U);
 }
@@ -222,51 +178,45 @@ class RecordingDump : public HX_Dump {
  public:
   void openObject(const HX_Dumpable* object,
                   const KyCXString& className) override {
-    calls.push_back(std::string("open ") + className.cstring());
+    calls += std::string("open ") + className.cstring();
     EXPECT_EQ(object, expected);
   }
   void writeEntry(const KyCXString& label, const KyCXString& value,
                   int level) override {
-    calls.push_back(std::string(label.cstring()) + value.cstring() + "|" +
-                    std::to_string(level));
+    calls += std::string("|") + label.cstring() + value.cstring() + "|" +
+             std::to_string(level);
   }
   void closeObject(const HX_Dumpable* object) override {
-    calls.push_back("close");
+    calls += "|close";
     EXPECT_EQ(object, expected);
   }
 
   const HX_Dumpable* expected = nullptr;
-  std::vector<std::string> calls;
+  std::string calls;
 };
 
 TEST_F(SrcRefTest, DumpWritesOneSectionWithTheText) {
   HxCInternalSrcRef ref("x.cpp", 1, "c");
-  for (bool flag : {false, true}) {
-    RecordingDump dump;
-    dump.expected = &ref;
-    HxCSrcRef& base = ref;
-    EXPECT_EQ(base.dump(&dump, flag), &dump);
-    EXPECT_THAT(dump.calls,
-                ElementsAre("open HxCSrcRef",
-                            "Source:Internal: Module: 'x.cpp', Line: 1 "
-                            "Reason: c|0",
-                            "close"));
-  }
+  RecordingDump dump;
+  dump.expected = &ref;
+  for (bool flag : {false, true})
+    EXPECT_EQ(static_cast<HxCSrcRef&>(ref).dump(&dump, flag), &dump);
+  const std::string once =
+      "open HxCSrcRef|Source:Internal: Module: 'x.cpp', Line: 1 Reason: "
+      "c|0|close";
+  EXPECT_EQ(dump.calls, once + once);
 }
 
 TEST_F(SrcRefTest, PointersCompareByAddressAndStreamNothing) {
   const HxCSrcRef refs[2];
-  const HxCSrcRef* const a = &refs[0];
-  const HxCSrcRef* const b = &refs[1];
-  const HxCSrcRef* const none = nullptr;
-  EXPECT_EQ(leda::compare(a, b), -1);
-  EXPECT_EQ(leda::compare(b, a), 1);
-  EXPECT_EQ(leda::compare(a, a), 0);
-  EXPECT_EQ(leda::compare(none, a), -1);
+  const HxCSrcRef* const ordered[] = {nullptr, &refs[0], &refs[1]};
+  for (int a = 0; a < 3; ++a)
+    for (int b = 0; b < 3; ++b)
+      EXPECT_EQ(leda::compare(ordered[a], ordered[b]), (a > b) - (a < b));
   std::stringstream stream;
-  stream << a << none << "end";
+  stream << ordered[1] << ordered[0] << "end";
   EXPECT_EQ(stream.str(), "end");
-  EXPECT_EQ(&(stream >> a), &stream);
+  EXPECT_EQ(&(stream >> ordered[1]), &stream);
   EXPECT_EQ(stream.get(), 'e');
 }
 
