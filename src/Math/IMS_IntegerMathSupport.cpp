@@ -12,6 +12,8 @@
 
 namespace {
 
+using hx_detail::oddGcdBySubtraction;
+using hx_detail::withoutTrailingZeros;
 using Unsigned = unsigned long long;
 constexpr long long kSmallest = std::numeric_limits<long long>::min();
 constexpr long long kLargest = std::numeric_limits<long long>::max();
@@ -29,19 +31,6 @@ Unsigned magnitude(long long v) {
   return v < 0 ? 0 - static_cast<Unsigned>(v) : static_cast<Unsigned>(v);
 }
 
-Unsigned withoutTrailingZeros(Unsigned v) { return v >> std::countr_zero(v); }
-
-// Both odd. One subtraction per step: best while the processor learns the order
-// of the operands.
-Unsigned oddGcdBySubtraction(Unsigned a, Unsigned b) {
-  while (a != b) {
-    const Unsigned difference = a < b ? b - a : a - b;
-    b = std::min(a, b);
-    a = withoutTrailingZeros(difference);
-  }
-  return a;
-}
-
 // Both odd. A division per step removes more bits than the subtractions that
 // it replaces when their order is random.
 Unsigned oddGcdByDivision(Unsigned a, Unsigned b) {
@@ -57,27 +46,28 @@ Unsigned oddGcdByDivision(Unsigned a, Unsigned b) {
   return b;
 }
 
-// Both above 0.
+// Both above 0; meant for those that the inline part leaves.
 Unsigned binaryGcd(Unsigned a, Unsigned b) {
-  constexpr int kSmallBits = 32;   // no preparation pays
   constexpr int kSizeGapBits = 6;  // one division replaces many subtractions
-  constexpr int kLargeBits = 56;   // hardly a pair has a pattern to learn
+  constexpr int kLargeBits = 60;   // hardly a pair has a pattern to learn
   const int shift = std::countr_zero(a | b);
-  a = withoutTrailingZeros(a);
-  b = withoutTrailingZeros(b);
-  if ((a | b) >> kSmallBits != 0) {
-    if (a < b) std::swap(a, b);
-    if (b >> kLargeBits != 0) return oddGcdByDivision(a, b) << shift;
-    if (a >> kSizeGapBits > b) {
-      a %= b;
-      if (a == 0) return b << shift;
-      a = withoutTrailingZeros(a);
-    }
-  }
-  return oddGcdBySubtraction(a, b) << shift;
+  const Unsigned x = withoutTrailingZeros(a);
+  const Unsigned y = withoutTrailingZeros(b);
+  const Unsigned high = std::max(x, y);
+  const Unsigned low = std::min(x, y);
+  if (low >> kLargeBits != 0) return oddGcdByDivision(high, low) << shift;
+  if (high >> kSizeGapBits <= low) return oddGcdBySubtraction(x, y) << shift;
+  const Unsigned rest = high % low;
+  if (rest == 0) return low << shift;
+  return oddGcdBySubtraction(withoutTrailingZeros(rest), low) << shift;
 }
 
-long long greatestCommonDivisor(long long a, long long b) {
+// 2^exponent; 0 or infinity far off.
+double powerOf2(int exponent) { return std::ldexp(1.0, exponent); }
+
+}  // namespace
+
+long long hx_detail::gcdOfAny(long long a, long long b) {
   if (a == 0) return b;
   if (b == 0) return a;
   if ((a < 0) == (b < 0)) {
@@ -91,11 +81,6 @@ long long greatestCommonDivisor(long long a, long long b) {
   }
   return a;
 }
-
-// 2^exponent; 0 or infinity far off.
-double powerOf2(int exponent) { return std::ldexp(1.0, exponent); }
-
-}  // namespace
 
 long long IMS_AbsInt64(long long v) {
   if (v == kSmallest) return kLargest;
@@ -131,10 +116,6 @@ long long IMS_SimulinkAlikeSqrt(long long v) {
   return FPS_SatCastToInt64(FPS_SimulinkAlikeSqrt(static_cast<double>(v)));
 }
 
-long long IMS_FindGreatestCommonDivisor(const long long* pair) {
-  return greatestCommonDivisor(pair[0], pair[1]);
-}
-
 long long IMS_FindLeastCommonMultiple(int n, const long long* values,
                                       double limit) {
   const double product =
@@ -145,7 +126,8 @@ long long IMS_FindLeastCommonMultiple(int n, const long long* values,
   for (int i = 1; i < n; ++i) {
     const long long value = values[i];
     if (multiple == 0 || value == 0) return 0;
-    const long long divisor = greatestCommonDivisor(multiple, value);
+    const long long pair[] = {multiple, value};
+    const long long divisor = IMS_FindGreatestCommonDivisor(pair);
     if (divisor == value && remainder(value, multiple) != 0) return 0;
     multiple = wrappedQuotient(
         static_cast<Unsigned>(multiple) * static_cast<Unsigned>(value),
