@@ -58,15 +58,13 @@ int satCastToInt(double x) {
   return x > -2147483648.0 ? static_cast<int>(x) : -2147483647 - 1;
 }
 
-// True for values whose rounding needs neither saturation nor the run-time's
-// floor; false for special values.
-bool isModerate(double x) { return std::fabs(x) < 0x1p62; }
+// True for values that have the places for a half, and so can be rounded
+// without saturation and without the run-time's floor; false for special ones.
+bool isModerate(double x) { return std::fabs(x) < 0x1p51; }
 
-// floor(x + 0.5) of a moderate value; the sign of a zero is lost.
-double nearestInteger(double x) {
-  const double y = x + 0.5;
-  const double cut = static_cast<double>(static_cast<long long>(y));
-  return cut - static_cast<double>(cut > y);
+// Of a moderate value; never -0.0.
+double cutOff(double x) {
+  return static_cast<double>(static_cast<long long>(x));
 }
 
 bool isNear(double x, double nearest) {
@@ -76,24 +74,75 @@ bool isNear(double x, double nearest) {
 }
 
 bool isIntegerValue(double x) {
-  if (isModerate(x)) return isNear(x, nearestInteger(x));
-  return areApproxEqual(truncate(std::floor(x + 0.5)), x, kDefaultTolerance);
+  const double y = x + 0.5;
+  if (!isModerate(x)) {
+    return areApproxEqual(truncate(std::floor(y)), x, kDefaultTolerance);
+  }
+  const double cut = cutOff(y);
+  return isNear(x, cut > y ? cut - 1.0 : cut);
 }
 
-// Truncates x + step, or the step that snaps a near-integer to its integer.
-// Selects by arithmetic: which case a value is cannot be predicted.
-double snapOrTruncate(double x, int step) {
-  if (!isModerate(x)) return truncate(x);  // an integer as it is
-  const double nearest = nearestInteger(x);
-  const int isPositive = x > 0.0;
-  const int up = isPositive & static_cast<int>(nearest > x);
-  const int down = (1 - isPositive) & static_cast<int>(nearest < x);
-  const int chosen =
-      step + static_cast<int>(isNear(x, nearest)) * (up - down - step);
-  return static_cast<double>(static_cast<long long>(x + chosen));
+// The integer that the near-integer x is snapped to.
+double snap(double x) {
+  HX_Assert(isIntegerValue(x), kErrorCode);
+  const double nearest = std::floor(x + 0.5);
+  if (x > 0.0) return truncate(nearest > x ? x + 1.0 : x);
+  return truncate(nearest < x ? x - 1.0 : x);
+}
+
+// Rounds toward zero a moderate magnitude that is not snapped to the integer
+// above it. The sign of its value decides where the integer nearest to a half
+// lies.
+double roundMagnitudeDown(double magnitude, bool isNegative) {
+  const double cut = cutOff(magnitude);
+  const double above = cut + 1.0;
+  if (!isNear(magnitude, above)) return cut;
+  const double rest = magnitude - cut;
+  const bool isBelow = isNegative ? rest <= 0.5 : rest < 0.5;
+  return isBelow ? cut : cutOff(magnitude + 1.0);
+}
+
+// The same away from zero, and not snapped to the integer below it.
+double roundMagnitudeUp(double magnitude, bool isNegative) {
+  const double cut = cutOff(magnitude);
+  const double rest = magnitude - cut;
+  if (isNear(magnitude, cut) && (isNegative ? rest <= 0.5 : rest < 0.5)) {
+    return cut;
+  }
+  return cutOff(magnitude + 1.0);
 }
 
 double log2OfReal(double x) { return HX_NaturalLog(x) / kShortLn2; }
+
+// A positive normal number split for the integer logarithms.
+struct Split {
+  int exponent;
+  double mantissa;  // in [1, 2); 0 if the number is not positive and normal
+};
+
+Split split(double x) {
+  const auto bits = std::bit_cast<std::uint64_t>(x);
+  const auto exponent = static_cast<int>(bits >> 52);  // with the sign
+  if (exponent < 1 || exponent > 2046) return {0, 0.0};
+  constexpr std::uint64_t kFraction = (std::uint64_t{1} << 52) - 1;
+  return {exponent - 1023, std::bit_cast<double>((bits & kFraction) |
+                                                 std::uint64_t{1023} << 52)};
+}
+
+// This far from a power of two or its root, relatively, the exponent decides
+// how the logarithm rounds: FPS_Log2 errs by less than 2^-36, which is 1024
+// times the relative error of its divisor.
+constexpr double kClearance = 0x1p-30;
+
+bool isClearOfIntegers(double mantissa) {
+  return mantissa > 1.0 + kClearance && mantissa < 2.0 - 2.0 * kClearance;
+}
+
+constexpr double kSqrt2 = 0x1.6a09e667f3bcdp+0;
+
+bool isClearOfHalves(double mantissa) {
+  return mantissa >= 1.0 && std::fabs(mantissa - kSqrt2) > 2.0 * kClearance;
+}
 
 bool isPowerOf2(double x, int& exponent) {
   const auto bits = std::bit_cast<std::uint64_t>(x);
@@ -183,12 +232,23 @@ bool FPS_ConvertSpecialValueToInteger(double x, double* out) {
 
 double FPS_Round(double x) { return truncate(x < 0.0 ? x - 0.5 : x + 0.5); }
 
+// Subtracting a magnitude from 0.0 keeps a zero positive.
 double FPS_RoundUp(double x) {
-  return snapOrTruncate(x, static_cast<int>(!(x < 0.0)));
+  if (isModerate(x)) {
+    return x < 0.0 ? 0.0 - roundMagnitudeDown(-x, true)
+                   : roundMagnitudeUp(x, false);
+  }
+  if (isIntegerValue(x)) return snap(x);
+  return truncate(x < 0.0 ? x : x + 1.0);
 }
 
 double FPS_RoundDown(double x) {
-  return snapOrTruncate(x, -static_cast<int>(x < 0.0));
+  if (isModerate(x)) {
+    return x < 0.0 ? 0.0 - roundMagnitudeUp(-x, true)
+                   : roundMagnitudeDown(x, false);
+  }
+  if (isIntegerValue(x)) return snap(x);
+  return truncate(x < 0.0 ? x - 1.0 : x);
 }
 
 double FPS_SimulinkAlikeModulo(double x, double y) {
@@ -217,9 +277,19 @@ double FPS_Log2(double x) { return log2OfReal(x); }
 
 double FPS_Log2(int n) { return log2OfReal(static_cast<double>(n)); }
 
-int FPS_Log2Int(double x) { return satCastToInt(log2OfReal(x)); }
+int FPS_Log2Int(double x) {
+  const Split parts = split(x);
+  if (isClearOfIntegers(parts.mantissa)) {
+    return parts.exponent + static_cast<int>(parts.exponent < 0);
+  }
+  return satCastToInt(log2OfReal(x));
+}
 
 int FPS_GetPowerOf2(double x) {
+  const Split parts = split(x);
+  if (isClearOfHalves(parts.mantissa)) {
+    return parts.exponent + static_cast<int>(parts.mantissa > kSqrt2);
+  }
   const double log = log2OfReal(x);
   return satCastToInt(log < 0.0 ? log - 0.5 : log + 0.5);
 }
@@ -234,6 +304,8 @@ bool FPS_PowerOf2(double x, int* exponent) {
 int FPS_GetGreaterPowerOf2(double x) {
   int exponent = 0;
   if (isPowerOf2(x, exponent)) return exponent;
+  const Split parts = split(x);
+  if (isClearOfIntegers(parts.mantissa)) return parts.exponent + 1;
   const double log = log2OfReal(x);
   return satCastToInt(log < 0.0 ? log : log + 1.0);
 }

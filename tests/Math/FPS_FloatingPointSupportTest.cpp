@@ -166,7 +166,15 @@ const UnaryRow kUnaryRows[] = {
     {FPS_RoundUp, 2.00000001, 2},
     {FPS_RoundUp, -2.00000001, -2},
     {FPS_RoundUp, -2.99999999, -3},
-    {FPS_RoundUp, 0x1p25 + 0.25, 0x1p25},  // all values there are near
+    {FPS_RoundUp, 0x1p25 + 0.25, 0x1p25},   // all values there are near
+    {FPS_RoundUp, -0x1p25 - 0.5, -0x1p25},  // the half is near, and moves up
+    {FPS_RoundDown, 0x1p25 + 0.5, 0x1p25 + 1},
+    {FPS_RoundDown, 0x1p25 + 0.25, 0x1p25},
+    {FPS_RoundDown, -0x1p25 - 0.5, -0x1p25},
+    {FPS_RoundDown, 0x1p51 + 0.5, 0x1p51 + 1},
+    {FPS_RoundUp, -0x1p51 - 0.5, -0x1p51},
+    {FPS_RoundUp, 0x1p52 + 1, 0x1p52 + 2},  // the added half moves it
+    {FPS_RoundUp, -0.4, 0.0},
     {FPS_RoundUp, -kInf, -kTwo63},
     {FPS_Round, 2.5, 3},
     {FPS_Round, -2.5, -3},
@@ -401,14 +409,27 @@ TEST_F(FloatingPointSupportTest, LogarithmIsAlmostAlwaysCorrectlyRounded) {
   RandomDoubles random;
   int differences = 0;
   for (int i = 0; i < 3000; ++i) {
-    // Every second value near 1, at all distances from it.
-    const double x = std::fabs(
-        i % 2 == 0 ? random.next() : 1 + std::ldexp(i - 1500.5, -11 - i % 47));
+    // Every second value near 1 or an odd power of its root of 2, at all
+    // distances from it.
+    const double near = 1 + std::ldexp(i - 1500.5, -11 - i % 47);
+    const double nearRoot = std::ldexp(near * 0x1.6a09e667f3bcdp0, i / 2 - 750);
+    const double x = std::fabs(i % 2 == 0   ? random.next()
+                               : i % 4 == 1 ? near
+                                            : nearRoot);
     if (!(x > 0.0 && x < kInf)) continue;
+    const double log = FPS_Log2(x);  // decides the integer logarithms
+    const double half = log < 0 ? -0.5 : 0.5;
+    EXPECT_EQ(FPS_Log2Int(x), static_cast<int>(log)) << x;
+    EXPECT_EQ(FPS_GetPowerOf2(x), static_cast<int>(log + half)) << x;
+    if (!FPS_PowerOf2(x, nullptr)) {
+      EXPECT_EQ(FPS_GetGreaterPowerOf2(x),
+                static_cast<int>(log < 0 ? log : log + 1))
+          << x;
+    }
     const double ln = mp::log(mp::cpp_bin_float_50(x)).convert_to<double>();
     const double exact = ln / 0.69314718055995;
-    EXPECT_NEAR(FPS_Log2(x), exact, std::fabs(exact) * 0x1p-51) << x;
-    if (bitsOf(FPS_Log2(x)) != bitsOf(exact)) ++differences;
+    EXPECT_NEAR(log, exact, std::fabs(exact) * 0x1p-51) << x;
+    if (bitsOf(log) != bitsOf(exact)) ++differences;
   }
   EXPECT_LE(differences, 6);
 }
