@@ -64,8 +64,7 @@ HX_UTILS_API bool FPS_ValuesAreApproxEqual(double a, double b);
 /// distance. False for special values.
 HX_UTILS_API bool FPS_IsIntegerValue(double x);
 
-// --- Rounding to a number of places
-// -------------------------------------------
+// --- Rounding to a number of places ------------------------------------------
 
 /// \p x with its mantissa rounded to \p bits bits, ties upward (also below 0).
 ///
@@ -81,8 +80,7 @@ HX_UTILS_API double FPS_RoundOffBits(double x, int bits);
 /// may change.
 HX_UTILS_API double FPS_RoundOffDigits(double x);
 
-// --- Conversion to integers
-// ----------------------------------------------------
+// --- Conversion to integers --------------------------------------------------
 
 /// Truncates; the result saturates at the bounds of a 32-bit integer.
 HX_UTILS_API int FPS_SatCastToInt(double x);
@@ -111,8 +109,7 @@ HX_UTILS_API bool FPS_Fits32Bit(double x, double& limit);
 /// -Inf. Otherwise \p out is 0.0, not \p x.
 HX_UTILS_API bool FPS_ConvertSpecialValueToInteger(double x, double* out);
 
-// --- Rounding to integers
-// --------------------------------------------------------
+// --- Rounding to integers ----------------------------------------------------
 
 /// Rounds half away from zero; saturates as FPS_SatCutOffAfterPointDecimals.
 /// The half is added in double: 0.49999999999999994 gives 1, and from 2^52 on
@@ -123,13 +120,11 @@ HX_UTILS_API double FPS_Round(double x);
 /// the nearest integer instead, whether it lies above or below it; from
 /// magnitude 2^25 on that is every value. Just below a power of two adding 1 to
 /// the value rounds, and the value is snapped one too far: 1 - 2^-53 gives 2.
-/// The result saturates at -2^63 and
-/// 2^63, also for the infinities.
+/// The result saturates at -2^63 and 2^63, also for the infinities.
 HX_UTILS_API double FPS_RoundUp(double x);
 HX_UTILS_API double FPS_RoundDown(double x);
 
-// --- Arithmetic of the simulation
-// --------------------------------------------------
+// --- Arithmetic of the simulation --------------------------------------------
 
 /// x - floor(x / y) * y, with the sign of \p y; \p x if \p y is 0. The product
 /// is rounded: the result may miss the exact remainder, and even reach \p y.
@@ -149,8 +144,7 @@ HX_UTILS_API double FPS_ASinh(double x);
 HX_UTILS_API double FPS_ACosh(double x);
 HX_UTILS_API double FPS_ATanh(double x);
 
-// --- Powers of two
-// -----------------------------------------------------------------
+// --- Powers of two -----------------------------------------------------------
 
 /// ln(x) / 0.69314718055995. The divisor is a little larger than ln 2, so
 /// every result is too near to 0, by 7e-15 of its value: FPS_Log2(8.0) is
@@ -185,8 +179,7 @@ HX_UTILS_API bool FPS_PowerOf2(double x, int* exponent);
 /// 1/2. For 0 and other negative values as FPS_Log2Int.
 HX_UTILS_API int FPS_GetGreaterPowerOf2(double x);
 
-// --- Divisors and multiples
-// ----------------------------------------------------------
+// --- Divisors and multiples --------------------------------------------------
 
 /// Euclid's algorithm with fmod on the two values of \p pair, which stay
 /// unchanged. Exact, without tolerance; the sign follows the remainders. A NaN

@@ -37,10 +37,19 @@ inline double logOutsideDomain(double x) {
 // (ln(1 + r) - r) / r^2 = -1/2 + r/3 - r^2/4 + ... ; the first term left out is
 // below 2^-66 of ln(1 + r).
 inline double tailOfSeries(double r, double r2) {
+#if defined(__GNUC__)  // the two halves side by side in one register
+  using Pair = double __attribute__((vector_size(16)));
+  const Pair halves =
+      (Pair{-1.0 / 2, -1.0 / 6} + r * Pair{1.0 / 3, 1.0 / 7}) +
+      r2 * (Pair{-1.0 / 4, -1.0 / 8} + r * Pair{1.0 / 5, 1.0 / 9});
+  const double low = halves[0];
+  const double high = halves[1];
+#else
   const double low =
       (-1.0 / 2 + r * (1.0 / 3)) + r2 * (-1.0 / 4 + r * (1.0 / 5));
   const double high =
       (-1.0 / 6 + r * (1.0 / 7)) + r2 * (-1.0 / 8 + r * (1.0 / 9));
+#endif
   return low + r2 * r2 * high;
 }
 
