@@ -75,12 +75,6 @@ TEST_F(FloatingPointSupportTest, GettersWaitForTheInitialisation) {
   EXPECT_THAT(messages(), IsEmpty());
 }
 
-struct UnaryRow {
-  double (*operation)(double);
-  double x;
-  double expected;
-};
-
 double satInt(double x) { return FPS_SatCastToInt(x); }
 double satULong(double x) { return FPS_SatCastToULong(x); }
 double isInteger(double x) { return FPS_IsIntegerValue(x); }
@@ -116,122 +110,82 @@ double specialAsInteger(double x) {
   return 1.0;
 }
 
-const UnaryRow kUnaryRows[] = {
-    {toBool, -0.0, 0},
-    {toBool, kTiny, 1},
-    {toBool, kNaN, 1},
-    {satInt, below(kTwo31 - 1), 2147483646},
-    {satInt, 3e9, 2147483647},
-    {satInt, above(-kTwo31), -2147483647},
-    {satInt, below(-kTwo31), -2147483648.0},
-    {satInt, -2.7, -2},
-    {satInt, -kInf, -kTwo31},
-    {satInt, kNaN, 2147483647},
-    {satULong, below(kTwo32 - 1), 4294967294},
-    {satULong, kTwo32 - 1, 4294967295},
-    {satULong, kTwo32, 4294967295},
-    {satULong, kInf, 4294967295},
-    {FPS_SatCutOffAfterPointDecimals, below(kTwo63), 0x1.fffffffffffffp62},
-    {FPS_SatCutOffAfterPointDecimals, kMax, kTwo63},
-    {FPS_SatCutOffAfterPointDecimals, below(-kTwo63), -kTwo63},
-    {FPS_SatCutOffAfterPointDecimals, above(-kTwo63), above(-kTwo63)},
-    {FPS_SatCutOffAfterPointDecimals, -0.9, 0.0},
-    {violated32, kTwo32 - 1, 0},
-    {violated32, above(kTwo32 - 1), kTwo32 - 1},
-    {violated32, -kTwo31, 0},
-    {violated32, below(-kTwo31), -kTwo31},
-    {violated32, kNaN, 0},
-    {specialAsInteger, kInf, kTwo63},
-    {specialAsInteger, kNaN, kTwo63},
-    {specialAsInteger, -kInf, -kTwo63},
-    {specialAsInteger, kMax, 1},
-    {isInteger, 2.9999999999, 1},
-    {isInteger, 1.0 - kTolerance, 0},  // strictly nearer than the tolerance
-    {isInteger, above(1.0 - kTolerance), 1},
-    {isInteger, kTolerance, 0},
-    {isInteger, 0x1p25 - 0.5, 0},
-    {isInteger, 0x1p25 + 0.5, 1},
-    {isInteger, kTwo63, 1},
-    {isInteger, 1e300, 0},
-    {isInteger, kInf, 0},
-    {isInteger, kNaN, 0},
-    {FPS_RoundDown, 2.9999999999, 3},
-    {FPS_RoundDown, below(3.0), 3},
-    {FPS_RoundDown, below(1.0), 2},  // adding 1 rounds up
-    {FPS_RoundUp, above(-1.0), -2},
-    {FPS_RoundDown, -2.5, -3},
-    {FPS_RoundDown, 3.00000001, 3},
-    {FPS_RoundDown, 1e300, kTwo63},
-    {FPS_RoundUp, -2.5, -2},
-    {FPS_RoundUp, 2.00000001, 2},
-    {FPS_RoundUp, -2.00000001, -2},
-    {FPS_RoundUp, -2.99999999, -3},
-    {FPS_RoundUp, 0x1p25 + 0.25, 0x1p25},   // all values there are near
-    {FPS_RoundUp, -0x1p25 - 0.5, -0x1p25},  // the half is near, and moves up
-    {FPS_RoundDown, 0x1p25 + 0.5, 0x1p25 + 1},
-    {FPS_RoundDown, 0x1p25 + 0.25, 0x1p25},
-    {FPS_RoundDown, -0x1p25 - 0.5, -0x1p25},
-    {FPS_RoundDown, 0x1p51 + 0.5, 0x1p51 + 1},
-    {FPS_RoundUp, -0x1p51 - 0.5, -0x1p51},
-    {FPS_RoundUp, 0x1p52 + 1, 0x1p52 + 2},  // the added half moves it
-    {FPS_RoundUp, -0.4, 0.0},
-    {FPS_RoundUp, -kInf, -kTwo63},
-    {FPS_Round, 2.5, 3},
-    {FPS_Round, -2.5, -3},
-    {FPS_Round, below(2.5), 2},
-    {FPS_Round, -0.4, 0.0},
-    {roundBits<3>, 0x1.2p0, 0x1.4p0},
-    {roundBits<3>, -0x1.2p0, -0x1p0},  // a tie moves up
-    {roundBits<3>, below(0x1.2p0), 0x1p0},
-    {roundBits<53>, above(1.0), above(above(1.0))},  // the added half rounds
-    {roundBits<54>, above(1.0), above(1.0)},
-    {roundBits<1024>, -kMax, -kMax},
-    {roundBits<2147483647>, -1.0, -kInf},
-    {roundBits<0>, 1.5, 2.0},
-    {roundBits<-2147483647 - 1>, -1.5, 0.0},
-    {roundBits<8>, -kInf, -kInf},
-    {FPS_RoundOffDigits, 0.12345678901234567, 0.1234567890123},
-    {FPS_RoundOffDigits, -0x1p-14, -0.0000610351562},
-    {FPS_RoundOffDigits, 1.8e295, kInf},
-    {FPS_RoundOffDigits, -kInf, -kInf},
-    {FPS_RoundOffDigits, kNaN, kNaN},
-    {FPS_SimulinkAlikeSqrt, -4.0, -2.0},
-    {FPS_SimulinkAlikeSqrt, -0.0, -0.0},
-    {log2Of, 8.0, 2.9999999999999796},
-    {log2Of, 2.0, 0.9999999999999932},
-    {log2Of, -0.0, -kInf},
-    {log2Of, kInf, kInf},
-    {log2Of, -kTiny, kNaN},
-    {log2Int, 8.0, 2},
-    {log2Int, 0.25, -1},
-    {log2Int, 0.0, -kTwo31},
-    {log2Int, -1.0, kTwo31 - 1},
-    {powerOf2, 5.0, 2},
-    {powerOf2, 6.0, 3},
-    {powerOf2, 0.3, -2},
-    {exponentOf, 0.25, -2},
-    {exponentOf, -4.0, 2},
-    {exponentOf, 3.0, -9999},
-    {exponentOf, 0.0, -9999},
-    {exponentOf, 0x1p-1022, -1022},
-    {exponentOf, 0x1p-1023, -9999},
-    {exponentOf, kInf, 1024},
-    {greaterPowerOf2, 5.0, 3},
-    {greaterPowerOf2, 8.0, 3},
-    {greaterPowerOf2, above(8.0), 3},  // the error of the logarithm
-    {greaterPowerOf2, 0.3, -1},
-    {FPS_ASinh, 1.0, 0.88137358701954294},
-    {FPS_ACosh, 2.0, 1.3169578969248166},
-    {FPS_ACosh, 0.5, kNaN},
-    {FPS_ATanh, 0.5, 0.54930614433405489},
-    {FPS_ATanh, 1.0, kInf},
+struct UnaryCase {
+  double (*operation)(double);
+  std::vector<double> x, expected;
+};
+
+const UnaryCase kUnaryCases[] = {
+    {toBool, {-0.0, kTiny, kNaN}, {0, 1, 1}},
+    {satInt,
+     {below(kTwo31 - 1), 3e9, above(-kTwo31), below(-kTwo31), -2.7, -kInf,
+      kNaN},
+     {2147483646, 2147483647, -2147483647, -kTwo31, -2, -kTwo31, 2147483647}},
+    {satULong,
+     {below(kTwo32 - 1), kTwo32 - 1, kTwo32, kInf},
+     {4294967294, 4294967295, 4294967295, 4294967295}},
+    {FPS_SatCutOffAfterPointDecimals,
+     {below(kTwo63), kMax, below(-kTwo63), above(-kTwo63), -0.9},
+     {below(kTwo63), kTwo63, -kTwo63, above(-kTwo63), 0.0}},
+    {violated32,
+     {kTwo32 - 1, above(kTwo32 - 1), -kTwo31, below(-kTwo31), kNaN},
+     {0, kTwo32 - 1, 0, -kTwo31, 0}},
+    {specialAsInteger, {kInf, kNaN, -kInf, kMax}, {kTwo63, kTwo63, -kTwo63, 1}},
+    // Strictly nearer than the tolerance.
+    {isInteger,
+     {1.0 - kTolerance, above(1.0 - kTolerance), kTolerance, 0x1p25 - 0.5,
+      0x1p25 + 0.5, kTwo63, 1e300, kInf, kNaN},
+     {0, 1, 0, 0, 1, 1, 0, 0, 0}},
+    // Adding 1 rounds up the value below 1.
+    {FPS_RoundDown,
+     {2.9999999999, below(3.0), below(1.0), -2.5, 3.00000001, 0x1p25 + 0.5,
+      0x1p25 + 0.25, -0x1p25 - 0.5, 0x1p51 + 0.5, 1e300},
+     {3, 3, 2, -3, 3, 0x1p25 + 1, 0x1p25, -0x1p25, 0x1p51 + 1, kTwo63}},
+    // From 2^25 on all values are near, halves move up, as 2^52 + 1 does.
+    {FPS_RoundUp,
+     {above(-1.0), -2.5, 2.00000001, -2.00000001, -2.99999999, 0x1p25 + 0.25,
+      -0x1p25 - 0.5, -0x1p51 - 0.5, 0x1p52 + 1, -0.4, -kInf},
+     {-2, -2, 2, -2, -3, 0x1p25, -0x1p25, -0x1p51, 0x1p52 + 2, 0.0, -kTwo63}},
+    {FPS_Round, {2.5, -2.5, below(2.5), -0.4}, {3, -3, 2, 0.0}},
+    // A tie moves up.
+    {roundBits<3>,
+     {0x1.2p0, -0x1.2p0, below(0x1.2p0)},
+     {0x1.4p0, -0x1p0, 0x1p0}},
+    // The added half rounds.
+    {roundBits<53>, {above(1.0)}, {above(above(1.0))}},
+    {roundBits<54>, {above(1.0)}, {above(1.0)}},
+    {roundBits<1024>, {-kMax}, {-kMax}},
+    {roundBits<2147483647>, {-1.0}, {-kInf}},
+    {roundBits<0>, {1.5}, {2.0}},
+    {roundBits<-2147483647 - 1>, {-1.5}, {0.0}},
+    {roundBits<8>, {-kInf}, {-kInf}},
+    {FPS_RoundOffDigits,
+     {0.12345678901234567, -0x1p-14, 1.8e295, -kInf, kNaN},
+     {0.1234567890123, -0.0000610351562, kInf, -kInf, kNaN}},
+    {FPS_SimulinkAlikeSqrt, {-4.0, -0.0}, {-2.0, -0.0}},
+    {log2Of,
+     {8.0, 2.0, -0.0, kInf, -kTiny},
+     {2.9999999999999796, 0.9999999999999932, -kInf, kInf, kNaN}},
+    {log2Int, {8.0, 0.25, 0.0, -1.0}, {2, -1, -kTwo31, kTwo31 - 1}},
+    {powerOf2, {5.0, 6.0, 0.3}, {2, 3, -2}},
+    {exponentOf,
+     {0.25, -4.0, 3.0, 0.0, 0x1p-1022, 0x1p-1023, kInf},
+     {-2, 2, -9999, -9999, -1022, -9999, 1024}},
+    // Above 8 the error of the logarithm shows.
+    {greaterPowerOf2, {5.0, 8.0, above(8.0), 0.3}, {3, 3, 3, -1}},
+    {FPS_ASinh, {1.0}, {0.88137358701954294}},
+    {FPS_ACosh, {2.0, 0.5}, {1.3169578969248166, kNaN}},
+    {FPS_ATanh, {0.5, 1.0}, {0.54930614433405489, kInf}},
 };
 
 TEST_F(FloatingPointSupportTest, UnaryOperationsAtTheirBoundaries) {
-  for (const UnaryRow& row : kUnaryRows) {
-    EXPECT_EQ(bitsOf(row.operation(row.x)), bitsOf(row.expected))
-        << "row " << &row - kUnaryRows << ": " << row.operation(row.x)
-        << " instead of " << row.expected << " for " << row.x;
+  for (const auto& [operation, x, expected] : kUnaryCases) {
+    ASSERT_EQ(x.size(), expected.size());
+    for (std::size_t i = 0; i < x.size(); ++i) {
+      EXPECT_EQ(bitsOf(operation(x[i])), bitsOf(expected[i]))
+          << testing::PrintToString(x) << "[" << i << "] gave "
+          << operation(x[i]) << " instead of " << expected[i];
+    }
   }
   EXPECT_EQ(bitsOf(FPS_Log2(8)), bitsOf(FPS_Log2(8.0)));
   EXPECT_THAT(messages(), IsEmpty());
@@ -246,48 +200,41 @@ double within(double a, double b) {
   return FPS_ValuesAreApproxEqual(a, b, tol);
 }
 
-struct BinaryRow {
+struct BinaryCase {
   double (*operation)(double, double);
-  double a, b;
-  double expected;
+  std::vector<double> a, b, expected;
 };
 
-const BinaryRow kBinaryRows[] = {
-    {equal, kNaN, -kNaN, 1},
-    {equal, kNaN, 1.0, 0},
-    {equal, kInf, -kInf, 0},
-    {equal, kInf, kInf, 1},
-    {equal, 0.0, -0.0, 1},
-    {equal, 1.0, above(1.0), 0},
-    {approxEqual, 1.0, 1.0 + 1e-9, 1},
-    {approxEqual, 1e9, 1e9 + 1.0, 1},
-    {approxEqual, 0.0, 2e-8, 0},
-    {approxEqual, 0.0, kTolerance, 0},
-    {approxEqual, 0.0, below(kTolerance), 1},
-    {approxEqual, -4.0, -4.0 + 4 * kTolerance, 0},
-    {approxEqual, -4.0, below(-4.0 + 4 * kTolerance), 1},
-    {approxEqual, kMax, -kMax, 0},
-    {approxEqual, kMax, kInf, 0},
-    {approxEqual, kNaN, kNaN, 1},
-    {within<0>, 1.0, 1.0, 0},
-    {within<1>, 3.0, 5.0, 1},
-    {within<1>, 0.0, 5.0, 0},
-    {FPS_SimulinkAlikeModulo, -7.0, 3.0, 2.0},
-    {FPS_SimulinkAlikeModulo, 7.0, -3.0, -2.0},
-    {FPS_SimulinkAlikeModulo, 5.0, -0.0, 5.0},
-    {FPS_SimulinkAlikeModulo, -1e-300, 3.0, 3.0},
-    {FPS_SimulinkAlikeModulo, -kTiny, 3.0, -kTiny},  // the quotient is -0
-    {FPS_SimulinkAlikeModulo, 1.0, kInf, kNaN},
-    {FPS_SimulinkAlikeRem, -7.0, 3.0, -1.0},
-    {FPS_SimulinkAlikeRem, 7.0, -3.0, 1.0},
-    {FPS_SimulinkAlikeRem, kInf, 0.0, 0.0},
-    {FPS_SimulinkAlikeRem, 0x1p70, 1.0, 0x1p70 - 0x1p63},
+const BinaryCase kBinaryCases[] = {
+    {equal,
+     {kNaN, kNaN, kInf, kInf, 0.0, 1.0},
+     {-kNaN, 1.0, -kInf, kInf, -0.0, above(1.0)},
+     {1, 0, 0, 1, 1, 0}},
+    {approxEqual,
+     {1.0, 1e9, 0.0, 0.0, 0.0, -4.0, -4.0, kMax, kMax, kNaN},
+     {1.0 + 1e-9, 1e9 + 1.0, 2e-8, kTolerance, below(kTolerance),
+      -4.0 + 4 * kTolerance, below(-4.0 + 4 * kTolerance), -kMax, kInf, kNaN},
+     {1, 1, 0, 0, 1, 0, 1, 0, 0, 1}},
+    {within<0>, {1.0}, {1.0}, {0}},
+    {within<1>, {3.0, 0.0}, {5.0, 5.0}, {1, 0}},
+    // The quotient of the tiny value is -0.
+    {FPS_SimulinkAlikeModulo,
+     {-7.0, 7.0, 5.0, -1e-300, -kTiny, 1.0},
+     {3.0, -3.0, -0.0, 3.0, 3.0, kInf},
+     {2.0, -2.0, 5.0, 3.0, -kTiny, kNaN}},
+    {FPS_SimulinkAlikeRem,
+     {-7.0, 7.0, kInf, 0x1p70},
+     {3.0, -3.0, 0.0, 1.0},
+     {-1.0, 1.0, 0.0, 0x1p70 - 0x1p63}},
 };
 
 TEST_F(FloatingPointSupportTest, BinaryOperationsAtTheirBoundaries) {
-  for (const BinaryRow& row : kBinaryRows) {
-    EXPECT_EQ(bitsOf(row.operation(row.a, row.b)), bitsOf(row.expected))
-        << "row " << &row - kBinaryRows << ": " << row.operation(row.a, row.b);
+  for (const auto& [operation, a, b, expected] : kBinaryCases) {
+    ASSERT_TRUE(a.size() == b.size() && a.size() == expected.size());
+    for (std::size_t i = 0; i < a.size(); ++i) {
+      EXPECT_EQ(bitsOf(operation(a[i], b[i])), bitsOf(expected[i]))
+          << a[i] << ", " << b[i] << " gave " << operation(a[i], b[i]);
+    }
   }
 }
 
@@ -298,38 +245,33 @@ TEST_F(FloatingPointSupportTest, NegativeValueForAnUnsignedCastAsserts) {
   EXPECT_EQ(messages().size(), 3U);
 }
 
-struct DivisorRow {
-  std::vector<double> values;
-  double expected;
-  std::size_t assertions;
-};
-
 TEST_F(FloatingPointSupportTest, EveryStepOfADivisorAsserts) {
-  const DivisorRow divisors[] = {
-      {{12, 8}, 4, 3},      {{5, 0}, 5, 1},         {{0, 0}, 0, 1},
-      {{-12, 8}, -4, 3},    {{0.75, 0.5}, 0.25, 3}, {{kNaN, 1}, kNaN, 2},
-      {{1, kNaN}, kNaN, 1}, {{kInf, 2}, kNaN, 2},   {{2, kInf}, kNaN, 3},
+  struct Row {
+    bool isMultiple;
+    std::vector<double> values;
+    double expected;
+    std::size_t assertions;
   };
-  for (DivisorRow row : divisors) {
-    const auto before = row.values;
+  const Row rows[] = {
+      {false, {12, 8}, 4, 3},        {false, {5, 0}, 5, 1},
+      {false, {0, 0}, 0, 1},         {false, {-12, 8}, -4, 3},
+      {false, {0.75, 0.5}, 0.25, 3}, {false, {kNaN, 1}, kNaN, 2},
+      {false, {1, kNaN}, kNaN, 1},   {false, {kInf, 2}, kNaN, 2},
+      {false, {2, kInf}, kNaN, 3},   {true, {0.5, 0.75, 1.0}, 3.0, 7},
+      {true, {4, 6}, 12, 4},         {true, {0, 0}, kNaN, 1}};
+  for (const Row& row : rows) {
+    std::vector<double> values = row.values;
+    SCOPED_TRACE(testing::PrintToString(values));
     clearMessages();
-    EXPECT_EQ(bitsOf(FPS_FindGreatestCommonDivisor(row.values.data())),
-              bitsOf(row.expected));
-    EXPECT_EQ(messages().size(), row.assertions) << before[0];
-    EXPECT_THAT(messages()[0],
-                testing::HasSubstr("Math/FPS_FloatingPointSupport.cpp_"));
-    EXPECT_TRUE(std::isnan(row.expected) || row.values == before);
-  }
-  const DivisorRow multiples[] = {
-      {{0.5, 0.75, 1.0}, 3.0, 7}, {{4, 6}, 12, 4}, {{0, 0}, kNaN, 1}};
-  for (DivisorRow row : multiples) {
-    const auto before = row.values;
-    clearMessages();
-    EXPECT_EQ(bitsOf(FPS_FindLeastCommonMultiple(
-                  static_cast<int>(row.values.size()), row.values.data())),
-              bitsOf(row.expected));
-    EXPECT_EQ(messages().size(), row.assertions) << before[0];
-    EXPECT_EQ(row.values, before);
+    const double result =
+        row.isMultiple ? FPS_FindLeastCommonMultiple(
+                             static_cast<int>(values.size()), values.data())
+                       : FPS_FindGreatestCommonDivisor(values.data());
+    EXPECT_EQ(bitsOf(result), bitsOf(row.expected));
+    EXPECT_EQ(messages().size(), row.assertions);
+    EXPECT_THAT(messages(), testing::Each(testing::HasSubstr(
+                                "Math/FPS_FloatingPointSupport.cpp_")));
+    EXPECT_TRUE(std::isnan(row.expected) || values == row.values);
   }
 }
 
@@ -459,6 +401,12 @@ TEST_F(FloatingPointSupportTest, EveryBuildGivesTheSameBits) {
     std::function<double(double, double)> operation;
     std::uint64_t recorded;
   };
+  const auto roundByHighWord = [](double a, double b) {
+    return FPS_RoundOffBits(a, static_cast<int>(bitsOf(b) >> 32));
+  };
+  const auto roundToFewBits = [](double a, double b) {
+    return FPS_RoundOffBits(a, static_cast<int>(bitsOf(b) % 64));
+  };
   const auto both = [](double (*operation)(double)) {
     return [operation](double a, double b) { return operation(a * b); };
   };
@@ -467,16 +415,8 @@ TEST_F(FloatingPointSupportTest, EveryBuildGivesTheSameBits) {
       {"remainder", FPS_SimulinkAlikeRem, 0xC9DF848BF21AA200},
       {"square root", both(FPS_SimulinkAlikeSqrt), 0xF5141C392D40D54A},
       {"approximately equal", approxEqual, 0xCD4F98AB98233825},
-      {"round off bits",
-       [](double a, double b) {
-         return FPS_RoundOffBits(a, static_cast<int>(bitsOf(b) >> 32));
-       },
-       0x8139BCC10F9BC465},
-      {"round off to few bits",
-       [](double a, double b) {
-         return FPS_RoundOffBits(a, static_cast<int>(bitsOf(b) % 64));
-       },
-       0x9676B81054692057},
+      {"round off bits", roundByHighWord, 0x8139BCC10F9BC465},
+      {"round off to few bits", roundToFewBits, 0x9676B81054692057},
       {"round off digits", both(FPS_RoundOffDigits), 0x309537D69A6E6DEE},
       {"round", both(FPS_Round), 0x085F81F263F18458},
       {"round up", both(FPS_RoundUp), 0xEDC1FD04D5FB9A9C},
