@@ -1,4 +1,5 @@
-// Runs each test in an empty working directory of its own.
+// Runs each test in an empty working directory of its own; a listener that
+// records.
 
 #ifndef DIAGNOSTICS_HX_FILEFIXTURE_H
 #define DIAGNOSTICS_HX_FILEFIXTURE_H
@@ -8,6 +9,7 @@
 #include <iterator>
 #include <string>
 
+#include "Diagnostics/HX_TimingListener.h"
 #include "support/HX_TestFixture.h"
 
 class HX_FileFixture : public HX_TestFixture {
@@ -36,6 +38,20 @@ class HX_FileFixture : public HX_TestFixture {
 
  private:
   std::filesystem::path m_Previous = std::filesystem::current_path();
+};
+
+/// Installed while it lives; notes each run as "name start+duration ".
+class HX_RunRecorder : public HX_TimingListener {
+ public:
+  HX_RunRecorder() { install(this); }
+  ~HX_RunRecorder() override { install(nullptr); }
+  void runEnded(const char* name, std::int64_t start,
+                std::int64_t duration) override {
+    runs += name + (" " + std::to_string(start)) + "+" +
+            std::to_string(duration) + " ";
+  }
+
+  std::string runs;
 };
 
 #endif  // DIAGNOSTICS_HX_FILEFIXTURE_H

@@ -4,7 +4,6 @@
 #include <limits>
 
 #include "Diagnostics/HX_FileFixture.h"
-#include "Diagnostics/HX_TimingListener.h"
 #include "SystemServices/HX_BuildNumber.h"
 #include "platform/matlab/HX_MexInterface.h"
 
@@ -64,20 +63,19 @@ TEST_F(DebugServerTest, NestedRunTimesAreLoggedAndPrinted) {
 
 TEST_F(DebugServerTest, EndsThatDoNotMatchAreReported) {
   for (const char* name : {"A", "B", "C"}) m_Server.runTimeStart(name);
-  m_Window.clear();
-  m_Server.runTimeEnd("X");
   const std::string invalid =
       "Invalid END runtime - no active START found with that name\n";
-  EXPECT_EQ(m_Window, invalid);
-  m_Server.runTimeEnd("B");
-  const std::string missing =
-      "Missing END runtimes\n" + line("  END   B", "          0\xB5s ");
-  EXPECT_EQ(m_Window, invalid + missing);
-  m_Server.runTimeEnd("C");
-  m_Server.runTimeEnd("A");
-  const std::string rest = invalid + line("END   A", "          0\xB5s ");
-  EXPECT_EQ(m_Window, invalid + missing + rest);
-  EXPECT_THAT(log(), EndsWith(m_Window));
+  const std::string rows[][2] = {
+      {"X", invalid},
+      {"B", "Missing END runtimes\n" + line("  END   B", "          0\xB5s ")},
+      {"C", invalid},
+      {"A", line("END   A", "          0\xB5s ")}};
+  for (const auto& [name, written] : rows) {
+    m_Window.clear();
+    m_Server.runTimeEnd(name.c_str());
+    EXPECT_EQ(m_Window, written) << name;
+    EXPECT_THAT(log(), EndsWith(written));
+  }
 }
 
 TEST_F(DebugServerTest, LongNamesAndDeepNestingAreCut) {
@@ -112,15 +110,11 @@ TEST_F(DebugServerTest, ResultsAreWrittenByteForByte) {
     m_Clock.ticks += ticks;
     m_Server.clockStop(clock);
   };
-  interval(eClockCommon3, 700);
-  interval(eClockCommon3, 1300);
-  interval(eClockCommon3, 2);
+  for (const int ticks : {700, 1300, 2}) interval(eClockCommon3, ticks);
   m_Server.clockStop(eClockCommon3);
   m_Server.clockStart(eClockEvalMlExpr);
   m_Clock.ticks += 5;
-  m_Server.clockStart(eClockEvalMlExpr);
-  m_Clock.ticks += 5;
-  m_Server.clockStop(eClockEvalMlExpr);
+  interval(eClockEvalMlExpr, 5);
   interval(eClockCommon20, 1);
   m_Server.clockReset(eClockCommon20);
   m_Server.printCurrentResults("50% done");
@@ -205,26 +199,26 @@ TEST_F(DebugServerTest, ValuesOutsideTheEnumerationsAreIgnored) {
 }
 
 TEST_F(DebugServerTest, ModelInformationIsCutToItsFields) {
-  const std::string text(300, 't');
-  HX_BuildNumber build;
+  const std::string text(300, 't'), rule(52, '=');
+  std::string model(300, 'm');
+  HX_BuildNumber undefined, build;
+  const auto expectLogged = [&](HX_BuildNumber& given, char* name,
+                                const std::string& shownName,
+                                std::size_t version, std::size_t time) {
+    m_Server.setModelInfo(&given, name);
+    m_Server.logModelInfo();
+    EXPECT_THAT(
+        log(),
+        EndsWith("\n\n" + rule + "\nModel name: " + shownName +
+                 "\nVersion:    " + (version > 0 ? "1.2\t from " : "") +
+                 text.substr(0, version) +
+                 "\nBuildTime:  " + text.substr(0, time) +
+                 "\nBuildDate:  " + text.substr(0, time) + "\n" + rule + "\n"));
+  };
   build.definedBuildNumber(1, 2, 0, 0, "", false, true, 0, "", "", text.c_str(),
                            (text + "u").c_str());
-  std::string model(300, 'm');
-  m_Server.setModelInfo(&build, model.data());
-  m_Server.logModelInfo();
-  const std::string rule(52, '=');
-  EXPECT_EQ(log(), "\n\n" + rule + "\nModel name: " + model.substr(41) +
-                       "\nVersion:    1.2\t from " + text.substr(0, 89) +
-                       "\nBuildTime:  " + text.substr(0, 49) +
-                       "\nBuildDate:  " + text.substr(0, 49) + "\n" + rule +
-                       "\n");
-  HX_BuildNumber undefined;
-  m_Server.setModelInfo(&undefined, nullptr);
-  m_Server.logModelInfo();
-  EXPECT_THAT(log(), EndsWith(rule +
-                              "\nModel name: \nVersion:    \nBuildTime:"
-                              "  \nBuildDate:  \n" +
-                              rule + "\n"));
+  expectLogged(build, model.data(), model.substr(41), 89, 49);
+  expectLogged(undefined, nullptr, "", 0, 0);
 }
 
 TEST_F(DebugServerTest, UnopenableFilesAreNotReported) {
@@ -257,16 +251,7 @@ TEST_F(DebugServerTest, LatestInstanceIsRegistered) {
 }
 
 TEST_F(DebugServerTest, ListenerHearsRunTimes) {
-  struct Listener : HX_TimingListener {
-    Listener() { install(this); }
-    ~Listener() override { install(nullptr); }
-    void runEnded(const char* name, std::int64_t start,
-                  std::int64_t duration) override {
-      runs += name + (" " + std::to_string(start)) + "+" +
-              std::to_string(duration) + " ";
-    }
-    std::string runs;
-  } listener;
+  const HX_RunRecorder listener;
   m_Clock.ticks = 10;
   for (const char* name : {"A", "dropped"}) m_Server.runTimeStart(name);
   m_Clock.ticks += 7;
