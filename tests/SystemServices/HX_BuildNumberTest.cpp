@@ -9,19 +9,18 @@ namespace {
 using BuildNumberTest = HX_TestFixture;
 
 TEST_F(BuildNumberTest, VersionTextShowsTheBuildKindBehindAThirdNumber) {
-  struct Case {
+  const struct {
     int third, counter;
     bool isFirstKind, isRelease;
     const char* version;
-  };
-  const Case cases[] = {
-      {1, 5, false, false, "6.0.1.B5"}, {1, 5, false, true, "6.0.1"},
+  } cases[] = {
+      {1, 5, false, false, "6.0.1.B5"}, {1, -2, false, true, "6.0.1"},
       {2, 3, true, false, "6.0.2.P3"},  {2, 3, true, true, "6.0.2"},
       {0, 5, false, false, "6.0"},      {-1, 5, true, false, "6.0"},
       {0, 0, false, true, "6.0"},       {1, -2, false, false, "6.0.1.B-2"},
   };
   HX_BuildNumber build;
-  for (const Case& c : cases) {
+  for (const auto& c : cases) {
     SCOPED_TRACE(c.version);
     EXPECT_TRUE(build.definedBuildNumber(6, 0, c.third, c.counter, "4711",
                                          c.isFirstKind, c.isRelease, 9, "6.0",
@@ -99,30 +98,28 @@ class OfficialVersionTest : public HX_TestFixture {
 };
 
 TEST_F(OfficialVersionTest, EvaluationKeepsWhatItGot) {
-  struct Case {
+  const char *const kNoVersion = "- version -", *const kNoDate =
+                                                    "- release date -";
+  const struct {
     const char* why;
-    int status;
     mxArray* answer;
     bool result;
     const char* version;
     const char* date;
-  };
-  const Case cases[] = {
-      {"failure with an answer", 1, structure("1", "2"), false, "", ""},
-      {"no answer", 0, nullptr, false, "", ""},
-      {"complete", 0, structure("6.1", "May 2007"), true, "6.1", "May 2007"},
-      {"failure", 1, nullptr, false, "6.1", "May 2007"},
-      {"no date", 0, structure("6.2", nullptr), false, "6.2",
-       "- release date -"},
-      {"no version", 0, structure(nullptr, "Jun"), false, "- version -",
-       "- release date -"},
-      {"not a structure", 0, mxCreateString("x"), false, "- version -",
-       "- release date -"},
-      {"an empty version", 0, structure("", "Jul"), true, "", "Jul"},
+    int status = 0;
+  } cases[] = {
+      {"failure with an answer", structure("1", "2"), false, "", "", 1},
+      {"no answer", nullptr, false, "", ""},
+      {"complete", structure("6.1", "May 2007"), true, "6.1", "May 2007"},
+      {"failure", nullptr, false, "6.1", "May 2007", 1},
+      {"no date", structure("6.2", nullptr), false, "6.2", kNoDate},
+      {"no version", structure(nullptr, "Jun"), false, kNoVersion, kNoDate},
+      {"not a structure", mxCreateString("x"), false, kNoVersion, kNoDate},
+      {"an empty version", structure("", "Jul"), true, "", "Jul"},
   };
   HX_OfficialVersion official;
   EXPECT_FALSE(official.evalBrennicVersionAndReleaseDate()) << "no function";
-  for (const Case& c : cases) {
+  for (const auto& c : cases) {
     SCOPED_TRACE(c.why);
     HX_RegisterMatlabFunction("hx_config", [&](int outputs, mxArray** output,
                                                int inputs, mxArray** input) {
