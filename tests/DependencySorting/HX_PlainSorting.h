@@ -38,7 +38,7 @@ class HX_PlainSorting {
     for (Node node : m_Nodes)
       vertexOf[node] = &m_Graph.emplace_back(Vertex{node, {}, 0, false});
     ignored = 0;
-    for (auto [first, second] : m_Dependencies) {
+    for (auto [first, second] : std::exchange(m_Dependencies, {})) {
       if (vertexOf.count(first) == 0 || vertexOf.count(second) == 0) {
         ++ignored;
         continue;
@@ -46,7 +46,6 @@ class HX_PlainSorting {
       vertexOf[first]->out.push_back(vertexOf[second]);
       ++vertexOf[second]->in;
     }
-    m_Dependencies.clear();
     return sortGraph();
   }
 
