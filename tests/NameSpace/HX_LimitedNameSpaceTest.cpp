@@ -1,8 +1,10 @@
 #include "NameSpace/HX_LimitedNameSpace.h"
 
+#include <algorithm>
 #include <iterator>
 #include <map>
 #include <random>
+#include <sstream>
 
 #include "NameSpace/HX_FailingController.h"
 #include "platform/model/HX_Options.h"
@@ -20,66 +22,32 @@ class LimitedNameSpaceTest : public HX_TestFixture {
   HX_OptionsExt m_Options;
 };
 
-struct Step {
-  char operation;  // '+' add, '-' remove, 'u' addUnique, 'd' derive, 'l' derive
-                   // with length adaption
-  const char* name;
-  const char* result = nullptr;
-};
+#define HX_29 "abcdefghijklmnopqrstuvwxyz012"
+#define HX_SHORT "abcdefghijklmno__tuvwxyz01234"
 
 struct StepsCase {
   const char* why;
   bool limit;
-  std::vector<Step> steps;
+  // Each an operation and a name: + add, - remove, u addUnique, d derive,
+  // l derive with length adaption; the result follows after =.
+  const char* steps;
 };
 
-#define HX_29 "abcdefghijklmnopqrstuvwxyz012"
-
 const StepsCase kStepsCases[] = {
-    {"free names stay", false, {{'d', "x", "x"}, {'u', "x", "x"}}},
-    {"variants in turn",
-     false,
-     {{'+', "x"}, {'u', "x", "x_a"}, {'u', "x", "x_b"}, {'u', "X", "X"}}},
-    {"deriving alone repeats itself",
-     false,
-     {{'+', "x"}, {'+', "x_a"}, {'d', "x", "x_b"}, {'d', "x", "x_b"}}},
-    {"a variant counts from its own start",
-     false,
-     {{'+', "x"}, {'u', "x", "x_a"}, {'u', "x_a", "x_a_a"}}},
-    {"a freed suffix is not used again",
-     false,
-     {{'+', "x"},
-      {'u', "x", "x_a"},
-      {'u', "x", "x_b"},
-      {'-', "x_a"},
-      {'u', "x", "x_c"}}},
-    {"adding again keeps the counter, removing resets it",
-     false,
-     {{'+', "x"},
-      {'u', "x", "x_a"},
-      {'u', "x", "x_b"},
-      {'-', "x_a"},
-      {'+', "x"},
-      {'u', "x", "x_c"},
-      {'-', "x"},
-      {'+', "x"},
-      {'u', "x", "x_a"}}},
-    {"the limit keeps 29 characters",
-     true,
-     {{'+', HX_29 "34"}, {'u', HX_29 "34", HX_29 "_a"}}},
-    {"a shortened free name is not derived",
-     false,
-     {{'l', HX_29 "3456", "abcdefghijklmno__tuvwxyz0123456"}}},
-    {"taken variants of the shortened name do not count for the name",
-     true,
-     {{'+', "abcdefghijklmno__tuvwxyz0123456"},
-      {'u', "abcdefghijklmno__tuvwxyz0123456",
-       "abcdefghijklmno__tuvwxyz01234_a"},
-      {'u', "abcdefghijklmno__tuvwxyz0123456",
-       "abcdefghijklmno__tuvwxyz01234_b"},
-      {'-', "abcdefghijklmno__tuvwxyz0123456"},
-      {'+', "abcdefghijklmno__tuvwxyz0123456"},
-      {'l', HX_29 "3456", HX_29 "_b"}}},
+    {"free names stay", false, "dx=x ux=x"},
+    {"variants in turn", false, "+x ux=x_a ux=x_b uX=X"},
+    {"deriving alone repeats itself", false, "+x +x_a dx=x_b dx=x_b"},
+    {"a variant counts from its own start", false, "+x ux=x_a ux_a=x_a_a"},
+    {"a freed suffix is not used again", false, "+x ux=x_a ux=x_b -x_a ux=x_c"},
+    {"adding again keeps the counter, removing resets it", false,
+     "+x ux=x_a ux=x_b -x_a +x ux=x_c -x +x ux=x_a"},
+    {"the limit keeps 29 characters", true,
+     "+" HX_29 "34 u" HX_29 "34=" HX_29 "_a"},
+    {"a shortened free name is not derived", false,
+     "l" HX_29 "3456=" HX_SHORT "56"},
+    {"taken variants of the shortened name do not count for the name", true,
+     "+" HX_SHORT "56 u" HX_SHORT "56=" HX_SHORT "_a u" HX_SHORT "56=" HX_SHORT
+     "_b -" HX_SHORT "56 +" HX_SHORT "56 l" HX_29 "3456=" HX_29 "_b"},
 };
 
 TEST_F(LimitedNameSpaceTest, FollowsTheCounters) {
@@ -87,15 +55,18 @@ TEST_F(LimitedNameSpaceTest, FollowsTheCounters) {
     SCOPED_TRACE(row.why);
     m_Options.setLimitVariableNameLength(row.limit);
     HX_LimitedNameSpace names;
-    for (const Step& step : row.steps) {
-      KyCXString s(step.name);
-      switch (step.operation) {
+    std::istringstream steps(row.steps);
+    for (std::string step; steps >> step;) {
+      SCOPED_TRACE(step);
+      const std::size_t equals = std::min(step.find('='), step.size());
+      KyCXString s(step.substr(1, equals - 1).c_str());
+      switch (step[0]) {
         case '+':
           names.add(&s);
-          break;
+          continue;
         case '-':
           names.remove(s);
-          break;
+          continue;
         case 'u':
           names.addUnique(&s);
           break;
@@ -105,9 +76,8 @@ TEST_F(LimitedNameSpaceTest, FollowsTheCounters) {
         default:
           names.deriveUniqueStringAdaptLength(s);
       }
-      if (step.result == nullptr) continue;
-      EXPECT_EQ(s, KyCXString(step.result));
-      EXPECT_EQ(names.isDefined(&s), step.operation == 'u');
+      EXPECT_EQ(s, step.c_str() + equals + 1);
+      EXPECT_EQ(names.isDefined(&s), step[0] == 'u');
     }
   }
 }
@@ -141,10 +111,10 @@ struct PlainNames {
 
 struct MixCase {
   const char* why;
-  int shortest, longest;  // length of the drawn names
-  unsigned characters;    // taken from the front of kUnits
-  unsigned switching;     // per mille of steps that switch the limit option
-  unsigned removing;      // per cent of steps that remove
+  unsigned shortest, longest;  // length of the drawn names
+  unsigned characters;         // taken from the front of kUnits
+  unsigned switching;  // per mille of steps that switch the limit option
+  unsigned removing;   // per cent of steps that remove
 };
 
 constexpr unsigned short kUnits[] = {'a', '_', 'z', 'Z', 0x100, 0x101, 0};
@@ -168,8 +138,7 @@ TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
       PlainNames plain;
       for (int i = 0; i < 2500; ++i) {
         std::vector<unsigned short> text(
-            static_cast<unsigned>(row.shortest) +
-            random() % static_cast<unsigned>(row.longest - row.shortest + 1));
+            row.shortest + random() % (row.longest - row.shortest + 1));
         for (auto& unit : text) unit = kUnits[random() % row.characters];
         KyCXString s(text.data(), static_cast<int>(text.size()));
         if (random() % 4 == 0 && !plain.counters.empty())

@@ -125,6 +125,8 @@ TEST_F(NameSpaceTest, ScopesListedTwiceOrInACycleAreDestroyedOnce) {
 // A scope in the plainest form, and the searches as their definition reads.
 struct PlainScope {
   PlainScope* parent;
+  Scope* scope;  // which this one mirrors
+  bool isOwned;  // by another scope
   std::vector<PlainScope*> children;
   std::map<int, HxCSymbol*> entries;  // null: without scope data
 
@@ -149,7 +151,7 @@ struct PlainScope {
 
 struct ForestCase {
   const char* why;
-  int steps;
+  unsigned steps;
   unsigned irregular;  // per cent of the scopes listed elsewhere or not at all
   unsigned chain;      // per cent of the scopes put into the latest one
   unsigned failing;    // per cent of the allocations
@@ -171,23 +173,16 @@ class Forest {
   Forest(HxCXStringIdServer& ids, const ForestCase& row, unsigned seed)
       : m_Names(&ids), m_Row(row), m_Random(seed) {}
   ~Forest() {
-    for (std::size_t i = 0; i < m_Scopes.size(); ++i)
-      if (!m_IsOwned[i]) delete m_Scopes[i];
+    for (const PlainScope& plain : m_Plain)
+      if (!plain.isOwned) delete plain.scope;
   }
 
   void step(HxCSymbol* symbol) {
-    switch (m_Plain.empty() ? 0 : random(20)) {
-      case 0:
-        return makeScope();
-      case 1:
-        return random(100) < m_Row.irregular ? listScope() : makeScope();
-      case 2:
-      case 3:
-      case 4:
-        return removeName();
-      default:
-        return defineName(symbol);
-    }
+    const std::size_t choice = m_Plain.empty() ? 0 : random(20);
+    if (choice > 4) return defineName(symbol);
+    if (choice > 1) return removeName();
+    if (choice == 1 && random(100) < m_Row.irregular) return listScope();
+    makeScope();
   }
 
   void compare() {
@@ -198,7 +193,7 @@ class Forest {
     const int key = randomKey();
     SCOPED_TRACE(testing::Message() << "scope " << at << " key " << key);
     const PlainScope& plain = m_Plain[at];
-    m_Names.setScope(m_Scopes[at]);
+    m_Names.setScope(plain.scope);
     HxCSymbol* value = nullptr;
     const bool isAround = plain.outward(key, value);
     if (!isAround) value = plain.lookupBelow(key);
@@ -217,23 +212,20 @@ class Forest {
                ? static_cast<int>(random(4)) - 2
                : static_cast<int>(random(m_Row.names)) * 1024 - 100000;
   }
-  std::size_t randomParent() {
-    return random(100) < m_Row.chain ? m_Plain.size() - 1
-                                     : random(m_Plain.size());
-  }
+  PlainScope& randomScope() { return m_Plain[random(m_Plain.size())]; }
 
   void makeScope() {
-    const bool isRoot = m_Plain.empty() || random(40) == 0;
-    const std::size_t parent = isRoot ? 0 : randomParent();
-    Scope* const around = isRoot ? nullptr : m_Scopes[parent];
+    PlainScope* parent = nullptr;
+    if (!m_Plain.empty() && random(40) != 0)
+      parent = random(100) < m_Row.chain ? &m_Plain.back() : &randomScope();
+    Scope* const around = parent == nullptr ? nullptr : parent->scope;
     const bool byHand = random(100) < m_Row.irregular;
     m_Names.setScope(nullptr);
     Scope* const scope = byHand ? new Scope(around) : m_Names.newScope(around);
     if (scope == nullptr) return;
-    m_Scopes.push_back(scope);
-    m_IsOwned.push_back(!byHand && !isRoot);
-    m_Plain.push_back({isRoot ? nullptr : &m_Plain[parent], {}, {}});
-    if (!byHand && !isRoot) m_Plain[parent].children.push_back(&m_Plain.back());
+    const bool isOwned = !byHand && parent != nullptr;
+    m_Plain.push_back({parent, scope, isOwned, {}, {}});
+    if (isOwned) parent->children.push_back(&m_Plain.back());
   }
 
   // Any older scope may list a younger one, so that no cycle arises.
@@ -245,37 +237,35 @@ class Forest {
       while (&m_Plain[by] != m_Plain[child].parent) by = random(child);
     // Every path doubles the plain search: keep them few.
     if (m_Plain[by].children.size() > 3) return;
-    ASSERT_TRUE(m_Scopes[by]->addChild(m_Scopes[child]));
-    m_IsOwned[child] = true;
+    ASSERT_TRUE(m_Plain[by].scope->addChild(m_Plain[child].scope));
+    m_Plain[child].isOwned = true;
     m_Plain[by].children.push_back(&m_Plain[child]);
   }
 
   void defineName(HxCSymbol* symbol) {
-    const std::size_t at = random(m_Plain.size());
+    PlainScope& plain = randomScope();
     const int key = randomKey();
-    const bool isNew = m_Plain[at].entries.count(key) == 0;
-    m_Names.setScope(m_Scopes[at]);
+    const bool isNew = plain.entries.count(key) == 0;
+    m_Names.setScope(plain.scope);
     if (random(3) == 0) symbol = nullptr;
     const bool isEntered = symbol == nullptr ? m_Names.defineIdn(key)
                                              : m_Names.defineIdn(key, symbol);
     ASSERT_TRUE(isEntered == isNew || (isNew && m_Row.failing != 0));
-    if (isEntered) m_Plain[at].entries.emplace(key, symbol);
+    if (isEntered) plain.entries.emplace(key, symbol);
   }
 
   void removeName() {
-    const std::size_t at = random(m_Plain.size());
+    PlainScope& plain = randomScope();
     const int key = randomKey();
-    HxCSmbScopeData* const data = m_Scopes[at]->lookupInScope(key);
-    m_Scopes[at]->removeKey(key);
+    HxCSmbScopeData* const data = plain.scope->lookupInScope(key);
+    plain.scope->removeKey(key);
     delete data;
-    m_Plain[at].entries.erase(key);
+    plain.entries.erase(key);
   }
 
   HxCNameSpace m_Names;
   const ForestCase& m_Row;
   std::mt19937 m_Random;
-  std::vector<Scope*> m_Scopes;
-  std::vector<bool> m_IsOwned;
   std::deque<PlainScope> m_Plain;
 };
 
@@ -287,7 +277,7 @@ TEST_F(NameSpaceTest, SearchesAgreeWithThePlainWalkAndTreesReturnAllMemory) {
       memory.setPercent(row.failing, seed);
       {
         Forest forest(m_Ids, row, seed);
-        for (unsigned i = 0; i < static_cast<unsigned>(row.steps); ++i) {
+        for (unsigned i = 0; i < row.steps; ++i) {
           ASSERT_NO_FATAL_FAILURE(forest.step(symbol(i % 50)));
           for (int query = 0; query < 3; ++query)
             ASSERT_NO_FATAL_FAILURE(forest.compare());
