@@ -88,64 +88,58 @@ TEST_F(TraceTest, LevelsReportWhenVerboseAndOnlyDeadlyOnesElse) {
 
 TEST_F(TraceTest, ControlReportsOnlyWithBothSwitchesOn) {
   HxCControl control;
-  for (int switches = 0; switches < 4; ++switches) {
-    SCOPED_TRACE(switches);
-    HxCControl::setFallThrough(switches & 1);
-    Tracer::setVerbose((switches & 2) != 0);
+  void (*const settings[])() = {
+      [] { HxCControl::setFallThrough(false); },
+      [] { HxCControl::setProductionCodeBehaviour(); },
+      [] { HxCControl::setFallThrough(true); },
+      [] { HxCControl::setDevelopBehaviour(); }};
+  for (int i = 0; i < 8; ++i) {
+    SCOPED_TRACE(i);
+    HxCControl::setFallThrough(i % 4 < 2);  // the opposite
+    settings[i % 4]();
+    Tracer::setVerbose(i >= 4);
     clearMessages();
     EXPECT_FALSE(control.traceFallThrough());
     EXPECT_FALSE(control.traceFallThrough("y.cpp", 7));
     EXPECT_FALSE(control.traceFallThrough("y.cpp", 7, "late"));
-    if (switches == 3)
+    if (i < 6)
+      EXPECT_THAT(messages(), IsEmpty());
+    else
       EXPECT_THAT(
           messages(),
           ElementsAre(StartsWith("1274/6 "),
                       EndsWith("'y.cpp', Line: 7 Reason: cause unknown!]"),
                       EndsWith("'y.cpp', Line: 7 Reason: late]")));
-    else
-      EXPECT_THAT(messages(), IsEmpty());
-  }
-  for (bool develops : {true, false}) {
-    HxCControl::setFallThrough(!develops);
-    develops ? HxCControl::setDevelopBehaviour()
-             : HxCControl::setProductionCodeBehaviour();
-    clearMessages();
-    control.traceFallThrough();
-    EXPECT_EQ(messages().size(), develops ? 1U : 0U);
   }
 }
 
-TEST_F(TraceTest, TraceFileAppendsExactRecords) {
-  using Transformations = HxCTransformationTracer;
-  Transformations::logTransformation("before boot");
-  EXPECT_TRUE(Transformations::boot(m_FileName.c_str()));
-  Transformations::logTransformation("A");
-  Transformations::logTransformation("100%s");
-  Transformations::logTransformation(nullptr);
+TEST_F(TraceTest, TraceFileAppendsExactRecordsUntilShutdownOrAFailedBoot) {
+  using T = HxCTransformationTracer;
+  T::logTransformation("before boot");
+  EXPECT_TRUE(T::boot(m_FileName.c_str()));
+  for (const char* text : {"A", "100%s", static_cast<const char*>(nullptr)})
+    T::logTransformation(text);
   // The second boot closes, and so writes, the first trace.
-  EXPECT_TRUE(Transformations::boot(m_FileName.c_str()));
+  EXPECT_TRUE(T::boot(m_FileName.c_str()));
   EXPECT_EQ(fileContent(), "A \n 100%s \n ");
-  Transformations::logTransformation("");
-  EXPECT_TRUE(Transformations::shutdown());
-  EXPECT_TRUE(Transformations::shutdown());
-  Transformations::logTransformation("after shutdown");
+  T::logTransformation("");
+  for (int shutdowns = 0; shutdowns < 2; ++shutdowns)
+    EXPECT_TRUE(T::shutdown());
+  T::logTransformation("after shutdown");
   EXPECT_EQ(fileContent(), "A \n 100%s \n  \n ");
   EXPECT_THAT(messages(), IsEmpty());
-}
 
-TEST_F(TraceTest, FailedBootReportsTheNameAndEndsTheOldTrace) {
-  using Transformations = HxCTransformationTracer;
-  EXPECT_TRUE(Transformations::boot(m_FileName.c_str()));
   for (const char* name : {"/no/such/folder/t.txt", "", "/"}) {
+    EXPECT_TRUE(T::boot(m_FileName.c_str()));
     clearMessages();
-    EXPECT_FALSE(Transformations::boot(name));
-    Transformations::logTransformation("lost");
+    EXPECT_FALSE(T::boot(name));
+    T::logTransformation("lost");
     EXPECT_THAT(
         messages(),
         ElementsAre("90/3 Cannot create file: " + std::string(name) + "."));
   }
-  EXPECT_FALSE(Transformations::boot(nullptr));
-  EXPECT_EQ(fileContent(), "");
+  EXPECT_FALSE(T::boot(nullptr));
+  EXPECT_EQ(fileContent(), "A \n 100%s \n  \n ");
 }
 
 }  // namespace
