@@ -40,8 +40,8 @@ Units plainSub(const Units& units, int from, int to) {
 }
 
 int plainFind(const Units& units, const Units& text, int from) {
-  const std::size_t at = units.find(text, static_cast<std::size_t>(from));
-  return at == Units::npos ? -1 : static_cast<int>(at);
+  // No place becomes -1.
+  return static_cast<int>(units.find(text, static_cast<std::size_t>(from)));
 }
 
 Units plainReplace(Units units, const Units& what, const Units& by) {
@@ -181,82 +181,67 @@ TEST(CXStringTest, DerivedTextsKeepTheirPromises) {
   }
 }
 
+KyCXString& toIdentifier(KyCXString& t) { return t.makeCIdentifier(false); }
+KyCXString& toCollapsed(KyCXString& t) { return t.makeCIdentifier(true); }
+template <int limit, int marks, KyCXString::ScEPosition position>
+KyCXString& shorten(KyCXString& t) {
+  return t.shortenString(limit, marks, '_', position);
+}
+template <bool front, bool back>
+KyCXString& trim(KyCXString& t) {
+  return t.trim(front, back);
+}
+template <char by, bool collapse>
+KyCXString& whiteSpaceTo(KyCXString& t) {
+  return t.replaceWhiteSpace(by, collapse);
+}
+KyCXString& bare(KyCXString& t) { return t.filterAngleBrackets(); }
+KyCXString& twoToThree(KyCXString& t) { return t.replace("aa", "aaa"); }
+KyCXString& lower(KyCXString& t) { return t.toLower(); }
+KyCXString& upper(KyCXString& t) { return t.toUpper(); }
+
 TEST(CXStringTest, ChangesOfTheText) {
-  using Text = KyCXString;
-  const struct {
-    const char* before;
-    Text& (*change)(Text&);
-    const char* after;
-  } rows[] = {
-      {"1a b  c-\xE4",
-       [](Text& t) -> Text& { return t.makeCIdentifier(false); }, "_1a_b__c__"},
-      {"a  -b _", [](Text& t) -> Text& { return t.makeCIdentifier(true); },
-       "a_b__"},
-      {"", [](Text& t) -> Text& { return t.makeCIdentifier(false); }, ""},
-      {"abcdefghij",
-       [](Text& t) -> Text& {
-         return t.shortenString(7, 2, '_', Text::ePositionMiddle);
-       },
-       "abc__ij"},
-      {"abcdefghij",
-       [](Text& t) -> Text& {
-         return t.shortenString(7, 2, '_', Text::ePositionFront);
-       },
-       "__fghij"},
-      {"abcdefghij",
-       [](Text& t) -> Text& {
-         return t.shortenString(7, 2, '_', Text::ePositionBack);
-       },
-       "abcde__"},
-      {"abcdefghij",
-       [](Text& t) -> Text& {
-         return t.shortenString(10, 2, '_', Text::ePositionBack);
-       },
-       "abcdefghij"},
-      {"abcde",
-       [](Text& t) -> Text& {
-         return t.shortenString(2, 2, '_', Text::ePositionFront);
-       },
-       "de"},
-      {"abc",
-       [](Text& t) -> Text& {
-         return t.shortenString(-1, -1, '_', Text::ePositionBack);
-       },
-       ""},
-      {" \t\n\v\f\ra b ", [](Text& t) -> Text& { return t.trim(true, false); },
-       "a b "},
-      {" a b ", [](Text& t) -> Text& { return t.trim(false, true); }, " a b"},
-      {" \t ", [](Text& t) -> Text& { return t.trim(true, true); }, ""},
-      {"<<a>>", [](Text& t) -> Text& { return t.filterAngleBrackets(); },
-       "<a>"},
-      {"<a", [](Text& t) -> Text& { return t.filterAngleBrackets(); }, "<a"},
-      {"<", [](Text& t) -> Text& { return t.filterAngleBrackets(); }, "<"},
-      {"a \n b",
-       [](Text& t) -> Text& { return t.replaceWhiteSpace('.', false); },
-       "a...b"},
-      {"a \n b ",
-       [](Text& t) -> Text& { return t.replaceWhiteSpace('\xB7', true); },
-       "a\xB7"
-       "b\xB7"},
-      {"aaa", [](Text& t) -> Text& { return t.replace("aa", "aaa"); }, "aaaa"},
-      {"Az[\xC4{`@", [](Text& t) -> Text& { return t.toLower(); },
-       "az[\xC4{`@"},
-      {"Az[\xE4{`@", [](Text& t) -> Text& { return t.toUpper(); },
-       "AZ[\xE4{`@"}};
-  for (const auto& row : rows) {
-    SCOPED_TRACE(row.before);
-    Text text(row.before);
-    EXPECT_EQ(row.change(text), row.after);
-  }
-  EXPECT_EQ(unitsOf(textOf(u"A\u20ACZ\u0100").toLower()), u"a\u20ACz\u0100");
-  EXPECT_EQ(textOf(u"A\u20AC\u0141Z").makeCIdentifier(false), "A__Z");
-  EXPECT_EQ(textOf(u"A\u20AC\u0141Z").makeCIdentifier(true), "A_Z");
-  EXPECT_EQ(unitsOf(textOf(u"<\u20AC>").filterAngleBrackets()), u"\u20AC");
-  EXPECT_EQ(unitsOf(textOf(u"\u20AC \t\u0120").replaceWhiteSpace('.', true)),
-            u"\u20AC.\u0120");
+  constexpr auto kFront = KyCXString::ePositionFront;
+  constexpr auto kMiddle = KyCXString::ePositionMiddle;
+  constexpr auto kBack = KyCXString::ePositionBack;
   // A character above 127 is a unit of its own, not a negative number.
-  EXPECT_EQ(unitsOf(textOf(u"\u20AC \t").replaceWhiteSpace('\xB7', false)),
-            u"\u20AC\u00B7\u00B7");
+  const struct {
+    Units before;
+    KyCXString& (*change)(KyCXString&);
+    Units after;
+  } rows[] = {
+      {u"1a b  c-\u00E4", toIdentifier, u"_1a_b__c__"},
+      {u"A\u20AC\u0141Z", toIdentifier, u"A__Z"},
+      {u"", toIdentifier, u""},
+      {u"a  -b _", toCollapsed, u"a_b__"},
+      {u"A\u20AC\u0141Z", toCollapsed, u"A_Z"},
+      {u"abcdefghij", shorten<7, 2, kMiddle>, u"abc__ij"},
+      {u"abcdefghij", shorten<7, 2, kFront>, u"__fghij"},
+      {u"abcdefghij", shorten<7, 2, kBack>, u"abcde__"},
+      {u"abcdefghij", shorten<10, 2, kBack>, u"abcdefghij"},
+      {u"abcde", shorten<2, 2, kFront>, u"de"},
+      {u"abc", shorten<-1, -1, kBack>, u""},
+      {u" \t\n\v\f\ra b ", trim<true, false>, u"a b "},
+      {u" a b ", trim<false, true>, u" a b"},
+      {u" \t ", trim<true, true>, u""},
+      {u"<<a>>", bare, u"<a>"},
+      {u"<\u20AC>", bare, u"\u20AC"},
+      {u"<a", bare, u"<a"},
+      {u"<", bare, u"<"},
+      {u"a \n b", whiteSpaceTo<'.', false>, u"a...b"},
+      {u"\u20AC \t\u0120", whiteSpaceTo<'.', true>, u"\u20AC.\u0120"},
+      {u"a \n b ", whiteSpaceTo<'\xB7', true>, u"a\u00B7b\u00B7"},
+      {u"\u20AC \t", whiteSpaceTo<'\xB7', false>, u"\u20AC\u00B7\u00B7"},
+      {u"aaa", twoToThree, u"aaaa"},
+      {u"Az[\u00C4{`@", lower, u"az[\u00C4{`@"},
+      {u"A\u20ACZ\u0100", lower, u"a\u20ACz\u0100"},
+      {u"Az[\u00E4{`@", upper, u"AZ[\u00E4{`@"},
+  };
+  for (const auto& [before, change, after] : rows) {
+    KyCXString text = textOf(before);
+    SCOPED_TRACE(text.cstring());
+    EXPECT_EQ(unitsOf(change(text)), after);
+  }
 }
 
 TEST(CXStringTest, NumbersAreWrittenInTheWidthAsked) {
