@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <climits>
+#include <iterator>
 #include <map>
 #include <random>
 
@@ -10,8 +11,6 @@
 
 namespace {
 
-using testing::ElementsAre;
-using testing::IsEmpty;
 using testing::StartsWith;
 
 class StringIdServerTest : public HX_TestFixture {
@@ -21,32 +20,21 @@ class StringIdServerTest : public HX_TestFixture {
   HxCXStringIdServer m_Ids;
 };
 
-struct IdCase {
-  const char* why;
-  std::vector<std::pair<const char*, int>> arrivals;
-};
-
-const IdCase kIdCases[] = {
-    {"one character, twice", {{"a", 97}, {"a", 97}}},
-    {"one sum, two arrivals", {{"ab", 195}, {"ba", 1219}, {"ab", 195}}},
-    {"arrival counts, not length", {{"AAC", 197}, {"ad", 1221}, {"AAC", 197}}},
-    {"the empty string never arrives", {{"", 0}, {"a", 97}, {"", 0}}},
-    {"characters above 127 are negative", {{"\xFF", 1023}, {"\x80", 896}}},
-    {"a sum of 1024 shares id 0",
-     {{"\x7F\x7F\x7F\x7F\x7F\x7F\x7F\x7F\x08", 0}, {"", 0}}},
-};
-
+// Arrival counts, not length; characters above 127 are negative; the empty
+// string never arrives, a sum of 1024 shares its id.
 TEST_F(StringIdServerTest, IdsTellBucketAndArrival) {
-  for (const IdCase& row : kIdCases) {
-    SCOPED_TRACE(row.why);
-    m_Ids.boot();
-    EXPECT_EQ(m_Ids.getString(0), nullptr);
-    for (const auto& [text, id] : row.arrivals) {
-      EXPECT_EQ(m_Ids.getId(text), id);
-      if (*text == 0) continue;
-      EXPECT_STREQ(m_Ids.getString(id), text);
-    }
-    m_Ids.shutdown();
+  const char* const kSum1024 = "\x7F\x7F\x7F\x7F\x7F\x7F\x7F\x7F\x08";
+  const char* const texts[] = {"a",   "a",      "ab",  "ba",   "ab",
+                               "AAC", "ad",     "AAC", "\xFF", "\x80",
+                               "",    kSum1024, ""};
+  const int ids[] = {97,  97,   195, 1219, 195, 197, 1221,
+                     197, 1023, 896, 0,    0,   0};
+  m_Ids.boot();
+  EXPECT_EQ(m_Ids.getString(0), nullptr);
+  for (std::size_t i = 0; i < std::size(texts); ++i) {
+    EXPECT_EQ(m_Ids.getId(texts[i]), ids[i]) << texts[i];
+    if (*texts[i] == 0) continue;
+    EXPECT_STREQ(m_Ids.getString(ids[i]), texts[i]);
   }
 }
 
@@ -122,7 +110,7 @@ TEST_F(StringIdServerTest, DownServerAssertsAndGivesNothing) {
   EXPECT_EQ(m_Ids.getId(nullptr), 0);
   EXPECT_EQ(id, 5);
   EXPECT_EQ(messages().size(), 4U);
-  for (const std::string& m : messages()) EXPECT_THAT(m, StartsWith("7/3 "));
+  EXPECT_THAT(messages(), testing::Each(StartsWith("7/3 ")));
 }
 
 TEST_F(StringIdServerTest, StaysSoundWithoutMemory) {
