@@ -4,6 +4,7 @@
 #ifndef DEPENDENCYSORTING_HX_PLAINSORTING_H
 #define DEPENDENCYSORTING_HX_PLAINSORTING_H
 
+#include <algorithm>
 #include <deque>
 #include <map>
 #include <string>
@@ -124,15 +125,11 @@ class HX_PlainSorting {
   }
 
   static void sortByName(Batch& batch) {
-    for (std::size_t i = 0; i < batch.size(); ++i) {
-      std::size_t smallest = i;
-      for (std::size_t j = i + 1; j < batch.size(); ++j) {
-        if (nameOf(batch[j]->node).compareWith(nameOf(batch[smallest]->node)) <
-            0)
-          smallest = j;
-      }
-      std::swap(batch[i], batch[smallest]);
-    }
+    const auto precedes = [](const Vertex* a, const Vertex* b) {
+      return nameOf(a->node).compareWith(nameOf(b->node)) < 0;
+    };
+    for (auto i = batch.begin(); i != batch.end(); ++i)
+      std::iter_swap(i, std::min_element(i, batch.end(), precedes));
   }
 
   void sortByCriteria(int lo, int hi, std::size_t level) {
