@@ -83,10 +83,6 @@ double log2Of(double x) { return FPS_Log2(x); }
 double log2Int(double x) { return FPS_Log2Int(x); }
 double powerOf2(double x) { return FPS_GetPowerOf2(x); }
 double greaterPowerOf2(double x) { return FPS_GetGreaterPowerOf2(x); }
-template <int bits>
-double roundBits(double x) {
-  return FPS_RoundOffBits(x, bits);
-}
 // The exponent, -9999 if x is no power of two.
 double exponentOf(double x) {
   int exponent = 77;
@@ -147,18 +143,6 @@ const UnaryCase kUnaryCases[] = {
       -0x1p25 - 0.5, -0x1p51 - 0.5, 0x1p52 + 1, -0.4, -kInf},
      {-2, -2, 2, -2, -3, 0x1p25, -0x1p25, -0x1p51, 0x1p52 + 2, 0.0, -kTwo63}},
     {FPS_Round, {2.5, -2.5, below(2.5), -0.4}, {3, -3, 2, 0.0}},
-    // A tie moves up.
-    {roundBits<3>,
-     {0x1.2p0, -0x1.2p0, below(0x1.2p0)},
-     {0x1.4p0, -0x1p0, 0x1p0}},
-    // The added half rounds.
-    {roundBits<53>, {above(1.0)}, {above(above(1.0))}},
-    {roundBits<54>, {above(1.0)}, {above(1.0)}},
-    {roundBits<1024>, {-kMax}, {-kMax}},
-    {roundBits<2147483647>, {-1.0}, {-kInf}},
-    {roundBits<0>, {1.5}, {2.0}},
-    {roundBits<-2147483647 - 1>, {-1.5}, {0.0}},
-    {roundBits<8>, {-kInf}, {-kInf}},
     {FPS_RoundOffDigits,
      {0.12345678901234567, -0x1p-14, 1.8e295, -kInf, kNaN},
      {0.1234567890123, -0.0000610351562, kInf, -kInf, kNaN}},
@@ -200,6 +184,10 @@ double within(double a, double b) {
   return FPS_ValuesAreApproxEqual(a, b, tol);
 }
 
+double roundBits(double x, double bits) {
+  return FPS_RoundOffBits(x, static_cast<int>(bits));
+}
+
 struct BinaryCase {
   double (*operation)(double, double);
   std::vector<double> a, b, expected;
@@ -217,6 +205,13 @@ const BinaryCase kBinaryCases[] = {
      {1, 1, 0, 0, 1, 0, 1, 0, 0, 1}},
     {within<0>, {1.0}, {1.0}, {0}},
     {within<1>, {3.0, 0.0}, {5.0, 5.0}, {1, 0}},
+    // A tie moves up; with 53 bits the added half rounds.
+    {roundBits,
+     {0x1.2p0, -0x1.2p0, below(0x1.2p0), above(1.0), above(1.0), -kMax, -1.0,
+      1.5, -1.5, -kInf},
+     {3, 3, 3, 53, 54, 1024, kTwo31 - 1, 0, -kTwo31, 8},
+     {0x1.4p0, -0x1p0, 0x1p0, above(above(1.0)), above(1.0), -kMax, -kInf, 2.0,
+      0.0, -kInf}},
     // The quotient of the tiny value is -0.
     {FPS_SimulinkAlikeModulo,
      {-7.0, 7.0, 5.0, -1e-300, -kTiny, 1.0},

@@ -63,6 +63,7 @@ struct Walk {
   explicit Walk(unsigned int seed) : random(seed) {}
 
   void step() {
+    if (plain[0].size() > 500) text[0] = "", plain[0].clear();
     const std::size_t other = random() % 2;
     const KyCXString& argument = text[other];
     const Units argumentUnits = plain[other];
@@ -74,18 +75,16 @@ struct Walk {
         text[0] = argument, plain[0] = argumentUnits;
         break;
       case 1:
-        if (old.size() < 500) text[0] += argument, plain[0] += argumentUnits;
+        text[0] += argument, plain[0] += argumentUnits;
         break;
       case 2:
         text[0] = text[0].sub(from, to), plain[0] = plainSub(old, from, to);
         break;
       case 3:
-        if (old.size() > 500) break;
         text[0].appendSub(argument, from, to);
         plain[0] += plainSub(argumentUnits, from, to);
         break;
       case 4:
-        if (old.size() > 500) break;
         text[0].replace(argument, text[1]);
         plain[0] = plainReplace(old, argumentUnits, plain[1]);
         break;
@@ -95,7 +94,6 @@ struct Walk {
         while (!plain[0].empty() && plain[0][0] <= u' ') plain[0].erase(0, 1);
         while (!plain[0].empty() && plain[0].back() <= u' ')
           plain[0].pop_back();
-        if (plain[0].size() > 500) text[0] = "", plain[0].clear();
         break;
       case 6: {
         KyCXString moved(std::move(text[0]));
