@@ -180,13 +180,11 @@ TEST(IntegerMathSupportTest, WrapOfUnusualTypes) {
     HX_NumericalType type;
     long long v, wrapped;
   };
+  const HX_NumericalType int32(-2147483648.0, 2147483647, 32, true);
   const Row rows[] = {
       {"beyond 32 bits", {-10, 10, 33, true}, kMax, kMax},
-      {"32 bits, signed", {-0x1p31, 0x7FFFFFFF, 32, true}, kMin, 0},
-      {"32 bits, signed",
-       {-0x1p31, 0x7FFFFFFF, 32, true},
-       0x80000000,
-       -0x80000000LL},
+      {"32 bits, signed", int32, kMin, 0},
+      {"32 bits, signed", int32, 0x80000000, -2147483648LL},
       {"32 bits, unsigned", {0, 4294967295, 32, false}, -1, 4294967295},
       {"no extension below 128", {-8, 7, 4, true}, 12, 12},
       {"extension from 128 on", {-8, 7, 4, true}, 140, -4},
