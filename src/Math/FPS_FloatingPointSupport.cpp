@@ -155,6 +155,8 @@ bool isPowerOf2(double x, int& exponent) {
 }  // namespace
 
 void ModInit_FPS_FloatingPointSupport() {
+  // The invalid operation gives the NaN.
+  // cppcheck-suppress [invalidFunctionArg, wrongmathcall]
   s_NaN = std::fmod(1.0, 0.0);
   s_PosInf = HUGE_VAL;
   s_NegInf = -s_PosInf;
@@ -310,6 +312,7 @@ int FPS_GetGreaterPowerOf2(double x) {
   return satCastToInt(log < 0.0 ? log : log + 1.0);
 }
 
+// NOLINTNEXTLINE(readability-non-const-parameter): callers pass double*
 double FPS_FindGreatestCommonDivisor(double* pair) {
   double a = pair[0];
   double b = pair[1];

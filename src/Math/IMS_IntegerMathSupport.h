@@ -87,11 +87,11 @@ inline long long IMS_FindGreatestCommonDivisor(const long long* pair) {
   if (((a - 1) | (b - 1)) >> 32 != 0) {
     return hx_detail::gcdOfAny(pair[0], pair[1]);
   }
-  const std::uint32_t divisor = hx_detail::oddGcdBySubtraction(
+  const std::uint64_t divisor = hx_detail::oddGcdBySubtraction(
       static_cast<std::uint32_t>(hx_detail::withoutTrailingZeros(a)),
       static_cast<std::uint32_t>(hx_detail::withoutTrailingZeros(b)));
-  return static_cast<long long>(std::uint64_t{divisor}
-                                << std::countr_zero(a | b));
+  const std::uint64_t result = divisor << std::countr_zero(a | b);
+  return static_cast<long long>(result);
 }
 
 /// The least common multiple of \p n values, at least 2, or 0 if it cannot be
