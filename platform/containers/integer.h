@@ -92,10 +92,12 @@ class HX_PLATFORM_API integer {
       return b.m_IsNegative <=> a.m_IsNegative;
     const auto order =
         a.m_pLarge || b.m_pLarge ? compareLarge(a, b) : a.m_Small <=> b.m_Small;
+    // An ordering compares with the literal 0 alone, which is no pointer.
+    // NOLINTNEXTLINE(modernize-use-nullptr)
     return a.m_IsNegative ? 0 <=> order : order;
   }
   friend bool operator==(const integer& a, const integer& b) {
-    return (a <=> b) == 0;
+    return (a <=> b) == 0;  // NOLINT(modernize-use-nullptr): as above
   }
 
  private:

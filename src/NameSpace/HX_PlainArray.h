@@ -40,6 +40,8 @@ class HX_PlainArray {
   void dropLast() { --m_Size; }
 
  private:
+  // The values may be pointers: their own size is meant.
+  // NOLINTBEGIN(bugprone-sizeof-expression)
   bool grow() {
     const unsigned capacity = m_Capacity == 0 ? 4 : m_Capacity * 2;
     void* room = HX_Allocate(capacity * sizeof(Value));
@@ -50,6 +52,7 @@ class HX_PlainArray {
     m_Capacity = capacity;
     return true;
   }
+  // NOLINTEND(bugprone-sizeof-expression)
 
   Value* m_Values = nullptr;
   unsigned m_Size = 0;

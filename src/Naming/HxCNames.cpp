@@ -191,6 +191,7 @@ void HxCNames::scanTemplate(Scan& scan) {
 }
 
 // In the order of the list of macros; no letter stands twice.
+// NOLINTNEXTLINE(readability-function-size): a table, not a course of steps
 const HxCNames::MacroRow* HxCNames::findMacro(unsigned short letter) {
   static constexpr MacroRow kRows[] = {
       {'L',
