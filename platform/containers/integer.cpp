@@ -123,7 +123,7 @@ integer integer::sum(const integer& a, const integer& b) {
   Words high = a.words();
   Words low = b.words();
   bool isNegative = a.m_IsNegative;
-  if (compareWords(high, low) < 0) {
+  if (std::is_lt(compareWords(high, low))) {
     high.swap(low);
     isNegative = b.m_IsNegative;
   }

@@ -97,7 +97,7 @@ class HX_PLATFORM_API integer {
     return a.m_IsNegative ? 0 <=> order : order;
   }
   friend bool operator==(const integer& a, const integer& b) {
-    return (a <=> b) == 0;  // NOLINT(modernize-use-nullptr): as above
+    return std::is_eq(a <=> b);
   }
 
  private:
