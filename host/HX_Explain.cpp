@@ -63,7 +63,7 @@ std::string originOf(const HX_NameItem& item, const std::string& macro) {
   const MeaningRow* row = kMeanings;
   while (macro.compare(0, std::string(row->macro).size(), row->macro) != 0)
     ++row;
-  const std::string meaning = row->meaning;
+  std::string meaning = row->meaning;
   const HX_NameItem* timed = item.isTask() ? &item : item.task;
   if (timed == nullptr) timed = item.isr;
   switch (row->origin) {

@@ -77,7 +77,7 @@ class Node {
   }
   std::size_t word(int index) const {
     std::uint16_t value = 0;
-    std::memcpy(&value, m_Start + index * 2, sizeof value);
+    std::memcpy(&value, m_Start + std::ptrdiff_t{index} * 2, sizeof value);
     return value;
   }
 
