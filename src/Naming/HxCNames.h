@@ -71,7 +71,8 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
     eMacroLongTypeName = 0x80000,  ///< $(Type) and $(BaseType)
   };
 
-  /// How substAllDollarZByValue() matches a macro name.
+  /// How substAllDollarZByValue() matches a macro name; any other value counts
+  /// as eMacroKindExact.
   enum tagMacroKindEnum : int {
     eMacroKindExact = 0,    ///< as written
     eMacroKindAnyCase = 1,  ///< in any mix of upper and lower case
@@ -102,14 +103,19 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   /// again.
   ///
   /// Block, subsystem, Stateflow object and data dictionary object are those of
-  /// the identifier's references. $R, $S, and $C of an object mark the name
-  /// changeable, also where $D falls back to them. An actual template that is
-  /// the formal one, with or without "$R" at one end, is not expanded for
-  /// itself: the actual name is a copy of the formal one, changeable if that is
-  /// or if there was an "$R". A template without ':' is such a case. The copy's
-  /// "$L used" and its siblings are what the getters of the formal name answer
-  /// after the expansion, at the level before it: below the threshold whether
-  /// the expanded text still holds the macro.
+  /// the identifier's references; the reference of its intermediate-view block
+  /// stands in for a missing source reference. A block named through its parent
+  /// counts as the parent, a chart block as the object of its chart, too.
+  /// Without block and object the subsystem id is that of the root.
+  ///
+  /// $R, $S, and $C of an object mark the name changeable, also where $D falls
+  /// back to them. An actual template that is the formal one, with or without
+  /// "$R" at one end, is not expanded for itself: the actual name is a copy of
+  /// the formal one, changeable if that is or if there was an "$R". A template
+  /// without ':' is such a case. The copy's "$L used" and its siblings are what
+  /// the getters of the formal name answer after the expansion, at the level
+  /// before it: below the threshold whether the expanded text still holds the
+  /// macro.
   ///
   /// Messages, attached to the source reference of \p id or else of its
   /// intermediate-view block, and left out with \p suppressMessages:
@@ -140,14 +146,16 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   /// Replaces every macro "$" + \p macro in both cooked names of \p id by the
   /// cooked name of \p value of the same type. Extended macros and the argument
   /// of "$E(...)" are never looked into, but \p macro may itself be an extended
-  /// one with its parentheses, "(Task)". "$$" is copied. An empty \p macro
-  /// matches every '$'. \p value may be \p id.
+  /// one with its parentheses, "(Task)"; the argument of an $E that is itself
+  /// replaced becomes plain text. "$$" is copied. An empty \p macro matches
+  /// every '$'. \p value may be \p id.
   ///
   /// Whether or not anything is replaced, \p id takes over the references of
-  /// \p value that are not null, and each flag of its active name that is true;
-  /// and the macro E or e sets \p id to cook level 1, even from a higher one,
-  /// as does a \p value at level 1 if \p id is at level 0. A replaced L, E or N
-  /// in either case sets the "used" flag of that name.
+  /// \p value that are not null, and for its active name each flag that the
+  /// getters of \p value answer true for the active one; and the macro E or e
+  /// sets \p id to cook level 1, even from a higher one, as does a \p value at
+  /// level 1 if \p id is at level 0. A replaced L, E or N in either case sets
+  /// the "used" flag of that name.
   /// \return whether anything was replaced
   bool substAllDollarZByValue(HxCCIdentifier& id, const KyCXString& macro,
                               const HxCCIdentifier& value,
@@ -164,7 +172,8 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   /// symbol (its name, $F and $V in upper case) and $t (the short name of its
   /// type, empty without one), and sets the cook level to 3. $X and $T count as
   /// $x and $t. Each value is put in as the template of an identifier: in the
-  /// actual name it is followed by "$R".
+  /// actual name it is followed by "$R", unless a ':' in it gives the two names
+  /// apart.
   void handleSymbolNameMacro(HxCCIdentifier& id, HxCSymbol* symbol);
 
   // --- Keywords and validity ---

@@ -22,7 +22,9 @@ class MacroKey {
  public:
   MacroKey(const KyCXString& macro, HxCNames::tagMacroKindEnum kind)
       : m_Kind(kind), m_pLower(&macro) {
-    if (kind == HxCNames::eMacroKindExact) return;
+    if (kind != HxCNames::eMacroKindAnyCase &&
+        kind != HxCNames::eMacroKindCaseSelectsValue)
+      return;
     m_Lower = macro;
     m_Lower.toLower();
     m_pLower = &m_Lower;
@@ -41,7 +43,7 @@ class MacroKey {
       return found.toLower() == *m_pLower ? Match::eValue : Match::eNone;
     }
     if (text.matchesAt(position, *m_pLower)) return Match::eValue;
-    if (m_Kind == HxCNames::eMacroKindExact) return Match::eNone;
+    if (m_Kind != HxCNames::eMacroKindCaseSelectsValue) return Match::eNone;
     return text.matchesAt(position, m_Upper) ? Match::eUpper : Match::eNone;
   }
 
@@ -88,6 +90,8 @@ bool HxCNames::substAllDollarZByValue(HxCCIdentifier& id,
   takeOver(id, value);
   const bool inActual = substAllDollarZByValue(id, macro, value, kind,
                                                HxCCIdentifier::eActualName);
+  // Put into itself, the actual name may use macros now that it did not.
+  if (&value == &id) takeOver(id, value);
   const bool inFormal = substAllDollarZByValue(id, macro, value, kind,
                                                HxCCIdentifier::eFormalName);
   return inActual || inFormal;

@@ -76,6 +76,7 @@ TEST_F(SubstitutionTest, ExtendedMacrosNeedTheirParentheses) {
             "$(Task)x");
   EXPECT_FALSE(replaced);
   EXPECT_EQ(substitute("$$x", "x", "t", HxCNames::eMacroKindExact), "$$x");
+  EXPECT_EQ(substitute("$x$X", "x", "t", HxCNames::tagMacroKindEnum{3}), "t$X");
 }
 
 TEST_F(SubstitutionTest, DollarEGroupsAreMeasured) {
@@ -123,6 +124,12 @@ TEST_F(SubstitutionTest, ReferencesFlagsAndLevelsAreTakenOver) {
   EXPECT_EQ(full.getCookLevel(), Id::eCookLevelFull);
   names.substAllDollarZByValue(full, "e", value, HxCNames::eMacroKindExact);
   EXPECT_EQ(full.getCookLevel(), Id::eCookLevelDollarE);
+
+  Id itself("v:$xL$");  // becomes "$xL$L$"
+  itself.activateActualName();
+  names.substAllDollarZByValue(itself, "x", itself, HxCNames::eMacroKindExact);
+  itself.setCookLevel(Id::eCookLevelFull);
+  EXPECT_TRUE(itself.getDollarLUsed(Id::eActualName));
 }
 
 TEST_F(SubstitutionTest, FileNamesExpandWhatIsKnownWithoutAnObject) {
