@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <nlohmann/json.hpp>
+#include <ostream>
 
 #include "host/HX_Text.h"
 #include "platform/messages/HX_MessageHandler.h"
@@ -85,6 +86,16 @@ ordered_json nameAsJson(const HX_FormedName& name) {
           {"changes", name.changes},     {"messages", messages}};
 }
 
+// Line feeds inside a text are escaped: each one here ends a line.
+std::string indented(const std::string& json, const std::string& indent) {
+  std::string text = indent;
+  for (const char c : json) {
+    text += c;
+    if (c == '\n') text += indent;
+  }
+  return text;
+}
+
 // Doubled quotes inside quotes, where the text needs them.
 std::string csvField(const std::string& text) {
   if (text.find_first_of(",\"\r\n") == std::string::npos) return text;
@@ -164,29 +175,30 @@ std::string HX_NamesAsTable(const HX_RunResult& result) {
   return table;
 }
 
-std::string HX_NamesAsJson(const HX_RunResult& result) {
-  ordered_json document;
-  document["names"] = ordered_json::array();
-  for (const HX_FormedName& name : result.names)
-    document["names"].push_back(nameAsJson(name));
-  document["types"] = typeNames(result);
-  document["variables"] = variableNames(result);
-  document["messages"] = ordered_json::array();
+void HX_WriteNamesAsJson(std::ostream& out, const HX_RunResult& result) {
+  out << "{\n  \"names\": [";
+  const char* separator = "\n";
+  for (const HX_FormedName& name : result.names) {
+    out << separator << indented(nameAsJson(name).dump(2), "    ");
+    separator = ",\n";
+  }
+  out << (result.names.empty() ? "]," : "\n  ],");
+
+  ordered_json rest{{"types", typeNames(result)},
+                    {"variables", variableNames(result)},
+                    {"messages", ordered_json::array()}};
   for (const HX_Finding& finding : result.findings)
-    document["messages"].push_back(findingAsJson(finding));
-  return document.dump(2) + "\n";
+    rest["messages"].push_back(findingAsJson(finding));
+  out << rest.dump(2).substr(1) << '\n';  // its own brace is written already
 }
 
-std::string HX_NamesAsCsv(const HX_RunResult& result) {
-  std::string csv = "id,template,formal,actual,changes,source\r\n";
-  for (const HX_FormedName& name : result.names) {
-    const Row row{name.item->id, name.item->nameTemplate,    name.formal,
-                  name.actual,   joined(name.changes, "; "), name.sourcePath};
-    for (std::size_t i = 0; i < row.size(); ++i)
-      csv += (i == 0 ? "" : ",") + csvField(row[i]);
-    csv += "\r\n";
-  }
-  return csv;
+void HX_WriteNamesAsCsv(std::ostream& out, const HX_RunResult& result) {
+  out << "id,template,formal,actual,changes,source\r\n";
+  for (const HX_FormedName& name : result.names)
+    out << csvField(name.item->id) << ',' << csvField(name.item->nameTemplate)
+        << ',' << csvField(name.formal) << ',' << csvField(name.actual) << ','
+        << csvField(joined(name.changes, "; ")) << ','
+        << csvField(name.sourcePath) << "\r\n";
 }
 
 std::string HX_ExplanationAsText(const HX_FormedName& name,

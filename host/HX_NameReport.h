@@ -3,6 +3,7 @@
 #ifndef HOST_HX_NAMEREPORT_H
 #define HOST_HX_NAMEREPORT_H
 
+#include <iosfwd>
 #include <string>
 #include <vector>
 
@@ -22,10 +23,11 @@ struct HX_RunResult {
 
 /// A table of names with their findings below each, then the orders.
 std::string HX_NamesAsTable(const HX_RunResult& result);
-std::string HX_NamesAsJson(const HX_RunResult& result);
+/// Name by name, so that a large map never stands in memory as a whole.
+void HX_WriteNamesAsJson(std::ostream& out, const HX_RunResult& result);
 /// One line per name by id (RFC 4180): id, template, formal, actual, changes,
 /// source.
-std::string HX_NamesAsCsv(const HX_RunResult& result);
+void HX_WriteNamesAsCsv(std::ostream& out, const HX_RunResult& result);
 
 /// Macro by macro, then what happened to the expanded name.
 std::string HX_ExplanationAsText(const HX_FormedName& name,

@@ -1,6 +1,9 @@
 #include "host/HX_Output.h"
 
-#include <fstream>
+#include <unistd.h>
+
+#include <algorithm>
+#include <cerrno>
 #include <iterator>
 #include <system_error>
 
@@ -8,48 +11,87 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr char kTemporary[] = ".hx_tmp";
-
-bool hasContent(const fs::path& path, const std::string& text) {
-  std::ifstream file(path, std::ios::binary);
-  if (!file) return false;
-  return std::string(std::istreambuf_iterator<char>(file), {}) == text;
+[[noreturn]] void fail(const fs::path& path, const std::error_code& error) {
+  throw HX_OutputError(path.string() +
+                       ": cannot be written: " + error.message());
 }
 
-void writeFile(const fs::path& path, const std::string& text) {
-  std::ofstream file(path, std::ios::binary | std::ios::trunc);
-  file << text;
-  file.close();
-  if (!file) throw HX_OutputError(path.string() + ": cannot be written");
+void require(bool isDone, const fs::path& path) {
+  if (!isDone) fail(path, std::error_code(errno, std::generic_category()));
+}
+
+bool haveSameContent(const fs::path& a, const fs::path& b) {
+  std::error_code error;
+  if (fs::file_size(a, error) != fs::file_size(b, error) || error) return false;
+  std::ifstream first(a, std::ios::binary);
+  std::ifstream second(b, std::ios::binary);
+  return std::equal(std::istreambuf_iterator<char>(first), {},
+                    std::istreambuf_iterator<char>(second), {});
 }
 
 }  // namespace
 
+HX_Output::HX_Output(const fs::path& folder)
+    : m_Folder(folder),
+      m_Temporary(folder / (".hx_codegen-" + std::to_string(getpid()))),
+      m_New(m_Temporary / "new"),
+      m_Old(m_Temporary / "old") {}
+
 HX_Output::~HX_Output() {
-  std::error_code ignored;
-  for (const fs::path& path : m_Temporary) fs::remove(path, ignored);
+  std::error_code error;
+  for (const std::string& name : m_Moved) {
+    fs::rename(m_Old / name, m_Folder / name, error);
+    if (error) fs::remove(m_Folder / name, error);  // there was no old one
+  }
+  m_Files.clear();
+  fs::remove_all(m_Temporary, error);
+  for (const fs::path& made : m_MadeFolders) fs::remove(made, error);
 }
 
-std::vector<std::string> HX_Output::commit() {
+void HX_Output::makeFolders() {
   std::error_code error;
-  fs::create_directories(m_Folder, error);
-  if (error) throw HX_OutputError(m_Folder.string() + ": " + error.message());
+  for (fs::path path = m_Folder; !fs::exists(path, error);
+       path = path.parent_path())
+    m_MadeFolders.push_back(path);
+  fs::create_directories(m_New, error);
+  if (!error) fs::create_directory(m_Old, error);
+  if (error) fail(m_Folder, error);
+}
 
-  std::vector<std::string> changed;
-  for (const auto& [name, text] : m_Files) {
+std::ostream& HX_Output::open(const std::string& name) {
+  if (m_Files.empty()) makeFolders();
+  std::ofstream& file = m_Files[name];
+  file.open(m_New / name, std::ios::binary);
+  require(file.is_open(), m_Folder / name);
+  return file;
+}
+
+std::size_t HX_Output::finish() {
+  for (auto& [name, file] : m_Files) {
+    file.close();
+    require(file.good(), m_Folder / name);
+  }
+  for (const auto& [name, file] : m_Files) {
+    if (fs::is_directory(m_Folder / name))
+      fail(m_Folder / name, std::make_error_code(std::errc::is_a_directory));
+    if (!haveSameContent(m_New / name, m_Folder / name))
+      m_Changed.push_back(name);
+  }
+  return m_Changed.size();
+}
+
+void HX_Output::commit() {
+  std::error_code error;
+  for (const std::string& name : m_Changed) {
     const fs::path path = m_Folder / name;
-    if (fs::is_directory(path))
-      throw HX_OutputError(path.string() + ": is a folder");
-    if (hasContent(path, text)) continue;
-    m_Temporary.push_back(m_Folder / (name + kTemporary));
-    writeFile(m_Temporary.back(), text);
-    changed.push_back(name);
+    if (fs::exists(path, error)) {
+      fs::create_hard_link(path, m_Old / name, error);
+      if (error) fs::copy_file(path, m_Old / name, error);
+      if (error) fail(path, error);
+    }
+    fs::rename(m_New / name, path, error);
+    if (error) fail(path, error);
+    m_Moved.push_back(name);
   }
-  for (const std::string& name : changed) {
-    fs::rename(m_Folder / (name + kTemporary), m_Folder / name, error);
-    if (error)
-      throw HX_OutputError((m_Folder / name).string() + ": " + error.message());
-  }
-  m_Temporary.clear();
-  return changed;
+  m_Moved.clear();
 }

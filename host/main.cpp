@@ -1,7 +1,9 @@
 // hx_codegen: from a model document to names and C code.
+#include <fcntl.h>
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
+#include <csignal>
 #include <iostream>
 
 #include "host/HX_CWriter.h"
@@ -68,8 +70,10 @@ int showNames(const Arguments& arguments, HX_Profile& profile) {
   const HX_RunResult& result =
       generator.run(HX_Generator::eAsInDocument, progressOf(arguments));
   const HX_Profile::Phase phase(profile, "Print");
-  std::cout << (arguments.json ? HX_NamesAsJson(result)
-                               : HX_NamesAsTable(result));
+  if (arguments.json)
+    HX_WriteNamesAsJson(std::cout, result);
+  else
+    std::cout << HX_NamesAsTable(result);
   return exitCodeOf(result);
 }
 
@@ -100,6 +104,11 @@ int explainName(const Arguments& arguments, HX_Profile& profile) {
   return exitCodeOf(result);
 }
 
+void flushOutput() {
+  if (!std::cout.flush())
+    throw HX_OutputError("standard output: cannot be written");
+}
+
 int generateCode(const Arguments& arguments, HX_Profile& profile) {
   const HX_Document document = readDocument(arguments, profile);
   HX_Generator generator(document, profile.start() / arguments.keywords,
@@ -107,22 +116,27 @@ int generateCode(const Arguments& arguments, HX_Profile& profile) {
   HX_RunResult& result =
       generator.run(HX_Generator::eById, progressOf(arguments));
   HX_Output output(profile.start() / arguments.out);
+  std::size_t changed = 0;
   if (!result.hasErrors()) {
     const HX_Profile::Phase phase(profile, "Write C");
     for (const auto& [name, text] :
          HX_CWriter(generator.model(), result).files())
-      output.add(name, text);
-    output.add("name_map.json", HX_NamesAsJson(result));
-    output.add("name_map.csv", HX_NamesAsCsv(result));
+      output.open(name) << text;
+    HX_WriteNamesAsJson(output.open("name_map.json"), result);
+    HX_WriteNamesAsCsv(output.open("name_map.csv"), result);
+    changed = output.finish();
   }
   writeFindings(result);
   if (result.hasErrors()) return kErrorsFound;
-  const std::vector<std::string> written = output.commit();
-  if (arguments.json) std::cout << HX_NamesAsJson(result);
-  if (arguments.quiet || arguments.json) return kDone;
-  std::cout << result.names.size() << " names, " << result.variables.size()
-            << " variables; " << written.size() << " files written to "
-            << arguments.out << '\n';
+  if (arguments.json) {
+    HX_WriteNamesAsJson(std::cout, result);
+  } else if (!arguments.quiet) {
+    std::cout << result.names.size() << " names, " << result.variables.size()
+              << " variables; " << changed << " files written to "
+              << arguments.out << '\n';
+  }
+  flushOutput();  // without a reader no file changes
+  output.commit();
   return kDone;
 }
 
@@ -146,23 +160,17 @@ CLI::App* addModelCommand(CLI::App& app, Arguments& arguments, const char* name,
   return command;
 }
 
-int run(const Arguments& arguments, Command command) {
-  try {
-    HX_Profile profile(arguments.profile);
-    const int code = command(arguments, profile);
-    profile.finish();
-    if (!std::cout.flush())
-      throw HX_OutputError("standard output: cannot be written");
-    return code;
-  } catch (const std::exception& error) {
-    std::cerr << "hx_codegen: " << error.what() << '\n';
-    return kRefused;
-  }
+// A write that fails shall come back as an error, and no file that is opened
+// shall become the standard output of a program that was started without one.
+void prepareProcess() {
+  std::signal(SIGPIPE, SIG_IGN);
+  std::signal(SIGXFSZ, SIG_IGN);
+  int file = 0;
+  while (file >= 0 && file <= STDERR_FILENO) file = open("/dev/null", O_RDONLY);
+  close(file);
 }
 
-}  // namespace
-
-int main(int argc, char** argv) {
+int run(int argc, char** argv) {
   CLI::App app("Forms the names of a model and writes its C code.",
                "hx_codegen");
   app.footer(kFooter);
@@ -196,10 +204,29 @@ int main(int argc, char** argv) {
   synthesis->add_option("--seed", arguments.seed, "of the random numbers");
   synthesis->callback([&] { command = synthesize; });
 
+  int code = kDone;
   try {
     app.parse(argc, argv);
+    HX_Profile profile(arguments.profile);
+    code = command(arguments, profile);
+    profile.finish();
   } catch (const CLI::ParseError& error) {
-    return app.exit(error) == 0 ? kDone : kRefused;
+    code = app.exit(error) == 0 ? kDone : kRefused;
   }
-  return run(arguments, command);
+  flushOutput();
+  return code;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  prepareProcess();
+  try {
+    return run(argc, argv);
+  } catch (const std::exception& error) {
+    std::cerr << "hx_codegen: " << error.what() << '\n';
+  } catch (...) {
+    std::cerr << "hx_codegen: unknown failure\n";
+  }
+  return kRefused;
 }

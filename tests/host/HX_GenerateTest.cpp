@@ -93,7 +93,7 @@ TEST(GenerateTest, FailureLeavesTheFolderAsItWas) {
   const auto before = filesIn(out);
   const HX_ProgramResult result = generate(HX_DEMO_MODEL, out);
   EXPECT_EQ(2, result.code);
-  EXPECT_THAT(result.err, HasSubstr("name_map.json: is a folder"));
+  EXPECT_THAT(result.err, HasSubstr("name_map.json: cannot be written: Is a directory"));
   EXPECT_EQ(before, filesIn(out));
 }
 
