@@ -126,12 +126,14 @@ HX_UTILS_API double FPS_RoundDown(double x);
 
 // --- Arithmetic of the simulation --------------------------------------------
 
-/// x - floor(x / y) * y, with the sign of \p y; \p x if \p y is 0. The product
-/// is rounded: the result may miss the exact remainder, and even reach \p y.
+/// x - floor(x / y) * y, with the sign of \p y; \p x if \p y is 0. Quotient and
+/// product are rounded: the result may miss the exact remainder, even reach
+/// \p y, and just below a multiple of \p y be tiny and of the other sign.
 HX_UTILS_API double FPS_SimulinkAlikeModulo(double x, double y);
 
 /// x - t * y with t = x / y truncated and saturated to 64 bits, with the sign
-/// of \p x; 0.0 if \p y is 0. A quotient beyond 2^63 leaves a large remainder.
+/// of \p x, rounded as above; 0.0 if \p y is 0. A quotient beyond 2^63 leaves a
+/// large remainder.
 HX_UTILS_API double FPS_SimulinkAlikeRem(double x, double y);
 
 /// The square root of |x| with the sign of \p x.
@@ -156,7 +158,8 @@ HX_UTILS_API double FPS_Log2(double x);
 HX_UTILS_API double FPS_Log2(int n);
 
 /// FPS_Log2(x) truncated, and so one too near to 0 for every power of two but
-/// 1: FPS_Log2Int(8.0) is 2, FPS_Log2Int(0.25) is -1.
+/// 1 and for what lies just beyond it: FPS_Log2Int(8.0) is 2, FPS_Log2Int(0.25)
+/// is -1.
 ///
 /// -2147483648 for 0, 2147483647 for +Inf and where the logarithm is a NaN.
 HX_UTILS_API int FPS_Log2Int(double x);
@@ -175,8 +178,8 @@ HX_UTILS_API bool FPS_PowerOf2(double x, int* exponent);
 /// negative power.
 ///
 /// For other values it comes from FPS_Log2, whose error makes it one too small
-/// just above a power of two from 2 on and one too large just below one under
-/// 1/2. For 0 and other negative values as FPS_Log2Int.
+/// just above a power of two from 2 on and one too large just below one from
+/// 1/2 down. For 0 and other negative values as FPS_Log2Int.
 HX_UTILS_API int FPS_GetGreaterPowerOf2(double x);
 
 // --- Divisors and multiples --------------------------------------------------

@@ -150,13 +150,17 @@ const UnaryCase kUnaryCases[] = {
     {log2Of,
      {8.0, 2.0, -0.0, kInf, -kTiny},
      {2.9999999999999796, 0.9999999999999932, -kInf, kInf, kNaN}},
-    {log2Int, {8.0, 0.25, 0.0, -1.0}, {2, -1, -kTwo31, kTwo31 - 1}},
+    {log2Int,
+     {8.0, above(8.0), 0.25, 0.0, -1.0},
+     {2, 2, -1, -kTwo31, kTwo31 - 1}},
     {powerOf2, {5.0, 6.0, 0.3}, {2, 3, -2}},
     {exponentOf,
      {0.25, -4.0, 3.0, 0.0, 0x1p-1022, 0x1p-1023, kInf},
      {-2, 2, -9999, -9999, -1022, -9999, 1024}},
-    // Above 8 the error of the logarithm shows.
-    {greaterPowerOf2, {5.0, 8.0, above(8.0), 0.3}, {3, 3, 3, -1}},
+    // Above 8 and below 1/2 the error of the logarithm shows.
+    {greaterPowerOf2,
+     {5.0, 8.0, above(8.0), 0.3, below(0.5)},
+     {3, 3, 3, -1, 0}},
     {FPS_ASinh, {1.0}, {0.88137358701954294}},
     {FPS_ACosh, {2.0, 0.5}, {1.3169578969248166, kNaN}},
     {FPS_ATanh, {0.5, 1.0}, {0.54930614433405489, kInf}},
@@ -218,9 +222,9 @@ const BinaryCase kBinaryCases[] = {
      {3.0, -3.0, -0.0, 3.0, 3.0, kInf},
      {2.0, -2.0, 5.0, 3.0, -kTiny, kNaN}},
     {FPS_SimulinkAlikeRem,
-     {-7.0, 7.0, kInf, 0x1p70},
-     {3.0, -3.0, 0.0, 1.0},
-     {-1.0, 1.0, 0.0, 0x1p70 - 0x1p63}},
+     {-7.0, 7.0, kInf, 0x1p70, 469.818},
+     {3.0, -3.0, 0.0, 1.0, 0.774},
+     {-1.0, 1.0, 0.0, 0x1p70 - 0x1p63, -0x1p-44}},
 };
 
 TEST_F(FloatingPointSupportTest, BinaryOperationsAtTheirBoundaries) {
