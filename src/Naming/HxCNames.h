@@ -226,10 +226,14 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   ///
   /// A value that is not a multiple of the fixed unit is rounded and reported
   /// with message 1206 (warning), one that is no whole number of microseconds
-  /// with 1207 (warning), each only where the macro occurs. A count beyond the
-  /// 32-bit range is saturated, that of a NaN is the largest one; NaN and the
-  /// infinities are reported. If not \p cyclic, every time macro becomes
-  /// "ACYCLIC", and one message 1205 (error) is reported if there was any.
+  /// with 1207 (warning), each only where the macro occurs. What is a multiple,
+  /// also of the largest unit, FPS_IsIntegerValue tells: from 2^25 units on
+  /// every value. Microseconds are whole to 2^-26 of the value, 2^-26 s below
+  /// 1 s: $(Time) of 1.01 us is silently "1us". A count beyond the 32-bit range
+  /// is saturated without a message of its own, that of a NaN is the largest
+  /// one; NaN and the infinities are reported. If not \p cyclic, every time
+  /// macro becomes "ACYCLIC", and one message 1205 (error) is reported if there
+  /// was any.
   void replaceMultirateTimeName(HxCCIdentifier& id, double period,
                                 double offset, bool cyclic);
 

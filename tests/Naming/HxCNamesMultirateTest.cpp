@@ -35,6 +35,8 @@ TEST_F(MultirateTest, ExactTimesGiveNoMessage) {
                            {"$(Time)", 0.01, 0.005, "10ms_5ms"},
                            {"$(Period)$(Offset)", 0.01, -0.005, "10ms5ms"},
                            {"$(Time)", 90, 0, "90s"},
+                           {"$(Time)", 0.00000101, 3599.99999, "1us_60m"},
+                           {"$(Time1us)", 100.0000003, 0, "100000000"},
                            {"$(time1ms)", 0.01, 0, "__time1ms_"}};
   for (const TimeCase& row : rows) {
     EXPECT_EQ(time(row.form, row.period, row.offset), row.result) << row.form;
