@@ -67,9 +67,10 @@ class HX_UTILS_API HxCDependencySorting : public HX_Allocated {
   /// False if some nodes depend on themselves, directly or through others:
   /// message 403 (severity 2) then names all nodes with dependencies, in the
   /// order of add(), and calls them variables if the first one is a variable,
-  /// else data types. False without a message if a null pointer without
-  /// dependencies was added. In both cases the result is no valid order, and
-  /// the sort keeps failing until reinit().
+  /// else data types; a fall-through note (HxCTraceFallThrough) follows. False
+  /// without a message if a null pointer without dependencies was added. In
+  /// both cases the result is no valid order, and the sort keeps failing until
+  /// reinit().
   ///
   /// A dependency with a node that was never added raises the internal
   /// assertion (message 7) and is ignored. A null pointer with dependencies is

@@ -66,7 +66,8 @@ class HX_UTILS_API HX_LimitedNameSpace : public HX_Allocated {
   /// The same for a name that must not be longer than
   /// HxCSymbol::sm_MaxNameLength, whether or not the option limits names: a
   /// longer name, and each longer variant, loses its middle to "__". The first
-  /// variant is one of the shortened name, the others of the name itself.
+  /// variant is one of the shortened name, the others of the name itself; so a
+  /// repeated call may give another name, which is free as well.
   /// \param[out] derived  false also if \p s was only shortened
   void deriveUniqueStringAdaptLength(KyCXString& s);
   void deriveUniqueStringAdaptLength(KyCXString& s, bool& derived);

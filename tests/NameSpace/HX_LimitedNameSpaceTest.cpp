@@ -47,7 +47,8 @@ const StepsCase kStepsCases[] = {
      "l" HX_29 "3456=" HX_SHORT "56"},
     {"taken variants of the shortened name do not count for the name", true,
      "+" HX_SHORT "56 u" HX_SHORT "56=" HX_SHORT "_a u" HX_SHORT "56=" HX_SHORT
-     "_b -" HX_SHORT "56 +" HX_SHORT "56 l" HX_29 "3456=" HX_29 "_b"},
+     "_b -" HX_SHORT "56 +" HX_SHORT "56 l" HX_29 "3456=" HX_29 "_b l" HX_29
+     "3456=" HX_29 "_c"},
 };
 
 TEST_F(LimitedNameSpaceTest, FollowsTheCounters) {
