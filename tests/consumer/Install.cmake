@@ -1,0 +1,33 @@
+# Installs the library, moves what was installed to WORK/moved, and looks for
+# paths of this machine in it. The static library is that of the build tree
+# TREE, the shared one is built first.
+cmake_minimum_required(VERSION 3.25)
+if(KIND STREQUAL "shared")
+  set(TREE ${WORK}/build)
+  foreach(step IN ITEMS
+      "-G;${GENERATOR};-S;${SOURCE};-B;${TREE};-DCMAKE_CXX_COMPILER=${COMPILER};-DBUILD_SHARED_LIBS=ON;-DHX_BUILD_TESTING=OFF;-DHX_BUILD_HOST=OFF"
+      "--build;${TREE}")
+    execute_process(COMMAND ${CMAKE_COMMAND} ${step} COMMAND_ERROR_IS_FATAL ANY
+                    OUTPUT_QUIET)
+  endforeach()
+endif()
+file(REMOVE_RECURSE ${WORK}/installed ${WORK}/moved)
+execute_process(COMMAND ${CMAKE_COMMAND} --install ${TREE}
+                        --prefix ${WORK}/installed
+                COMMAND_ERROR_IS_FATAL ANY OUTPUT_QUIET)
+file(RENAME ${WORK}/installed ${WORK}/moved)
+
+file(GLOB_RECURSE files ${WORK}/moved/*)
+foreach(file IN LISTS files)
+  # What the debugger reads may name the sources, and only this build has it.
+  if(KIND STREQUAL "static" AND file MATCHES "\\.a$|/hx_codegen$")
+    continue()
+  endif()
+  file(STRINGS ${file} lines)
+  foreach(path IN ITEMS ${SOURCE} ${TREE} ${WORK} /usr/local)
+    string(FIND "${lines}" ${path} position)
+    if(NOT position EQUAL -1)
+      message(SEND_ERROR "${file} holds the path ${path}")
+    endif()
+  endforeach()
+endforeach()
