@@ -55,10 +55,11 @@ void addTo(Dictionary& entries, int key, std::int64_t value) {
 
 }  // namespace
 
-// The rows of the report, as they are built up.
+// The rows of the report, as they are built up. All functions are inline: the
+// library would export others with the class around this one.
 struct HX_StopWatch::Report {
-  void addRow(const HX_StopWatch& watch);
-  void addSubWatches(const HX_StopWatch& watch);
+  inline void addRow(const HX_StopWatch& watch);
+  inline void addSubWatches(const HX_StopWatch& watch);
   void openCell(int column) {
     text.append("<td bgcolor=#")
         .append(kPalettes[rows % 2][column])
