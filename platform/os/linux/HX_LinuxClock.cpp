@@ -20,15 +20,23 @@ std::int64_t monotonicTicks() {
   return static_cast<std::int64_t>(nanoseconds / kNanosecondsPerTick);
 }
 
+// Whoever asks first sets it: static objects may be constructed before this
+// file's, and the clock must not run backwards for them.
+std::int64_t processStart() {
+  static const std::int64_t s_start = monotonicTicks();
+  return s_start;
+}
+
 // The library is loaded as part of the process start.
-const std::int64_t s_processStart = monotonicTicks();
+[[maybe_unused]] const std::int64_t s_atLoad = processStart();
 
 }  // namespace
 
 std::int64_t HX_ProcessClock() {
   if (HX_ClockSource* source = HX_ClockSource::installed())
     return source->processClock();
-  return (monotonicTicks() - s_processStart) / kTicksPerMillisecond;
+  const std::int64_t start = processStart();
+  return (monotonicTicks() - start) / kTicksPerMillisecond;
 }
 
 int QueryPerformanceFrequency(std::int64_t* frequency) {
