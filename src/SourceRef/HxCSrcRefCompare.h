@@ -7,6 +7,7 @@
 #ifndef SOURCEREF_HXCSRCREFCOMPARE_H
 #define SOURCEREF_HXCSRCREFCOMPARE_H
 
+#include "Control/HX_Allocated.h"
 #include "HX_Export.h"
 
 class HxCSrcRef;
@@ -14,8 +15,10 @@ class HxCSrcRef;
 /// Holds no data. Every reference may be null, which stems from nowhere. An
 /// object of the data dictionary counts as made by a user script if its path
 /// contains "CGTmpData", in this case of letters.
-class HX_UTILS_API HxCSrcRefCompare {
+class HX_UTILS_API HxCSrcRefCompare : public HX_Allocated {
  public:
+  HxCSrcRefCompare() = default;
+
   /// Both stem from the data dictionary.
   bool bothFromDD(const HxCSrcRef* a, const HxCSrcRef* b) const;
 

@@ -23,6 +23,8 @@ class HX_UTILS_API HX_StringParser : public HX_Allocated {
     eRemoveBoth = 2
   };
 
+  HX_StringParser() = default;
+
   /// Reads pairs such as "Name = Foo ; SIZE=3" for a list of known \p keys.
   ///
   /// An item without \p keyValueSep, and one whose key is not known, is not

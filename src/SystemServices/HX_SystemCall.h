@@ -17,6 +17,8 @@ class KyCXString;
 /// Holds no data; acts on the process and the calling thread.
 class HX_UTILS_API HX_SystemCall : public HX_Allocated {
  public:
+  HX_SystemCall() = default;
+
   /// Milliseconds of the process clock.
   double getTimeStamp() const;
 

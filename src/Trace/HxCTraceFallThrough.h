@@ -11,6 +11,7 @@
 #ifndef TRACE_HXCTRACEFALLTHROUGH_H
 #define TRACE_HXCTRACEFALLTHROUGH_H
 
+#include "Control/HX_Allocated.h"
 #include "HX_Export.h"
 
 class KyCXString;
@@ -25,8 +26,10 @@ class KyCXString;
 /// While verbose() is false, notes, warnings and errors report nothing and
 /// take no source reference number; a deadly fall-through fails an internal
 /// assertion instead (message 7, fatal error), so that it is never silent.
-class HX_UTILS_API HxCTraceFallThrough {
+class HX_UTILS_API HxCTraceFallThrough : public HX_Allocated {
  public:
+  HxCTraceFallThrough() = default;
+
   /// Message 1272, severity 4 (internal note). \return false, always
   bool throwNote() const;
   bool throwNote(const KyCXString& file, int line) const;

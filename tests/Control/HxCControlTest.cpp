@@ -7,6 +7,10 @@
 #include "Control/HX_SelfCheck.h"
 #include "Control/HxCUtilsControl.h"
 #include "SourceRef/HxCSrcRef.h"
+#include "SourceRef/HxCSrcRefCompare.h"
+#include "Strings/HX_StringParser.h"
+#include "SystemServices/HX_SystemCall.h"
+#include "Trace/HxCTraceFallThrough.h"
 #include "platform/messages/ERR_MessageHandler.h"
 #include "support/HX_TestFixture.h"
 
@@ -111,6 +115,11 @@ TEST_F(ControlTest, NewGoesToTheInstalledController) {
   EXPECT_EQ(controller.liveBlocks(), 1);
   EXPECT_TRUE(control->shutdown());
   delete control;
+  delete new HX_StringParser{};
+  delete new HX_SystemCall{};
+  delete new HxCSrcRefCompare{};
+  delete new HxCTraceFallThrough{};
+  EXPECT_EQ(controller.allocated(), 5) << "classes without data as well";
   EXPECT_EQ(controller.liveBlocks(), 0);
   controller.fail();
   EXPECT_EQ(new HxCSrcRef, nullptr);
