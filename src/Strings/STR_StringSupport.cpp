@@ -86,7 +86,9 @@ char* STR_IntToString(int value) {
 char* STR_DoubleToString(double value, int precision) {
   const int digits = precision < 0 ? kDefaultPrecision : precision;
   const int length = std::snprintf(nullptr, 0, "%.*f", digits, value);
-  if (length < 0) return nullptr;  // more than INT_MAX characters
+  // Of more than INT_MAX characters the C library says -1, but 0 for a
+  // precision of INT_MAX itself.
+  if (length <= 0) return nullptr;
   char* result = allocate(static_cast<std::size_t>(length) + 1);
   if (result == nullptr) return nullptr;
   // Not printf(), which would write the decimal point of the locale.

@@ -45,7 +45,7 @@ HX_UTILS_API char* STR_IntToString(int value);
 /// Decimal with \p precision digits after the point, no point for 0, rounded as
 /// printf does, whatever the locale; a negative precision counts as 6. The
 /// infinities and NaN read "inf", "-inf", "nan" and "-nan". Every finite value
-/// is written out in full.
+/// is written out in full; null if that takes more than INT_MAX characters.
 HX_UTILS_API char* STR_DoubleToString(double value, int precision);
 
 /// A copy of \p s; null for null.
