@@ -31,7 +31,9 @@ class HX_UTILS_API HX_TimingListener {
   /// Must not start, stop, create or destroy what is timed.
   /// \param name  valid during the call
   /// \param start  microseconds since an arbitrary origin, the same for all
-  ///     runs of a process
+  ///     runs timed by one clock: a debug server that is not booted takes the
+  ///     process clock, also where stop watches take the counter; the start of
+  ///     a run time during which it is booted tells nothing
   /// \param duration  microseconds, as it is accounted
   virtual void runEnded(const char* name, std::int64_t start,
                         std::int64_t duration) = 0;

@@ -69,8 +69,9 @@ class HX_UTILS_API HxCDebugServer : public HX_Allocated {
   static HxCDebugServer* getDebugServer() { return s_pDebugServer; }
 
   /// Chooses the clock, starts a new log, clears the counters and numbers the
-  /// protocol from 1 again. Clocks and run times stay. Nothing happens while
-  /// the server is booted.
+  /// protocol from 1 again. Clocks and run times stay. Before the first boot()
+  /// the clock is the process clock; what runs across a change of the clock
+  /// gets a meaningless time. Nothing happens while the server is booted.
   /// \return true
   bool boot();
 
