@@ -52,9 +52,8 @@ class HX_PLATFORM_API HX_VersionResource {
 
 /// Makes \p name a loaded module with the file \p path, in place of an earlier
 /// module of that name. The file itself is not looked at.
-/// \param versionBlock  of HX_VersionResource::block(); empty for a file
-/// without
-///     version information
+/// \param versionBlock  of HX_VersionResource::block(); empty for a file that
+///     has no version information
 HX_PLATFORM_API void HX_LoadModule(const std::string& name,
                                    const std::string& path,
                                    const std::string& versionBlock);

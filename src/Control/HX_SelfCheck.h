@@ -2,9 +2,8 @@
 //
 //   namespace { constexpr char kErrorCode[] = __FILE__ "_"; }
 //
-//   if (!HX_Assert(field != nullptr, kErrorCode)) return;  // a broken
-//   invariant HX_DebugCheck(success, "success");                     // for
-//   developers
+//   if (!HX_Assert(field != nullptr, kErrorCode)) return;  // an invariant
+//   HX_DebugCheck(success, "success");                     // for developers
 
 #ifndef CONTROL_HX_SELFCHECK_H
 #define CONTROL_HX_SELFCHECK_H
