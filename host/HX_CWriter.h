@@ -2,15 +2,18 @@
 // with the definitions.
 //
 //   HX_CWriter writer(model, result);
-//   for (const auto& [name, text] : writer.files()) output.add(name, text);
+//   writer.write(output);
 
 #ifndef HOST_HX_CWRITER_H
 #define HOST_HX_CWRITER_H
 
+#include <iosfwd>
 #include <map>
 #include <string>
+#include <vector>
 
 #include "host/HX_NameReport.h"
+#include "host/HX_Output.h"
 
 /// C90 has no integer of 64 bits: one is written as a structure of two words,
 /// the low one first.
@@ -22,33 +25,31 @@ class HX_CWriter {
   /// \p result gets the remarks.
   HX_CWriter(const HX_Model& model, HX_RunResult& result);
 
-  /// File name without folder -> text.
-  std::map<std::string, std::string> files();
+  void write(HX_Output& output);
 
  private:
-  std::string typesHeader() const;
-  std::string declarationsHeader() const;
-  std::string definitions();
-  std::string function(const HX_FormedName& name);
-  std::string locals(const HX_ScopeItem* scope, int depth);
-  std::string definition(const HX_FormedName& name);
-  std::string initializer(const HX_FormedName& name);
-  std::string initializer(const HX_FormedName& name, const HX_TypeItem& type,
+  void writeTypes(std::ostream& out) const;
+  void writeDeclarations(std::ostream& out);
+  void writeDefinitions(std::ostream& out);
+  void writeLocals(std::ostream& out, const HX_ScopeItem* scope,
+                   const std::string& indent);
+  std::string definition(const HX_Name& name);
+  std::string initializer(const HX_Name& name, const HX_TypeItem& type,
                           std::size_t& at);
-  std::string elementValue(const HX_FormedName& name, const HX_TypeItem& type,
+  std::string elementValue(const HX_Name& name, const HX_TypeItem& type,
                            double physical);
 
   const HX_Model& m_Model;
   HX_RunResult& m_Result;
-  std::string m_TypesFile;                        // without extension, as below
-  std::string m_DeclarationsFile;                 // also that of the source
-  std::vector<const HX_FormedName*> m_Functions;  // by C name
+  std::string m_TypesFile;                  // without extension, as below
+  std::string m_CodeFile;                   // header and source
+  std::vector<const HX_Name*> m_Functions;  // by C name
+  const HX_ScopeItem* m_pFile = nullptr;
   // What stands where; looked up, never walked.
-  std::map<const HX_ScopeItem*, std::vector<const HX_FormedName*>>
-      m_VariablesOf;
+  std::map<const HX_ScopeItem*, std::vector<const HX_Name*>> m_VariablesIn;
   std::map<const HX_ScopeItem*, std::map<std::string, const HX_ScopeItem*>>
-      m_BlocksOf;  // by id
-  std::map<const HX_NameItem*, const HX_ScopeItem*> m_BodyOf;
+      m_BlocksIn;  // by id
+  std::map<const HX_Name*, const HX_ScopeItem*> m_BodyOf;
 };
 
 #endif  // HOST_HX_CWRITER_H

@@ -1,91 +1,79 @@
 // HX_NameRun::explain(): what each macro of a template gives.
 #include <algorithm>
+#include <cstring>
 
 #include "host/HX_NameRun.h"
 #include "host/HX_Text.h"
 #include "platform/messages/HX_MessageHandler.h"
-#include "platform/model/HX_BdBlock.h"
 
 namespace {
 
-enum Origin { eNone, eSource, eDictionary, eType, eTask, eModel };
+std::string fromSource(const HX_Name& name) {
+  return name.source != nullptr ? HX_PathOf(name.source) : "no source";
+}
+
+std::string fromDictionary(const HX_Name& name) {
+  return name.dd != nullptr ? HX_PathOf(name.dd) : fromSource(name);
+}
+
+std::string fromType(const HX_Name& name) {
+  return name.type != nullptr ? "type '" + name.type->id + "'" : "no type";
+}
+
+std::string fromTask(const HX_Name& name) {
+  const HX_Name* timed = name.timed();
+  return timed != nullptr ? timed->kind + " '" + timed->id + "'" : "no task";
+}
+
+std::string fromModel(const HX_Name&) { return "the model"; }
 
 struct MeaningRow {
   const char* macro;  // the beginning of the macro
   const char* meaning;
-  Origin origin;
+  std::string (*origin)(const HX_Name& name);  // null: given with the name
 };
 
 // The first row that fits counts.
 constexpr MeaningRow kMeanings[] = {
-    {"$(Type)", "name of the type", eType},
-    {"$(BaseType)", "name of the base type", eType},
-    {"$(Component)", "software component of the variable", eDictionary},
-    {"$(Task)", "name of the task", eTask},
-    {"$(ISR)", "name of the interrupt service routine", eTask},
-    {"$(Time", "period and offset", eTask},
-    {"$(Period", "period", eTask},
-    {"$(Offset", "offset", eTask},
-    {"$(", "given with the name", eNone},
-    {"$E", "given with the name", eNone},
-    {"$L", "signal label, else block name", eSource},
-    {"$B", "block name", eSource},
-    {"$S", "subsystem id and number", eSource},
-    {"$I", "subsystem id", eSource},
-    {"$M", "model name", eModel},
-    {"$N", "name of the subsystem under generation", eModel},
-    {"$H", "states around the chart object", eSource},
-    {"$O", "name of the chart object", eSource},
-    {"$C", "subsystem id and number of the chart object", eSource},
-    {"$D", "name of the dictionary object", eDictionary},
-    {"$X", "text given with the name", eNone},
-    {"$T", "short name of the type", eType},
-    {"$R", "nothing; the name may be changed", eNone},
-    {"$$", "one dollar sign", eNone},
-    {"$x", "text of the symbol", eNone},
-    {"$f", "name of the symbol, a function", eNone},
-    {"$F", "the same in upper case", eNone},
-    {"$v", "name of the symbol", eNone},
-    {"$V", "the same in upper case", eNone},
-    {"$t", "short name of the symbol's type", eNone},
-    {"$", "no macro of the language", eNone},
-    {"", "as written", eNone},
+    {"$(Type)", "name of the type", fromType},
+    {"$(BaseType)", "name of the base type", fromType},
+    {"$(Component)", "software component of the variable", fromDictionary},
+    {"$(Task)", "name of the task", fromTask},
+    {"$(ISR)", "name of the interrupt service routine", fromTask},
+    {"$(Time", "period and offset", fromTask},
+    {"$(Period", "period", fromTask},
+    {"$(Offset", "offset", fromTask},
+    {"$(", "given with the name", nullptr},
+    {"$E", "given with the name", nullptr},
+    {"$L", "signal label, else block name", fromSource},
+    {"$B", "block name", fromSource},
+    {"$S", "subsystem id and number", fromSource},
+    {"$I", "subsystem id", fromSource},
+    {"$M", "model name", fromModel},
+    {"$N", "name of the subsystem under generation", fromModel},
+    {"$H", "states around the chart object", fromSource},
+    {"$O", "name of the chart object", fromSource},
+    {"$C", "subsystem id and number of the chart object", fromSource},
+    {"$D", "name of the dictionary object", fromDictionary},
+    {"$X", "text given with the name", nullptr},
+    {"$T", "short name of the type", fromType},
+    {"$R", "nothing; the name may be changed", nullptr},
+    {"$$", "one dollar sign", nullptr},
+    {"$x", "text of the symbol", nullptr},
+    {"$f", "name of the symbol, a function", nullptr},
+    {"$F", "the same in upper case", nullptr},
+    {"$v", "name of the symbol", nullptr},
+    {"$V", "the same in upper case", nullptr},
+    {"$t", "short name of the symbol's type", nullptr},
+    {"$", "no macro of the language", nullptr},
+    {"", "as written", nullptr},
 };
 
-std::string pathOf(const HxCSrcRef* srcRef) {
-  if (srcRef == nullptr) return "no source";
-  KyCXString text;
-  srcRef->toString(text);
-  return HX_ToUtf8(text);
-}
-
-std::string originOf(const HX_NameItem& item, const std::string& macro) {
+std::string meaningOf(const HX_Name& name, const std::string& macro) {
   const MeaningRow* row = kMeanings;
-  while (macro.compare(0, std::string(row->macro).size(), row->macro) != 0)
-    ++row;
-  std::string meaning = row->meaning;
-  const HX_NameItem* timed = item.isTask() ? &item : item.task;
-  if (timed == nullptr) timed = item.isr;
-  switch (row->origin) {
-    case eNone:
-      return meaning;
-    case eModel:
-      return meaning + ", from the model";
-    case eSource:
-      return meaning + ", from " + pathOf(item.source);
-    case eDictionary:
-      return meaning + ", from " +
-             pathOf(item.dd != nullptr ? item.dd : item.source);
-    case eType:
-      return meaning + ", from " +
-             (item.type != nullptr ? "type '" + item.type->id + "'"
-                                   : "no type");
-    case eTask:
-      return meaning + ", from " +
-             (timed != nullptr ? timed->kind + " '" + timed->id + "'"
-                               : "no task");
-  }
-  return meaning;
+  while (macro.compare(0, std::strlen(row->macro), row->macro) != 0) ++row;
+  if (row->origin == nullptr) return row->meaning;
+  return row->meaning + (", from " + row->origin(name));
 }
 
 // The end of the macro or of the literal text that begins at \p from.
@@ -100,24 +88,22 @@ std::size_t endOfToken(const std::string& text, std::size_t from) {
 
 }  // namespace
 
-std::vector<HX_ExplainedMacro> HX_NameRun::explain(const HX_NameItem& item) {
+std::vector<HX_ExplainedMacro> HX_NameRun::explain(const HX_Name& name) {
   std::vector<HX_ExplainedMacro> steps;
-  const std::string& text = item.nameTemplate;
+  const std::string& text = name.nameTemplate;
   for (std::size_t from = 0; from < text.size();) {
     const std::size_t end = endOfToken(text, from);
-    const std::string macro = text.substr(from, end - from);
+    const std::string token = text.substr(from, end - from);
     from = end;
-    if (macro[0] != '$') {
-      steps.push_back({macro, macro, originOf(item, "")});
+    if (token[0] != '$') {
+      steps.push_back({token, token, meaningOf(name, "")});
       continue;
     }
-    HX_BdBlock ivBlock(HX_FromUtf8(item.ivBlock.value_or("")), item.source);
-    HxCCIdentifier id = begin(item, macro);
-    if (item.ivBlock) id.setSourceIVBlock(&ivBlock);
-    expand(item, id, true);
-    steps.push_back({macro,
+    HxCCIdentifier id(HX_FromUtf8(token));
+    expand(name, id, true);
+    steps.push_back({token,
                      HX_ToUtf8(id.getCookedName(HxCCIdentifier::eFormalName)),
-                     originOf(item, macro)});
+                     meaningOf(name, token)});
   }
   HX_MessageHandler::instance().clear();
   return steps;

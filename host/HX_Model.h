@@ -1,8 +1,9 @@
-// The model that a document describes, built from the platform's stand-ins.
+// The model that a document describes, built from the platform's stand-ins, and
+// what becomes of its names.
 //
-//   const HX_Document document("cruise_control.json");
-//   HX_Model model(document.root());
-//   for (const auto& name : model.names()) form(*name);
+//   HX_Document document("cruise_control.json", folder);
+//   HX_Model model(document, "host/keywords");
+//   for (HX_Name& name : model.names) form(name);
 //
 // While a model lives it is the one that the library sees: options, model
 // names, data type server and data dictionary are those of the process.
@@ -10,6 +11,7 @@
 #ifndef HOST_HX_MODEL_H
 #define HOST_HX_MODEL_H
 
+#include <deque>
 #include <map>
 #include <memory>
 #include <optional>
@@ -19,6 +21,7 @@
 #include <vector>
 
 #include "SourceRef/HxCDdSrcRef.h"
+#include "SourceRef/HxCSrcRefSet.h"
 #include "platform/datatypes/HX_DataType.h"
 #include "platform/datatypes/HX_DataTypeServer.h"
 #include "platform/datatypes/HX_NumericalType.h"
@@ -28,63 +31,63 @@
 #include "platform/model/SC_Chart.h"
 #include "platform/model/SC_State.h"
 
-class HX_DocumentNode;
+struct HX_Document;
 
-/// A data type of the generated code.
+/// A data type of the generated code. Fields without a comment are those of the
+/// schema, here and below.
 struct HX_TypeItem {
   explicit HX_TypeItem(const KyCXString& nameInCode) : type(nameInCode) {}
 
   std::string id;
-  std::string name;   // in the code
-  std::string kind;   // as the schema lists them
-  std::string cType;  // of a base type
-  int bits = 0;       // of a bit field
-  int length = 0;     // of an array
+  std::string name;
+  std::string kind;
+  std::string cType;
+  int bits = 0;
+  int length = 0;
   bool isNameless = false;
   HX_TypeItem* of = nullptr;
   std::vector<std::pair<std::string, HX_TypeItem*>> fields;
   std::vector<std::pair<std::string, int>> values;
-  std::optional<HX_NumericalType> numerical;  // range of base and bit field
+  std::optional<HX_NumericalType> numerical;  // range of the kinds without `of`
   HX_DataType type;
 
   /// The type at the end of the chain of `of`: what a value of this type, or
   /// an element of it, is stored as. Null where the chain closes a circle.
   const HX_TypeItem* scalar() const;
-  /// 1 for what is no array; elements of nested arrays are counted in all.
-  std::size_t elementCount() const;
   bool isFloating() const { return cType == "float" || cType == "double"; }
 };
 
-struct HX_NameItem;
+struct HX_Name;
 
 struct HX_ScopeItem {
   std::string id;
-  std::string kind;  // file, function, block, flat
+  std::string kind;
   const HX_ScopeItem* parent = nullptr;
-  const HX_NameItem* function = nullptr;  // whose body a function scope is
+  const HX_Name* function = nullptr;  // whose body a function scope is
 };
 
-/// A symbol that knows the name it stands for.
-struct HX_HostSymbol : HxCSymbol {
-  using HxCSymbol::HxCSymbol;
-  std::string id;
+/// A message of the library, or a remark of the host itself.
+struct HX_Finding {
+  int id;  ///< what a user sees; 0 for a remark of the host
+  int severity;
+  std::string text;    // UTF-8, as below
+  std::string source;  // may be empty
 };
 
-/// One name to form, and what it is for. Fields without a comment are those of
-/// the schema.
-struct HX_NameItem {
-  struct Substitution {
-    std::string macro;
-    std::string value;
-    int kind;  // HxCNames::tagMacroKindEnum
-  };
+struct HX_Substitution {
+  std::string macro;
+  std::string value;
+  int kind;  // HxCNames::tagMacroKindEnum
+};
 
+/// One name: what the document wants, and what became of it.
+struct HX_Name {
   std::string id;
   std::string nameTemplate;
-  std::string kind;
+  std::string kind = "object";
   const HxCSrcRef* source = nullptr;
   const HxCSrcRef* dd = nullptr;
-  std::vector<const HxCSrcRef*> alsoFrom;
+  HxCSrcRefSet sources;  // these two, and `alsoFrom`
   std::optional<std::string> ivBlock;
   std::string label;
   std::string x;
@@ -94,9 +97,9 @@ struct HX_NameItem {
   unsigned int provisional = 0;
   bool modelContext = false;
   std::unique_ptr<HxCSymbol> symbol;  // null for none
-  std::vector<Substitution> substitutions;
-  const HX_NameItem* task = nullptr;
-  const HX_NameItem* isr = nullptr;
+  std::vector<HX_Substitution> substitutions;
+  const HX_Name* task = nullptr;
+  const HX_Name* isr = nullptr;
   std::map<std::string, std::string> osTexts;  // event, counter, ...
   double period = 0;
   double offset = 0;
@@ -104,73 +107,48 @@ struct HX_NameItem {
   std::vector<double> initial;
   double lsb = 1;
   double zero = 0;
-  std::vector<const HX_NameItem*> dependsOn;
+  std::vector<const HX_Name*> dependsOn;
+
+  std::string sourcePath;  // of the best of the sources
+  std::string formal;
+  std::string actual;
+  bool isComplete = false;
+  bool isDefined = false;  // stands in its scope and may be written into code
+  std::vector<std::string> changes;  // why the expanded text was changed
+  std::vector<HX_Finding> findings;
 
   bool isTask() const { return kind == "task" || kind == "isr"; }
+  bool isFunction() const { return isTask() || kind == "function"; }
+  /// The task or isr whose times the macros take; null for none.
+  const HX_Name* timed() const {
+    if (isTask()) return this;
+    return task != nullptr ? task : isr;
+  }
 };
 
-/// Owns everything that the document describes. Not copied: parts point to
-/// each other.
-class HX_Model {
- public:
-  /// Throws HX_DocumentError for an id that repeats or leads nowhere.
-  explicit HX_Model(const HX_DocumentNode& root);
+/// Owns everything that the document describes, in its order.
+struct HX_Model {
+  /// Throws HX_DocumentError for an id that repeats or leads nowhere, and for a
+  /// word list that is not in \p keywordFolder. Frees the parts of the document
+  /// that there may be many of as it reads them.
+  HX_Model(HX_Document& document, const std::string& keywordFolder);
   HX_Model(const HX_Model&) = delete;
   HX_Model& operator=(const HX_Model&) = delete;
   ~HX_Model();
 
-  const std::string& name() const { return m_Name; }
-  const std::vector<std::string>& keywordLists() const { return m_Keywords; }
-  /// In the order of the document, also below.
-  const std::vector<std::unique_ptr<HX_TypeItem>>& types() const {
-    return m_Types;
-  }
-  const std::vector<std::unique_ptr<HX_ScopeItem>>& scopes() const {
-    return m_Scopes;
-  }
-  const std::vector<std::unique_ptr<HX_NameItem>>& names() const {
-    return m_Names;
-  }
+  std::string name;
+  std::set<std::string> words;  // of the word lists
+  std::deque<HX_TypeItem> types;
+  std::deque<HX_ScopeItem> scopes;  // parents first
+  std::deque<HX_Name> names;
 
- private:
-  void readModel(const HX_DocumentNode& root);
-  void readBlock(const HX_DocumentNode& node, HX_Block* parent);
-  void readChart(const HX_DocumentNode& node, HX_StateflowBlock& block);
-  void readChartObject(const HX_DocumentNode& node, SC_State& chart,
-                       const std::string& path, const std::string& hierarchy);
-  void readDataDictionary(const HX_DocumentNode& node);
-  void readTypes(const HX_DocumentNode& root);
-  void completeType(const HX_DocumentNode& node, HX_TypeItem& item);
-  HX_TypeItem* findNamedType(const HX_DocumentNode& id) const;
-  void takeCodeName(const HX_DocumentNode& name);
-  void readScopes(const HX_DocumentNode& root);
-  void readScope(const HX_DocumentNode& node, const HX_ScopeItem* parent);
-  void completeScope(const HX_DocumentNode& node, std::size_t& index);
-  void readNames(const HX_DocumentNode& root);
-  void readName(const HX_DocumentNode& node, HX_NameItem& item);
-  void readSymbol(const HX_DocumentNode& node, HX_NameItem& item);
-  void readMultirate(const HX_DocumentNode& node, HX_NameItem& item);
-  void readVariable(const HX_DocumentNode& node, HX_NameItem& item);
-  void addSource(const HX_DocumentNode& node, const HxCSrcRef* srcRef);
-
-  std::string m_Name;
-  std::vector<std::string> m_Keywords;
-  HX_OptionsExt m_Options;
-  HX_DataTypeServer m_TypeServer;
-  std::vector<std::unique_ptr<HX_Block>> m_Blocks;  // parents first
-  std::vector<std::unique_ptr<SC_Chart>> m_Charts;
-  std::vector<std::unique_ptr<SC_State>> m_ChartObjects;
-  std::vector<std::unique_ptr<HxCDdSrcRef>> m_DdRefs;
-  std::vector<std::unique_ptr<HX_TypeItem>> m_Types;
-  std::vector<std::unique_ptr<HX_ScopeItem>> m_Scopes;
-  std::vector<std::unique_ptr<HX_NameItem>> m_Names;
-  std::map<std::string, const HxCSrcRef*> m_SourcesById;
-  std::map<std::string, HX_TypeItem*> m_TypesById;
-  std::map<std::string, const HX_ScopeItem*> m_ScopesById;
-  std::map<std::string, HX_NameItem*> m_NamesById;
-  std::set<std::string> m_CodeNames;      // of types and constants
-  std::set<const HX_NameItem*> m_Bodies;  // functions that have a scope
-  const HX_ScopeItem* m_DefaultScope = nullptr;
+  // Seen through the library.
+  HX_OptionsExt options;
+  HX_DataTypeServer typeServer;
+  std::vector<std::unique_ptr<HX_Block>> blocks;
+  std::deque<SC_Chart> charts;
+  std::deque<SC_State> chartObjects;
+  std::deque<HxCDdSrcRef> ddRefs;
 };
 
 #endif  // HOST_HX_MODEL_H

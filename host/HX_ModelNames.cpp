@@ -1,12 +1,11 @@
 // The names of a model, and what each is for.
 #include "Naming/HxCNames.h"
-#include "host/HX_Model.h"
-#include "host/HX_ModelIds.h"
+#include "host/HX_ModelReader.h"
 #include "host/HX_Text.h"
 
 namespace {
 
-constexpr Choice<unsigned int> kMacroBits[] = {
+const std::map<std::string, unsigned int> kMacroBits = {
     {"$L", HxCNames::eMacroLabel},
     {"$B", HxCNames::eMacroBlockName},
     {"$S", HxCNames::eMacroSystemNumber},
@@ -23,125 +22,130 @@ constexpr Choice<unsigned int> kMacroBits[] = {
     {"$(Type)", HxCNames::eMacroLongTypeName},
 };
 
-constexpr Choice<int> kSubstitutionKinds[] = {
+const std::map<std::string, int> kSubstitutionKinds = {
     {"exact", HxCNames::eMacroKindExact},
     {"any", HxCNames::eMacroKindAnyCase},
     {"selects", HxCNames::eMacroKindCaseSelectsValue},
 };
 
-constexpr Choice<int> kSymbolKinds[] = {
+const std::map<std::string, int> kSymbolKinds = {
     {"variable", HxCSymbol::eVariable},
     {"constant", HxCSymbol::eConstant},
     {"function", HxCSymbol::eFunction},
 };
 
-unsigned int macroBits(const HX_DocumentNode& node, const char* field) {
+unsigned int macroBits(const HX_Json& macros) {
   unsigned int bits = 0;
-  node.forEach(field, [&](const HX_DocumentNode& macro) {
-    bits |= valueOf(kMacroBits, macro.value());
-  });
+  for (const HX_Json& macro : macros) bits |= kMacroBits.at(macro);
   return bits;
 }
 
-constexpr char kSource[] = "a block, a chart object or a dictionary object";
+// 1 for what is no array; elements of nested arrays are counted in all.
+std::size_t elementCount(const HX_TypeItem* type) {
+  std::size_t count = 1;
+  if (type->scalar() == nullptr) return count;
+  for (; type != nullptr; type = type->of) {
+    if (type->kind == "array") count *= static_cast<std::size_t>(type->length);
+  }
+  return count;
+}
 
 }  // namespace
 
-void HX_Model::readNames(const HX_DocumentNode& root) {
-  root.forEach("names", [&](const HX_DocumentNode& node) {
-    m_Names.push_back(std::make_unique<HX_NameItem>());
-    HX_NameItem& item = *m_Names.back();
-    item.id = node.text("id");
-    item.kind = node.text("kind", "object");
-    enter(node, m_NamesById, &item);
-  });
+void HX_ModelReader::readNames(HX_Json& names) {
+  for (Json node : names) {
+    HX_Name& name = m_Model.names.emplace_back();
+    name.id = node["id"];
+    name.kind = node.value("kind", "object");
+    m_Names.enter(node, &name);
+  }
   // Names refer to tasks and variables that may stand after them.
   std::size_t index = 0;
-  root.forEach("names", [&](const HX_DocumentNode& node) {
-    readName(node, *m_Names[index++]);
-  });
+  for (HX_Json& node : names) {
+    readName(node, m_Model.names[index++]);
+    node = nullptr;
+  }
 }
 
-void HX_Model::readName(const HX_DocumentNode& node, HX_NameItem& item) {
-  item.nameTemplate = node.text("template");
-  item.source = findIn(node, "source", m_SourcesById, kSource);
-  item.dd = findIn(node, "dd", m_SourcesById, kSource);
-  if (item.dd != nullptr && item.dd->isDd() == nullptr)
-    node.at("dd").fail("the id of a dictionary object");
-  node.forEach("alsoFrom", [&](const HX_DocumentNode& id) {
-    item.alsoFrom.push_back(find(id, m_SourcesById, kSource));
-  });
-  if (node.has("ivBlock")) item.ivBlock = node.text("ivBlock");
-  item.label = node.text("label");
-  item.x = node.text("x");
-  item.type = findIn(node, "type", m_TypesById, "a type");
-  item.scope = node.has("scope")
-                   ? find(node.at("scope"), m_ScopesById, "a scope")
-                   : m_DefaultScope;
-  const bool isGlobal = item.isTask() || item.kind == "function";
-  if (isGlobal && item.scope->kind != "file")
-    node.at("scope").fail("the id of a file scope for a function");
-  item.retained = macroBits(node, "retained");
-  item.provisional = macroBits(node, "provisional");
-  item.modelContext = node.flag("modelContext", false);
-  node.forEach("substitute", [&](const HX_DocumentNode& entry) {
-    item.substitutions.push_back(
-        {entry.text("macro"), entry.text("value"),
-         valueOf(kSubstitutionKinds, entry.text("case", "exact"))});
-  });
-  if (node.has("symbol")) readSymbol(node.at("symbol"), item);
-  readMultirate(node, item);
-  if (item.kind == "variable") readVariable(node, item);
+void HX_ModelReader::readName(Json node, HX_Name& name) {
+  name.nameTemplate = node["template"];
+  name.source = m_Sources.findIn(node, "source");
+  name.dd = m_Sources.findIn(node, "dd");
+  if (name.dd != nullptr && name.dd->isDd() == nullptr)
+    m_Document.fail(node["dd"], "the id of a dictionary object");
+  name.sources.addSrcRef(name.source);
+  name.sources.addSrcRef(name.dd);
+  for (Json id : HX_FieldOf(node, "alsoFrom"))
+    name.sources.addSrcRef(m_Sources.find(id));
+  if (node.contains("ivBlock")) name.ivBlock = node["ivBlock"];
+  name.label = node.value("label", "");
+  name.x = node.value("x", "");
+  name.type = m_Types.findIn(node, "type");
+  name.scope = m_Scopes.findIn(node, "scope");
+  if (name.scope == nullptr) name.scope = m_FileScope;
+  if (name.isFunction() && name.scope->kind != "file")
+    m_Document.fail(node["scope"], "the id of a file scope for a function");
+  name.retained = macroBits(HX_FieldOf(node, "retained"));
+  name.provisional = macroBits(HX_FieldOf(node, "provisional"));
+  name.modelContext = node.value("modelContext", false);
+  for (Json entry : HX_FieldOf(node, "substitute"))
+    name.substitutions.push_back(
+        {entry["macro"], entry["value"],
+         kSubstitutionKinds.at(entry.value("case", "exact"))});
+  if (node.contains("symbol")) readSymbol(node["symbol"], name);
+  readMultirate(node, name);
+  if (name.kind == "variable") readVariable(node, name);
 }
 
-void HX_Model::readSymbol(const HX_DocumentNode& node, HX_NameItem& item) {
-  HX_TypeItem* type = findIn(node, "type", m_TypesById, "a type");
-  item.symbol = std::make_unique<HxCSymbol>(
-      HX_FromUtf8(node.text("name")), valueOf(kSymbolKinds, node.text("kind")),
+void HX_ModelReader::readSymbol(Json node, HX_Name& name) {
+  HX_TypeItem* type = m_Types.findIn(node, "type");
+  name.symbol = std::make_unique<HxCSymbol>(
+      HX_FromUtf8(node["name"]), kSymbolKinds.at(node["kind"]),
       type != nullptr ? &type->type : nullptr);
-  item.symbol->setDollarX(HX_Utf8ToLatin1(node.text("x")).c_str());
+  name.symbol->setDollarX(HX_Utf8ToLatin1(node.value("x", "")).c_str());
 }
 
-void HX_Model::readMultirate(const HX_DocumentNode& node, HX_NameItem& item) {
-  for (const char* field : {"task", "isr"}) {
-    if (!node.has(field)) continue;
-    const HX_NameItem* named = find(node.at(field), m_NamesById, "a name");
-    if (named->kind != field || named == &item)
-      node.at(field).fail(std::string("the id of another name of kind ") +
-                          field);
-    (std::string(field) == "task" ? item.task : item.isr) = named;
+void HX_ModelReader::readMultirate(Json node, HX_Name& name) {
+  name.task = m_Names.findIn(node, "task");
+  name.isr = m_Names.findIn(node, "isr");
+  for (const auto& [kind, named] :
+       {std::make_pair("task", name.task), std::make_pair("isr", name.isr)}) {
+    if (named != nullptr && (named->kind != kind || named == &name))
+      m_Document.fail(node[kind],
+                      std::string("the id of another name of kind ") + kind);
   }
   for (const char* field :
        {"event", "counter", "message", "messageVariable", "osObject"}) {
-    if (node.has(field)) item.osTexts[field] = node.text(field);
+    if (node.contains(field)) name.osTexts[field] = node[field];
   }
-  item.period = node.number("period", 0);
-  item.offset = node.number("offset", 0);
-  item.cyclic = node.flag("cyclic", true);
+  name.period = node.value("period", 0.0);
+  name.offset = node.value("offset", 0.0);
+  name.cyclic = node.value("cyclic", true);
 }
 
-void HX_Model::readVariable(const HX_DocumentNode& node, HX_NameItem& item) {
-  findNamedType(node.at("type"));
-  if (item.scope->kind == "flat")
-    node.at("scope").fail("the id of a scope that is not flat");
-  node.forEach("dependsOn", [&](const HX_DocumentNode& id) {
-    const HX_NameItem* other = find(id, m_NamesById, "a name");
-    if (other->kind != "variable") id.fail("the id of a variable");
-    item.dependsOn.push_back(other);
-  });
-  item.lsb = node.number("lsb", 1);
-  item.zero = node.number("zero", 0);
-  if (!node.has("initial")) return;
+void HX_ModelReader::readVariable(Json node, HX_Name& name) {
+  findNamedType(node["type"]);
+  if (name.scope->kind == "flat")
+    m_Document.fail(node["scope"], "the id of a scope that is not flat");
+  for (Json id : HX_FieldOf(node, "dependsOn")) {
+    name.dependsOn.push_back(m_Names.find(id));
+    if (name.dependsOn.back()->kind != "variable")
+      m_Document.fail(id, "the id of a variable");
+  }
+  name.lsb = node.value("lsb", 1.0);
+  name.zero = node.value("zero", 0.0);
+  if (!node.contains("initial")) return;
 
-  const HX_DocumentNode initial = node.at("initial");
-  const HX_TypeItem* scalar = item.type->scalar();
+  Json initial = node["initial"];
+  const HX_TypeItem* scalar = name.type->scalar();
   if (scalar != nullptr && !scalar->numerical)
-    initial.fail("no initial value for a structure or an enumeration");
-  if (initial.value().is_array())
-    item.initial = initial.value().get<std::vector<double>>();
+    m_Document.fail(initial,
+                    "no initial value for a structure or an enumeration");
+  if (initial.is_array())
+    name.initial = initial.get<std::vector<double>>();
   else
-    item.initial = {initial.value().get<double>()};
-  const auto room = item.type->elementCount();
-  if (item.initial.size() > room || item.initial.empty())
-    initial.fail("1 to " + std::to_string(room) + " values");
+    name.initial = {initial.get<double>()};
+  const std::size_t room = elementCount(name.type);
+  if (name.initial.size() > room || name.initial.empty())
+    m_Document.fail(initial, "1 to " + std::to_string(room) + " values");
 }

@@ -15,22 +15,25 @@ namespace {
 constexpr int kWarning = 1;
 constexpr int kError = 2;
 
-void remark(HX_FormedName& formed, int severity, const std::string& text) {
-  formed.findings.push_back({0, severity, text, formed.sourcePath});
+void remark(HX_Name& name, int severity, const std::string& text) {
+  name.findings.push_back({0, severity, text, name.sourcePath});
 }
 
-std::string textOf(const HxCSrcRef* srcRef) {
-  if (srcRef == nullptr) return {};
-  KyCXString text;
-  srcRef->toString(text);
-  return HX_ToUtf8(text);
+// A message is best attached to the last block, else to the last dictionary
+// object, else to the last other reference; null for an empty set.
+const HxCSrcRef* bestOf(const HxCSrcRefSet& sources) {
+  const HxCSrcRef* block = nullptr;
+  const HxCSrcRef* dd = nullptr;
+  const HxCSrcRef* other = nullptr;
+  HxCSrcRefServer::getSpecificSrcRefFromSet(&sources, &block, &dd, &other);
+  if (block != nullptr) return block;
+  return dd != nullptr ? dd : other;
 }
 
-HxCSrcRefSet sourcesOf(const HX_NameItem& item) {
-  HxCSrcRefSet sources(item.source);
-  sources.addSrcRef(item.dd);
-  for (const HxCSrcRef* srcRef : item.alsoFrom) sources.addSrcRef(srcRef);
-  return sources;
+// Other names contain those of tasks, and names of tasks that of an isr.
+auto rankOf(const HX_Name& name) {
+  const int group = name.kind == "isr" ? 0 : name.kind == "task" ? 1 : 2;
+  return std::make_tuple(group, std::cref(name.id));
 }
 
 // A value that needs no expansion: without the "$R" of a template, which would
@@ -41,196 +44,152 @@ HxCCIdentifier finalName(const KyCXString& text) {
   return id;
 }
 
-void takeMessages(HX_FormedName& formed) {
-  HX_MessageHandler& handler = HX_MessageHandler::instance();
-  for (const HX_Message& message : handler.messages()) {
-    formed.findings.push_back({message.id, message.severity,
-                               HX_Latin1ToUtf8(message.text),
-                               HX_Latin1ToUtf8(message.source)});
-  }
-  handler.clear();
-}
+struct OsTextRow {
+  const char* field;
+  void (HxCNames::*replace)(HxCCIdentifier&, const HxCCIdentifier&);
+};
+
+constexpr OsTextRow kOsTexts[] = {
+    {"event", &HxCNames::replaceMultirateEventName},
+    {"counter", &HxCNames::replaceMultirateCtrName},
+    {"message", &HxCNames::replaceMultirateMsgName},
+    {"osObject", &HxCNames::replaceMultirateObjName},
+};
 
 }  // namespace
 
-const HxCSrcRef* HX_ChooseSrcRef(const HxCSrcRefSet& sources) {
-  const HxCSrcRef* block = nullptr;
-  const HxCSrcRef* dd = nullptr;
-  const HxCSrcRef* other = nullptr;
-  HxCSrcRefServer::getSpecificSrcRefFromSet(&sources, &block, &dd, &other);
-  if (block != nullptr) return block;
-  return dd != nullptr ? dd : other;
+std::string HX_PathOf(const HxCSrcRef* srcRef) {
+  if (srcRef == nullptr) return {};
+  KyCXString text;
+  srcRef->toString(text);
+  return HX_ToUtf8(text);
 }
 
-HX_NameRun::HX_NameRun(const HX_Model& model, HX_NameSpaces& spaces)
-    : m_Model(model), m_Spaces(spaces) {}
+void HX_TakeMessages(std::vector<HX_Finding>& findings) {
+  HX_MessageHandler& handler = HX_MessageHandler::instance();
+  for (const HX_Message& message : handler.messages())
+    findings.push_back({message.id, message.severity,
+                        HX_Latin1ToUtf8(message.text),
+                        HX_Latin1ToUtf8(message.source)});
+  handler.clear();
+}
 
-std::vector<HX_FormedName> HX_NameRun::formAll(const Progress& progress) {
-  HX_MessageHandler::instance().clear();
-  const auto& items = m_Model.names();
-  std::vector<std::size_t> order(items.size());
-  for (std::size_t i = 0; i < order.size(); ++i) order[i] = i;
-  // Other names contain those of tasks, and names of tasks that of an isr.
-  const auto rank = [&](std::size_t i) {
-    const std::string& kind = items[i]->kind;
-    return std::make_tuple(kind == "isr"    ? 0
-                           : kind == "task" ? 1
-                                            : 2,
-                           std::cref(items[i]->id));
-  };
-  std::sort(order.begin(), order.end(),
-            [&](std::size_t a, std::size_t b) { return rank(a) < rank(b); });
-
-  std::vector<HX_FormedName> names(items.size());
+void HX_NameRun::formAll(std::deque<HX_Name>& names, const Progress& progress) {
+  std::vector<HX_Name*> order;
+  order.reserve(names.size());
+  for (HX_Name& name : names) order.push_back(&name);
+  std::sort(order.begin(), order.end(), [](const HX_Name* a, const HX_Name* b) {
+    return rankOf(*a) < rankOf(*b);
+  });
   std::size_t done = 0;
-  for (const std::size_t i : order) {
-    names[i] = form(*items[i]);
-    progress(++done, items.size());
+  for (HX_Name* name : order) {
+    form(*name);
+    progress(++done, order.size());
   }
-  return names;
 }
 
-HX_FormedName HX_NameRun::form(const HX_NameItem& item) {
-  HX_FormedName formed;
-  formed.item = &item;
-  formed.sources = sourcesOf(item);
-  formed.sourcePath = textOf(HX_ChooseSrcRef(formed.sources));
-  if (std::count(item.nameTemplate.begin(), item.nameTemplate.end(), ':') > 1)
-    remark(formed, kWarning,
+void HX_NameRun::form(HX_Name& name) {
+  name.sourcePath = HX_PathOf(bestOf(name.sources));
+  const std::string& text = name.nameTemplate;
+  if (std::count(text.begin(), text.end(), ':') > 1)
+    remark(name, kWarning,
            "The name template has more than two parts; the first two count.");
-
-  HX_BdBlock ivBlock(HX_FromUtf8(item.ivBlock.value_or("")), item.source);
-  HxCCIdentifier id = begin(item, item.nameTemplate);
-  if (item.ivBlock) id.setSourceIVBlock(&ivBlock);
-  formed.isComplete = expand(item, id, false);
-  id.setSourceIVBlock(nullptr);
+  HxCCIdentifier id(HX_FromUtf8(text));
+  name.isComplete = expand(name, id, false);
+  HX_TakeMessages(name.findings);
 
   // A name that still holds macros is no C name yet.
-  if (formed.isComplete || item.retained == 0) {
-    makeCName(id, formed);
-    define(id, formed);
+  if (name.isComplete || name.retained == 0) {
+    makeCName(id, name);
+    define(id, name);
+    HX_TakeMessages(name.findings);
   }
-  formed.formal = HX_ToUtf8(id.getCookedName(HxCCIdentifier::eFormalName));
-  formed.actual = HX_ToUtf8(id.getCookedName(HxCCIdentifier::eActualName));
-  takeMessages(formed);
-  if (item.isTask()) m_TaskNames[&item] = id;
-  return formed;
-}
-
-HxCCIdentifier HX_NameRun::begin(const HX_NameItem& item,
-                                 const std::string& nameTemplate) {
-  HxCCIdentifier id(HX_FromUtf8(nameTemplate));
-  id.setSourceRef(item.source);
-  id.setDdSourceRef(item.dd);
-  id.setSignalLabel(HX_FromUtf8(item.label));
-  id.setDollarXValue(HX_FromUtf8(item.x));
-  return id;
+  name.formal = HX_ToUtf8(id.getCookedName(HxCCIdentifier::eFormalName));
+  name.actual = HX_ToUtf8(id.getCookedName(HxCCIdentifier::eActualName));
+  if (name.isTask()) m_TaskNames[&name] = id;
 }
 
 // Symbol macros go first: the expansion then finds the "$R" that they bring,
 // and does not report them as unknown here.
-bool HX_NameRun::expand(const HX_NameItem& item, HxCCIdentifier& id,
+bool HX_NameRun::expand(const HX_Name& name, HxCCIdentifier& id,
                         bool suppressMessages) {
-  substitute(item, id);
-  replaceMultirate(item, id);
-  if (item.symbol) m_Names.handleSymbolNameMacro(id, item.symbol.get());
-  if (item.kind == "file")
-    return m_Names.handleFileNameMacro(id, item.modelContext);
-  return m_Names.createNameFromForm(
-      id, item.type != nullptr ? &item.type->type : nullptr, item.retained,
-      item.provisional, suppressMessages);
-}
+  id.setSourceRef(name.source);
+  id.setDdSourceRef(name.dd);
+  id.setSignalLabel(HX_FromUtf8(name.label));
+  id.setDollarXValue(HX_FromUtf8(name.x));
+  HX_BdBlock ivBlock(HX_FromUtf8(name.ivBlock.value_or("")), name.source);
+  if (name.ivBlock) id.setSourceIVBlock(&ivBlock);
 
-void HX_NameRun::substitute(const HX_NameItem& item, HxCCIdentifier& id) {
-  for (const HX_NameItem::Substitution& entry : item.substitutions) {
+  for (const HX_Substitution& entry : name.substitutions)
     m_Names.substAllDollarZByValue(
         id, HX_FromUtf8(entry.macro), HxCCIdentifier(HX_FromUtf8(entry.value)),
         static_cast<HxCNames::tagMacroKindEnum>(entry.kind));
-  }
+  replaceMultirate(name, id);
+  if (name.symbol) m_Names.handleSymbolNameMacro(id, name.symbol.get());
+  const bool isComplete =
+      name.kind == "file"
+          ? m_Names.handleFileNameMacro(id, name.modelContext)
+          : m_Names.createNameFromForm(
+                id, name.type != nullptr ? &name.type->type : nullptr,
+                name.retained, name.provisional, suppressMessages);
+  id.setSourceIVBlock(nullptr);
+  return isComplete;
 }
 
-const HxCCIdentifier& HX_NameRun::taskName(const HX_NameItem* item) const {
-  static const HxCCIdentifier none;
-  const auto found = m_TaskNames.find(item);
-  return found == m_TaskNames.end() ? none : found->second;
-}
-
-void HX_NameRun::replaceMultirate(const HX_NameItem& item, HxCCIdentifier& id) {
-  const HX_NameItem* timed = item.isTask()          ? &item
-                             : item.task != nullptr ? item.task
-                                                    : item.isr;
-  if (timed != nullptr) {
+void HX_NameRun::replaceMultirate(const HX_Name& name, HxCCIdentifier& id) {
+  if (const HX_Name* timed = name.timed()) {
     m_Names.replaceMultirateTaskISRName(
-        id, taskName(item.task), taskName(item.isr), item.kind == "task");
+        id, m_TaskNames[name.task], m_TaskNames[name.isr], name.kind == "task");
     m_Names.replaceMultirateTimeName(id, timed->period, timed->offset,
                                      timed->cyclic);
   }
-
-  using Replace = void (HxCNames::*)(HxCCIdentifier&, const HxCCIdentifier&);
-  struct Row {
-    const char* field;
-    Replace replace;
-  };
-  static constexpr Row kRows[] = {
-      {"event", &HxCNames::replaceMultirateEventName},
-      {"counter", &HxCNames::replaceMultirateCtrName},
-      {"message", &HxCNames::replaceMultirateMsgName},
-      {"osObject", &HxCNames::replaceMultirateObjName},
-  };
-  for (const Row& row : kRows) {
-    const auto text = item.osTexts.find(row.field);
-    if (text != item.osTexts.end())
+  for (const OsTextRow& row : kOsTexts) {
+    const auto text = name.osTexts.find(row.field);
+    if (text != name.osTexts.end())
       (m_Names.*row.replace)(id, finalName(HX_FromUtf8(text->second)));
   }
-  const auto variable = item.osTexts.find("messageVariable");
-  if (variable != item.osTexts.end())
+  const auto variable = name.osTexts.find("messageVariable");
+  if (variable != name.osTexts.end())
     m_Names.replaceMultirateMsgVarName(id, HX_FromUtf8(variable->second));
 }
 
-void HX_NameRun::makeCName(HxCCIdentifier& id, HX_FormedName& formed) {
+void HX_NameRun::makeCName(HxCCIdentifier& id, HX_Name& name) {
   id.activateActualName();
-  KyCXString before = id.getCookedName(HxCCIdentifier::eActiveName);
+  const KyCXString expanded = id.getCookedName(HxCCIdentifier::eActualName);
   id.makeCIdentifier();
-  if (!(before == id.getCookedName(HxCCIdentifier::eActiveName)))
-    formed.changes.push_back("made an identifier");
-
-  before = id.getCookedName(HxCCIdentifier::eActiveName);
+  const KyCXString whole = id.getCookedName(HxCCIdentifier::eActualName);
+  if (!(whole == expanded)) name.changes.push_back("made an identifier");
   id.adaptSize();
-  const KyCXString& name = id.getCookedName(HxCCIdentifier::eActiveName);
-  if (!(before == name)) formed.changes.push_back("shortened");
+  const KyCXString& fitted = id.getCookedName(HxCCIdentifier::eActualName);
+  if (!(fitted == whole)) name.changes.push_back("shortened");
   if (HxCGlobal::getOptions()->getLimitVariableNameLength() &&
-      name.length() > HxCSymbol::sm_MaxNameLength)
-    remark(formed, kWarning,
+      fitted.length() > HxCSymbol::sm_MaxNameLength)
+    remark(name, kWarning,
            "The name is longer than " +
                std::to_string(HxCSymbol::sm_MaxNameLength) +
                " characters, and its template does not let it change ($R).");
 }
 
-void HX_NameRun::define(HxCCIdentifier& id, HX_FormedName& formed) {
-  KyCXString name = id.getCookedName(HxCCIdentifier::eActualName);
-  if (name.isEmpty())
-    return remark(formed, kError, "The name is empty: nothing is defined.");
+void HX_NameRun::define(HxCCIdentifier& id, HX_Name& name) {
+  const KyCXString wanted = id.getCookedName(HxCCIdentifier::eActualName);
+  if (wanted.isEmpty())
+    return remark(name, kError, "The name is empty: nothing is defined.");
 
-  const bool changeable =
-      id.getIdentifierChangeable(HxCCIdentifier::eActualName);
-  const HX_NameSpaces::Result result =
-      m_Spaces.define(*formed.item, name, changeable);
-  if (!result.isDefined) {
-    // The library's own check reports words; other names are ours to report.
-    if (m_Names.isStringValidCVariableName(name))
-      remark(formed, kError,
-             "The name '" + HX_ToUtf8(name) + "' is " + result.conflict +
-                 ", and its template does not let it change ($R).");
-    return;
-  }
-  if (!result.conflict.empty()) {
-    formed.changes.push_back(result.conflict);
-    const KyCXString wanted = id.getCookedName(HxCCIdentifier::eActualName);
+  KyCXString text = wanted;
+  const std::string conflict = m_Spaces.define(
+      name, text, id.getIdentifierChangeable(HxCCIdentifier::eActualName));
+  if (conflict.empty()) return;
+  if (name.isDefined) {
+    name.changes.push_back(conflict);
+    id.setCookedName(text, HxCCIdentifier::eActualName);
     HxCTransformationTracer::logTransformation(
-        (formed.item->id + ": " + wanted.cstring() + " -> " + name.cstring() +
-         " (" + result.conflict + ")")
+        (name.id + ": " + wanted.cstring() + " -> " + text.cstring() + " (" +
+         conflict + ")")
             .c_str());
-    id.setCookedName(name, HxCCIdentifier::eActualName);
+  } else if (HX_MessageHandler::instance().messages().empty()) {
+    // The library has reported a word; other names are ours to report.
+    remark(name, kError,
+           "The name '" + HX_ToUtf8(wanted) + "' is " + conflict +
+               ", and its template does not let it change ($R).");
   }
-  formed.isDefined = m_Names.isStringValidCVariableName(name);
 }

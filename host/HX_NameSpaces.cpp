@@ -1,90 +1,116 @@
 #include "host/HX_NameSpaces.h"
 
+#include "platform/messages/HX_MessageHandler.h"
+
 namespace {
 
-std::string takenBy(const std::string& id) { return "taken by '" + id + "'"; }
+// Messages 408 to 410 report a reserved word of one of these kinds.
+constexpr int kFirstMessage = 408;
+constexpr const char* kWordKinds[] = {"keyword", "base type name", "type name"};
 
 }  // namespace
 
-HX_NameSpaces::HX_NameSpaces(
-    const std::vector<std::unique_ptr<HX_ScopeItem>>& scopes,
-    const HX_Keywords& keywords)
-    : m_Keywords(keywords) {
+HX_NameSpaces::HX_NameSpaces(const HX_Model& model,
+                             const std::vector<const HX_TypeItem*>& types) {
   m_Ids.boot();
-  for (const auto& item : scopes) {  // parents first
-    auto space = std::make_unique<Space>(&m_Ids);
-    space->isFlat = item->kind == "flat";
-    const auto parent = m_Spaces.find(item->parent);
-    if (space->isFlat) {
-      for (const auto& [word, type] : keywords.words()) {
-        KyCXString text(word.c_str());
-        space->flat.add(text);
-      }
-    } else if (parent == m_Spaces.end() || parent->second->isFlat) {
-      m_Roots.push_back(space->scoped.newEnv());
-    } else {
-      space->scoped.newScope(parent->second->scoped.getScope());
-    }
-    m_Spaces.emplace(item.get(), std::move(space));
+  for (const HX_ScopeItem& item : model.scopes) {
+    Space& space = m_Spaces.try_emplace(&item, &m_Ids).first->second;
+    if (item.kind == "file") m_pFile = space.scoped.newEnv();
+    if (item.parent != nullptr)
+      space.scoped.newScope(m_Spaces.at(item.parent).scoped.getScope());
   }
+  HxCNames::boot();
+  for (const std::string& word : model.words)
+    m_Names.addToKeywordDict(word.c_str(), HxCNames::eDictCKeyword);
+  reserve(types);
 }
 
 HX_NameSpaces::~HX_NameSpaces() {
-  for (HxCNameSpace::Scope* root : m_Roots) delete root;
+  delete m_pFile;
+  HxCNames::shutdown();
   m_Ids.shutdown();
 }
 
-HX_NameSpaces::Result HX_NameSpaces::define(const HX_NameItem& item,
-                                            KyCXString& name, bool changeable) {
-  Space& space = *m_Spaces.at(item.scope);
-  Result result{true, conflictOf(space, name)};
-  if (!result.conflict.empty()) {
-    result.isDefined = changeable;
-    if (!changeable) return result;
-    deriveFreeName(space, name);
-  } else if (space.isFlat) {
-    space.flat.add(name);
+// The names of types are not formed but given; each is checked before it
+// becomes a reserved word itself.
+void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
+  HxCNameSpace file(&m_Ids);
+  file.setScope(m_pFile);
+  for (const HX_TypeItem* type : types) {
+    for (const auto& [field, fieldType] : type->fields)
+      m_Names.isStringValidCVariableName(field.c_str());
+    for (const auto& [constant, value] : type->values) {
+      m_Names.isStringValidCVariableName(constant.c_str());
+      file.defineString(constant.c_str());
+    }
+    if (!type->isNameless)
+      m_Names.isStringValidCVariableName(type->name.c_str());
   }
-
-  if (space.isFlat) {
-    space.owners.emplace(name.cstring(), item.id);
-    return result;
+  for (const HX_TypeItem* type : types) {
+    if (!type->isNameless)
+      m_Names.addToKeywordDict(type->name.c_str(),
+                               type->kind == "base"
+                                   ? HxCNames::eDictBaseTypeName
+                                   : HxCNames::eDictUserTypeName);
   }
-  m_Symbols.push_back(std::make_unique<HX_HostSymbol>(
-      name, HxCSymbol::eVariable,
-      item.type != nullptr ? &item.type->type : nullptr));
-  m_Symbols.back()->id = item.id;
-  space.scoped.defineString(name, m_Symbols.back().get());
-  return result;
 }
 
-// Empty for a free name.
-std::string HX_NameSpaces::conflictOf(Space& space,
-                                      const KyCXString& name) const {
-  if (const char* kind = m_Keywords.isReserved(name.cstring())) return kind;
-  if (space.isFlat) {
-    const auto found = space.owners.find(name.cstring());
-    return found == space.owners.end() ? std::string() : takenBy(found->second);
+std::string HX_NameSpaces::define(HX_Name& name, KyCXString& text,
+                                  bool changeable) {
+  Space& space = m_Spaces.at(name.scope);
+  const std::string conflict = conflictOf(space, text);
+  name.isDefined = conflict.empty() || changeable;
+  if (!name.isDefined) return conflict;
+
+  if (!conflict.empty()) deriveFreeName(space, text);
+  if (space.scoped.getScope() == nullptr) {
+    space.flat.add(text);
+    space.owners.emplace(text.cstring(), &name);
+    return conflict;
   }
-  if (!space.scoped.stringInEnv(name)) return {};
-  HxCSymbol* symbol = nullptr;
-  if (!space.scoped.stringInEnv(name, symbol)) return "taken by a constant";
-  return takenBy(static_cast<HX_HostSymbol*>(symbol)->id);
+  Symbol& symbol =
+      m_Symbols.emplace_back(text, HxCSymbol::eVariable,
+                             name.type != nullptr ? &name.type->type : nullptr);
+  symbol.owner = &name;
+  space.scoped.defineString(text, &symbol);
+  return conflict;
+}
+
+// Empty for a free name. The library reports reserved words and nothing else.
+std::string HX_NameSpaces::conflictOf(Space& space, const KyCXString& text) {
+  const auto& messages = HX_MessageHandler::instance().messages();
+  const std::size_t before = messages.size();
+  m_Names.isStringValidCVariableName(text);
+  if (messages.size() > before)
+    return kWordKinds[messages.back().row - kFirstMessage];
+
+  const HX_Name* owner = nullptr;
+  if (space.scoped.getScope() == nullptr) {
+    const auto found = space.owners.find(text.cstring());
+    if (found == space.owners.end()) return {};
+    owner = found->second;
+  } else {
+    if (!space.scoped.stringInEnv(text)) return {};
+    HxCSymbol* symbol = nullptr;
+    if (!space.scoped.stringInEnv(text, symbol)) return "taken by a constant";
+    owner = static_cast<Symbol*>(symbol)->owner;
+  }
+  return "taken by '" + owner->id + "'";
 }
 
 // A flat set derives variants by itself; scopes say only whether one is free.
-void HX_NameSpaces::deriveFreeName(Space& space, KyCXString& name) {
-  if (space.isFlat) return space.flat.addUnique(name);
-  const KyCXString base = name;
+// What was reported about reserved words has no object any more.
+void HX_NameSpaces::deriveFreeName(Space& space, KyCXString& text) {
+  KyCXString base = text;
   int& suffix = space.nextSuffix[base.cstring()];
   do {
-    name = base;
-    m_Names.appendSuffix(name, suffix++);
-  } while (!conflictOf(space, name).empty());
-}
-
-void HX_NameSpaces::takeInFiles(const std::string& name) {
-  for (const auto& [item, space] : m_Spaces) {
-    if (item->kind == "file") space->scoped.defineString(name.c_str());
-  }
+    text = base;
+    if (space.scoped.getScope() == nullptr) {
+      space.flat.add(base);  // a reserved word is not there yet
+      space.flat.addUnique(text);
+    } else {
+      m_Names.appendSuffix(text, suffix++);
+    }
+  } while (!conflictOf(space, text).empty());
+  HX_MessageHandler::instance().clear();
 }

@@ -1,65 +1,67 @@
-// The scopes that names are defined in, and free variants of taken names.
+// The scopes that names are defined in, reserved words, and free variants of
+// taken names.
 //
-//   HX_NameSpaces spaces(model.scopes(), keywords);
-//   auto result = spaces.define(item, name, true);
-//   // name == "speed_a", result.conflict == "taken by 'speed_in'"
+//   HX_NameSpaces spaces(model, types);
+//   KyCXString text("speed");
+//   spaces.define(name, text, true);   // "taken by 'speed_in'"
+//   // text == "speed_a"
 
 #ifndef HOST_HX_NAMESPACES_H
 #define HOST_HX_NAMESPACES_H
 
+#include <deque>
 #include <map>
-#include <memory>
 #include <string>
 #include <vector>
 
 #include "NameSpace/HX_LimitedNameSpace.h"
 #include "NameSpace/HxCNameSpace.h"
 #include "NameSpace/HxCXStringIdServer.h"
-#include "host/HX_Keywords.h"
 #include "host/HX_Model.h"
 
 /// In file, function and block scopes a name is taken if the scope, one around
 /// it or one inside it holds the name, so that no variable hides another; in a
-/// flat scope, if the scope holds it. Reserved words are taken everywhere.
+/// flat scope, if the scope holds it. Reserved words are taken everywhere: the
+/// keyword dictionary of the library lives as long as this object.
 class HX_NameSpaces {
  public:
-  HX_NameSpaces(const std::vector<std::unique_ptr<HX_ScopeItem>>& scopes,
-                const HX_Keywords& keywords);
+  /// Reserves the words of the model and the names of \p types, the constants
+  /// in the file scope only. A type, field or constant whose name is a reserved
+  /// word is reported to the message handler.
+  HX_NameSpaces(const HX_Model& model,
+                const std::vector<const HX_TypeItem*>& types);
   HX_NameSpaces(const HX_NameSpaces&) = delete;
   HX_NameSpaces& operator=(const HX_NameSpaces&) = delete;
   ~HX_NameSpaces();
 
-  struct Result {
-    bool isDefined;        ///< false: in conflict, and may not be changed
-    std::string conflict;  ///< "keyword", "taken by 'x'"; empty if it was free
-  };
-
-  /// Defines \p name for \p item in its scope; a taken name that may be changed
-  /// gets a suffix first.
-  Result define(const HX_NameItem& item, KyCXString& name, bool changeable);
-
-  /// Takes a name in every file scope: a type, an enumeration constant.
-  void takeInFiles(const std::string& name);
+  /// Defines \p text for \p name in its scope. One that is taken gets a suffix
+  /// first if it is changeable; otherwise it is not defined, and a reserved
+  /// word is reported to the message handler; nothing else stays there.
+  /// \return what it is or was: "keyword", "taken by 'x'"; empty if it was free
+  std::string define(HX_Name& name, KyCXString& text, bool changeable);
 
  private:
   struct Space {
     explicit Space(HxCXStringIdServer* ids) : scoped(ids) {}
-    bool isFlat = false;
-    HxCNameSpace scoped;
+    HxCNameSpace scoped;  // without a scope in a flat one
     HX_LimitedNameSpace flat;
-    std::map<std::string, std::string> owners;  // name -> id, if flat
-    std::map<std::string, int> nextSuffix;      // by base name
+    std::map<std::string, const HX_Name*> owners;  // by text, if flat
+    std::map<std::string, int> nextSuffix;         // by text without it
+  };
+  struct Symbol : HxCSymbol {
+    using HxCSymbol::HxCSymbol;
+    const HX_Name* owner = nullptr;
   };
 
-  std::string conflictOf(Space& space, const KyCXString& name) const;
-  void deriveFreeName(Space& space, KyCXString& name);
+  void reserve(const std::vector<const HX_TypeItem*>& types);
+  std::string conflictOf(Space& space, const KyCXString& text);
+  void deriveFreeName(Space& space, KyCXString& text);
 
-  const HX_Keywords& m_Keywords;
   HxCXStringIdServer m_Ids;
-  std::vector<HxCNameSpace::Scope*> m_Roots;  // owned
-  std::map<const HX_ScopeItem*, std::unique_ptr<Space>> m_Spaces;
-  std::vector<std::unique_ptr<HX_HostSymbol>> m_Symbols;
-  HxCNames m_Names;  // only for appendSuffix
+  HxCNameSpace::Scope* m_pFile = nullptr;  // with all scopes in it; owned
+  std::map<const HX_ScopeItem*, Space> m_Spaces;
+  std::deque<Symbol> m_Symbols;
+  HxCNames m_Names;
 };
 
 #endif  // HOST_HX_NAMESPACES_H

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 #include <deque>
-#include <map>
+#include <unordered_map>
 
 #include "DependencySorting/HxCDepSortComp.h"
 #include "DependencySorting/HxCDepSortNode.h"
@@ -11,18 +11,15 @@
 
 namespace {
 
-int widthOf(const HX_TypeItem& type) {
-  const HX_TypeItem* scalar = type.scalar();
-  return scalar != nullptr && scalar->numerical
-             ? scalar->numerical->getBitWidth()
-             : 0;
-}
-
-// What both kinds of nodes have.
+/// What both kinds of nodes have.
 class Node : public HxCDepSortNode {
  public:
-  Node(const std::string& name, const std::string& id, int width)
-      : m_Name(HX_FromUtf8(name)), m_Id(id), m_Width(width) {}
+  Node(const std::string& name, const std::string& id, const HX_TypeItem& type)
+      : m_Name(HX_FromUtf8(name)), m_Id(id) {
+    const HX_TypeItem* scalar = type.scalar();
+    if (scalar != nullptr && scalar->numerical)
+      m_Width = scalar->numerical->getBitWidth();
+  }
   const KyCXString& getName() override { return m_Name; }
   int width() const { return m_Width; }
   /// Names repeat in scopes beside each other, ids do not.
@@ -33,17 +30,17 @@ class Node : public HxCDepSortNode {
 
  private:
   KyCXString m_Name;
-  std::string m_Id;
-  int m_Width;  // bits
+  const std::string& m_Id;
+  int m_Width = 0;  // bits
 };
 
-class ByWidth : public HxCDepSortComp {
+struct ByWidth : HxCDepSortComp {
   int compare(HxCDepSortNode* a, HxCDepSortNode* b) override {
     return static_cast<Node*>(b)->width() - static_cast<Node*>(a)->width();
   }
 };
 
-class ByName : public HxCDepSortComp {
+struct ByName : HxCDepSortComp {
   int compare(HxCDepSortNode* a, HxCDepSortNode* b) override {
     return static_cast<Node*>(a)->compareNames(*static_cast<Node*>(b));
   }
@@ -51,34 +48,38 @@ class ByName : public HxCDepSortComp {
 
 }  // namespace
 
+// The library tells the two apart in what it reports.
 class HxCSdtNode : public Node {
  public:
   explicit HxCSdtNode(const HX_TypeItem& type)
-      : Node(type.name, type.id, widthOf(type)), item(&type) {}
+      : Node(type.name, type.id, type), item(type) {}
   HxCSdtNode* isSdtNode() override { return this; }
-  const HX_TypeItem* item;
+  const HX_TypeItem& item;
 };
 
 class HxCSsNode : public Node {
  public:
-  explicit HxCSsNode(const HX_FormedName& name)
-      : Node(name.actual, name.item->id, widthOf(*name.item->type)),
-        item(&name) {}
+  explicit HxCSsNode(const HX_Name& name)
+      : Node(name.actual, name.id, *name.type), item(name) {}
   HxCSsNode* isSsNode() override { return this; }
-  const HX_FormedName* item;
+  const HX_Name& item;
 };
 
 namespace {
 
-// The nodes are added by name, so that ties fall the same way whatever the
-// order of the document.
-template <class NodeType, class Item, class Before>
-bool order(std::deque<NodeType>& nodes, Before before,
-           std::vector<const Item*>& ordered) {
+template <class NodeType, class Item, class DependenciesOf>
+std::vector<const Item*> order(const std::vector<const Item*>& items,
+                               DependenciesOf dependenciesOf) {
+  std::deque<NodeType> nodes;
+  std::unordered_map<const Item*, NodeType*> nodeOf;  // looked up, never walked
   std::vector<NodeType*> byName;
-  for (NodeType& node : nodes) byName.push_back(&node);
+  byName.reserve(items.size());
+  for (const Item* item : items)
+    byName.push_back(nodeOf[item] = &nodes.emplace_back(*item));
+  // Ties fall the same way whatever the order of the document.
   std::sort(byName.begin(), byName.end(),
             [](NodeType* a, NodeType* b) { return a->compareNames(*b) < 0; });
+
   ByWidth byWidth;
   ByName byNames;
   leda::array<HxCDepSortComp*> criteria(2);
@@ -88,52 +89,39 @@ bool order(std::deque<NodeType>& nodes, Before before,
   sorting.setSortingCriteriaAndInit(criteria);
   for (NodeType* node : byName) sorting.add(node);
   for (NodeType* node : byName) {
-    before(*node->item,
-           [&](NodeType* first) { sorting.addDependency(first, node); });
+    for (const Item* first : dependenciesOf(node->item)) {
+      const auto found = nodeOf.find(first);
+      if (found != nodeOf.end()) sorting.addDependency(found->second, node);
+    }
   }
-  ordered.clear();
-  if (!sorting.sort()) return false;
-  const leda::array<HxCDepSortNode*> result = sorting.getNodes();
-  for (int i = result.low(); i <= result.high(); ++i)
-    ordered.push_back(static_cast<NodeType*>(result[i])->item);
-  return true;
+  std::vector<const Item*> ordered;
+  ordered.reserve(items.size());
+  if (!sorting.sort()) return ordered;
+  for (HxCDepSortNode* node : sorting.getNodes())
+    ordered.push_back(&static_cast<NodeType*>(node)->item);
+  return ordered;
 }
 
 }  // namespace
 
-bool HX_OrderTypes(const HX_Model& model,
-                   std::vector<const HX_TypeItem*>& ordered) {
-  std::deque<HxCSdtNode> nodes;
-  std::map<const HX_TypeItem*, HxCSdtNode*> nodeOf;
-  for (const auto& type : model.types()) {
-    nodes.emplace_back(*type);
-    nodeOf[type.get()] = &nodes.back();
-  }
-  return order(
-      nodes,
-      [&](const HX_TypeItem& type, auto add) {
-        if (type.of != nullptr) add(nodeOf.at(type.of));
-        for (const auto& [name, field] : type.fields) add(nodeOf.at(field));
-      },
-      ordered);
+std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model) {
+  std::vector<const HX_TypeItem*> types;
+  types.reserve(model.types.size());
+  for (const HX_TypeItem& type : model.types) types.push_back(&type);
+  return order<HxCSdtNode>(types, [](const HX_TypeItem& type) {
+    std::vector<const HX_TypeItem*> before{type.of};
+    for (const auto& [name, field] : type.fields) before.push_back(field);
+    return before;
+  });
 }
 
-bool HX_OrderVariables(const std::vector<HX_FormedName>& names,
-                       std::vector<const HX_FormedName*>& ordered) {
-  std::deque<HxCSsNode> nodes;
-  std::map<const HX_NameItem*, HxCSsNode*> nodeOf;
-  for (const HX_FormedName& name : names) {
-    if (name.item->kind != "variable" || !name.isDefined) continue;
-    nodes.emplace_back(name);
-    nodeOf[name.item] = &nodes.back();
+std::vector<const HX_Name*> HX_OrderVariables(const HX_Model& model) {
+  std::vector<const HX_Name*> variables;
+  for (const HX_Name& name : model.names) {
+    if (name.kind == "variable" && name.isDefined) variables.push_back(&name);
   }
-  return order(
-      nodes,
-      [&](const HX_FormedName& name, auto add) {
-        for (const HX_NameItem* other : name.item->dependsOn) {
-          const auto found = nodeOf.find(other);
-          if (found != nodeOf.end()) add(found->second);
-        }
-      },
-      ordered);
+  return order<HxCSsNode>(
+      variables, [](const HX_Name& name) -> const std::vector<const HX_Name*>& {
+        return name.dependsOn;
+      });
 }

@@ -1,6 +1,5 @@
 #include "host/HX_Profile.h"
 
-#include <algorithm>
 #include <fstream>
 #include <nlohmann/json.hpp>
 
@@ -16,8 +15,7 @@ constexpr char kTransformations[] = "HX_Transformations.txt";
 
 }  // namespace
 
-HX_Profile::HX_Profile(const std::string& folder)
-    : m_IsOn(!folder.empty()), m_Start(fs::current_path()) {
+HX_Profile::HX_Profile(const std::string& folder) : m_IsOn(!folder.empty()) {
   if (!m_IsOn) return;
   fs::create_directories(folder);
   fs::current_path(folder);
@@ -54,14 +52,11 @@ void HX_Profile::finish() {
   HX_StopWatch::endStopWatches();
   HxCTransformationTracer::shutdown();
 
-  std::int64_t origin = 0;
-  for (const Event& event : m_Events)
-    origin = origin == 0 ? event.start : std::min(origin, event.start);
   nlohmann::ordered_json events = nlohmann::ordered_json::array();
   for (const Event& event : m_Events)
     events.push_back({{"name", event.name},
                       {"ph", "X"},
-                      {"ts", event.start - origin},
+                      {"ts", event.begin - m_Events.front().begin},
                       {"dur", event.duration},
                       {"pid", 1},
                       {"tid", 1}});
@@ -69,11 +64,11 @@ void HX_Profile::finish() {
       << nlohmann::ordered_json{{"traceEvents", events}}.dump(1) << '\n';
 }
 
-void HX_Profile::runEnded(const char* name, std::int64_t start,
+void HX_Profile::runEnded(const char* name, std::int64_t begin,
                           std::int64_t duration) {
   // A phase is both a run time and, around it, a stop watch: shown once.
   if (!m_Events.empty() && m_Events.back().name == name) m_Events.pop_back();
-  m_Events.push_back({name, start, duration});
+  m_Events.push_back({name, begin, duration});
 }
 
 HX_Profile::Phase::Phase(HX_Profile& profile, const char* name)

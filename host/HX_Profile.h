@@ -35,7 +35,7 @@ class HX_Profile : private HX_TimingListener {
   ~HX_Profile() override;
 
   /// The working directory at the start, where the user's paths count from.
-  const std::filesystem::path& start() const { return m_Start; }
+  const std::filesystem::path start = std::filesystem::current_path();
 
   void setModel(const std::string& name);
   /// A line of the protocol.
@@ -59,15 +59,14 @@ class HX_Profile : private HX_TimingListener {
  private:
   struct Event {
     std::string name;
-    std::int64_t start;     // microseconds
+    std::int64_t begin;     // microseconds
     std::int64_t duration;  // microseconds
   };
 
-  void runEnded(const char* name, std::int64_t start,
+  void runEnded(const char* name, std::int64_t begin,
                 std::int64_t duration) override;
 
   bool m_IsOn;
-  std::filesystem::path m_Start;
   HxCDebugServer m_Server;
   std::list<HX_StopWatch> m_Watches;  // stay registered until the report
   std::vector<Event> m_Events;

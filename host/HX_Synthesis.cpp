@@ -37,22 +37,17 @@ std::string blockName(Random& random) {
   return name;
 }
 
-ordered_json types() {
-  return ordered_json::array({{{"id", "i16"},
-                               {"name", "Int16"},
-                               {"kind", "base"},
-                               {"c", "short"},
-                               {"cut", "i16"}},
-                              {{"id", "f32"},
-                               {"name", "Float32"},
-                               {"kind", "base"},
-                               {"c", "float"},
-                               {"cut", "f32"}},
-                              {{"id", "speed"},
-                               {"name", "speed_t"},
-                               {"kind", "derived"},
-                               {"of", "i16"}}});
-}
+constexpr char kFrame[] = R"({
+  "model": {"name": "synthetic", "systemId": "a"},
+  "options": {"limitNames": true},
+  "blocks": [],
+  "types": [
+    {"id": "i16", "name": "Int16", "kind": "base", "c": "short", "cut": "i16"},
+    {"id": "f32", "name": "Float32", "kind": "base", "c": "float",
+     "cut": "f32"},
+    {"id": "speed", "name": "speed_t", "kind": "derived", "of": "i16"}],
+  "names": []
+})";
 
 ordered_json variable(int index, Random& random) {
   static constexpr const char* kTypes[] = {"i16", "f32", "speed"};
@@ -76,21 +71,15 @@ ordered_json variable(int index, Random& random) {
 
 std::string HX_Synthesize(int blocks, std::uint64_t seed) {
   Random random(seed);
-  ordered_json document;
-  document["model"] = {{"name", "synthetic"}, {"systemId", "a"}};
-  document["options"] = {{"limitNames", true}};
-  document["blocks"] = ordered_json::array();
-  document["types"] = types();
-  document["names"] = ordered_json::array();
+  ordered_json document = ordered_json::parse(kFrame);
+  ordered_json& subsystems = document["blocks"];
   for (int i = 0; i < blocks; ++i) {
-    ordered_json& subsystems = document["blocks"];
     if (i % kBlocksPerSubsystem == 0) {
-      const std::string number = std::to_string(subsystems.size() + 1);
-      subsystems.push_back(
-          {{"id", "s" + number},
-           {"name", "Subsystem " + number},
-           {"subsystem", {{"id", "a"}, {"number", subsystems.size() + 1}}},
-           {"blocks", ordered_json::array()}});
+      const int number = 1 + i / kBlocksPerSubsystem;
+      subsystems.push_back({{"id", "s" + std::to_string(number)},
+                            {"name", "Subsystem " + std::to_string(number)},
+                            {"subsystem", {{"id", "a"}, {"number", number}}},
+                            {"blocks", ordered_json::array()}});
     }
     subsystems.back()["blocks"].push_back(
         {{"id", "b" + std::to_string(i)}, {"name", blockName(random)}});

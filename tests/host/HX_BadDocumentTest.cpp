@@ -55,7 +55,7 @@ const BadDocumentCase kBadDocuments[] = {
      R"([{"op":"replace","path":"/dataDictionary/objects/0/path","value":"x"}])",
      "/dataDictionary/objects/0/path", "a text of the form //DD0/.+"},
     {"empty id", R"([{"op":"replace","path":"/blocks/0/id","value":""}])",
-     "/blocks/0/id", "a text that is not empty"},
+     "/blocks/0/id", "a text with a length from 1"},
     {"block ids repeat",
      R"([{"op":"replace","path":"/blocks/0/blocks/1/id","value":"plant"}])",
      "/blocks/0/blocks/1/id", R"(an id that is not taken yet, found "plant")"},
