@@ -83,27 +83,38 @@ ordered_json asJson(const std::vector<HX_Finding>& findings) {
   return messages;
 }
 
-ordered_json asJson(const HX_Name& name) {
+// Line feeds inside a text are escaped: each one here ends a line.
+std::string indented(const std::string& json, const std::string& indent) {
+  std::string text;
+  for (const char c : json) {
+    text += c;
+    if (c == '\n') text += indent;
+  }
+  return text;
+}
+
+// An object field by field: as a whole it takes four times as long.
+void writeJson(std::ostream& out, const HX_Name& name) {
   ordered_json sources = ordered_json::array();
   name.sources.forEach(
       [&](const HxCSrcRef* srcRef) { sources.push_back(HX_PathOf(srcRef)); });
-  return {{"id", name.id},
-          {"source", name.sourcePath},
-          {"sources", sources},
-          {"template", name.nameTemplate},
-          {"formal", name.formal},
-          {"actual", name.actual},
-          {"complete", name.isComplete},
-          {"defined", name.isDefined},
-          {"changes", name.changes},
-          {"messages", asJson(name.findings)}};
-}
-
-// Line feeds inside a text are escaped: each one here ends a line.
-std::string indented(const std::string& json) {
-  std::string text = "    ";
-  for (const char c : json) text += c == '\n' ? "\n    " : std::string(1, c);
-  return text;
+  const std::pair<const char*, ordered_json> fields[] = {
+      {"id", name.id},
+      {"source", name.sourcePath},
+      {"sources", sources},
+      {"template", name.nameTemplate},
+      {"formal", name.formal},
+      {"actual", name.actual},
+      {"complete", name.isComplete},
+      {"defined", name.isDefined},
+      {"changes", name.changes},
+      {"messages", asJson(name.findings)}};
+  const char* separator = "    {\n      \"";
+  for (const auto& [key, value] : fields) {
+    out << separator << key << "\": " << indented(value.dump(2), "      ");
+    separator = ",\n      \"";
+  }
+  out << "\n    }";
 }
 
 // Doubled quotes inside quotes, where the text needs them.
@@ -173,7 +184,8 @@ void HX_WriteJson(std::ostream& out, const HX_RunResult& result) {
   out << "{\n  \"names\": [";
   const char* separator = "\n";
   for (const HX_Name* name : result.names) {
-    out << separator << indented(asJson(*name).dump(2));
+    out << separator;
+    writeJson(out, *name);
     separator = ",\n";
   }
   const ordered_json rest{{"types", typeNames(result)},

@@ -16,6 +16,11 @@ HX_DdTree& HX_DdTree::instance() {
   return s_tree;
 }
 
+void HX_DdTree::clear() {
+  m_Objects.clear();
+  m_Handles.clear();
+}
+
 unsigned long HX_DdTree::add(const std::string& path, unsigned short kind) {
   const std::string full = absolute(path);
   const unsigned long known = find(full);
@@ -27,6 +32,7 @@ unsigned long HX_DdTree::add(const std::string& path, unsigned short kind) {
   const bool hasParent = slash != std::string::npos && slash > 1;
   const unsigned long parent = hasParent ? add(full.substr(0, slash)) : 0;
   m_Objects.push_back({full, parent, kind, {}});
+  m_Handles.emplace(full, m_Objects.size());
   return m_Objects.size();
 }
 
@@ -36,10 +42,8 @@ void HX_DdTree::addReference(unsigned long handle, const std::string& property,
 }
 
 unsigned long HX_DdTree::find(const std::string& path) const {
-  const std::string full = absolute(path);
-  for (unsigned long handle = 1; handle <= m_Objects.size(); ++handle)
-    if (object(handle).path == full) return handle;
-  return kInvalidHandle;
+  const auto found = m_Handles.find(absolute(path));
+  return found == m_Handles.end() ? kInvalidHandle : found->second;
 }
 
 bool HX_DdTree::isValid(unsigned long handle) const {

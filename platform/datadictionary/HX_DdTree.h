@@ -11,6 +11,7 @@
 #define PLATFORM_DATADICTIONARY_HX_DDTREE_H
 
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include "platform/HX_PlatformExport.h"
@@ -29,7 +30,7 @@ class HX_PLATFORM_API HX_DdTree {
   };
 
   static HX_DdTree& instance();
-  void clear() { m_Objects.clear(); }
+  void clear();
 
   /// The handle of the object at \p path, which is made if it is new, like
   /// every missing object above it (with kind 0).
@@ -62,6 +63,7 @@ class HX_PLATFORM_API HX_DdTree {
   }
 
   std::vector<Object> m_Objects;
+  std::unordered_map<std::string, unsigned long> m_Handles;  // by path
 };
 
 #endif  // PLATFORM_DATADICTIONARY_HX_DDTREE_H
