@@ -129,11 +129,6 @@ HX_CWriter::HX_CWriter(const HX_Model& model, HX_RunResult& result)
       [](const HX_Name* a, const HX_Name* b) { return a->actual < b->actual; });
   for (const HX_Name* name : result.variables)
     m_VariablesIn[name->scope].push_back(name);
-  for (const HX_ScopeItem& scope : model.scopes) {
-    if (scope.kind == "function") m_BodyOf[scope.function] = &scope;
-    if (scope.kind == "block") m_BlocksIn[scope.parent][scope.id] = &scope;
-    if (scope.kind == "file") m_pFile = &scope;
-  }
 }
 
 void HX_CWriter::write(HX_Output& output) {
@@ -157,7 +152,7 @@ void HX_CWriter::writeDeclarations(std::ostream& out) {
   const std::string guard = guardOf(m_CodeFile);
   out << fileHead("Declarations", m_Model.name) << "#ifndef " << guard
       << "\n#define " << guard << "\n\n#include \"" << m_TypesFile << ".h\"\n";
-  for (const HX_Name* name : m_VariablesIn[m_pFile])
+  for (const HX_Name* name : m_VariablesIn[m_Model.fileScope])
     out << '\n'
         << comment(*name) << "extern " << name->type->name << ' '
         << name->actual << ";\n";
@@ -169,26 +164,25 @@ void HX_CWriter::writeDeclarations(std::ostream& out) {
 void HX_CWriter::writeDefinitions(std::ostream& out) {
   out << fileHead("Definitions", m_Model.name) << "#include \"" << m_CodeFile
       << ".h\"\n";
-  for (const HX_Name* name : m_VariablesIn[m_pFile])
+  for (const HX_Name* name : m_VariablesIn[m_Model.fileScope])
     out << '\n' << comment(*name) << definition(*name);
   for (const HX_Name* name : m_Functions) {
     out << '\n' << comment(*name) << "void " << name->actual << "(void) {\n";
-    const auto body = m_BodyOf.find(name);
-    if (body != m_BodyOf.end()) writeLocals(out, body->second, "  ");
+    if (name->body != nullptr) writeLocals(out, *name->body, "  ");
     out << "}\n";
   }
 }
 
 // The variables of a scope, then the blocks in it by id.
-void HX_CWriter::writeLocals(std::ostream& out, const HX_ScopeItem* scope,
+void HX_CWriter::writeLocals(std::ostream& out, const HX_ScopeItem& scope,
                              const std::string& indent) {
-  for (const HX_Name* name : m_VariablesIn[scope])
+  for (const HX_Name* name : m_VariablesIn[&scope])
     out << indent << comment(*name) << indent << definition(*name);
-  for (const HX_Name* name : m_VariablesIn[scope])
+  for (const HX_Name* name : m_VariablesIn[&scope])
     out << indent << "(void)" << name->actual << ";\n";
-  for (const auto& [id, block] : m_BlocksIn[scope]) {
+  for (const auto& [id, block] : scope.blocks) {
     out << indent << "{\n";
-    writeLocals(out, block, indent + "  ");
+    writeLocals(out, *block, indent + "  ");
     out << indent << "}\n";
   }
 }

@@ -31,7 +31,7 @@ class HX_CWriter {
   void writeTypes(std::ostream& out) const;
   void writeDeclarations(std::ostream& out);
   void writeDefinitions(std::ostream& out);
-  void writeLocals(std::ostream& out, const HX_ScopeItem* scope,
+  void writeLocals(std::ostream& out, const HX_ScopeItem& scope,
                    const std::string& indent);
   std::string definition(const HX_Name& name);
   std::string initializer(const HX_Name& name, const HX_TypeItem& type,
@@ -44,12 +44,8 @@ class HX_CWriter {
   std::string m_TypesFile;                  // without extension, as below
   std::string m_CodeFile;                   // header and source
   std::vector<const HX_Name*> m_Functions;  // by C name
-  const HX_ScopeItem* m_pFile = nullptr;
-  // What stands where; looked up, never walked.
+  // Looked up, never walked.
   std::map<const HX_ScopeItem*, std::vector<const HX_Name*>> m_VariablesIn;
-  std::map<const HX_ScopeItem*, std::map<std::string, const HX_ScopeItem*>>
-      m_BlocksIn;  // by id
-  std::map<const HX_Name*, const HX_ScopeItem*> m_BodyOf;
 };
 
 #endif  // HOST_HX_CWRITER_H

@@ -57,13 +57,11 @@ struct HX_TypeItem {
   bool isFloating() const { return cType == "float" || cType == "double"; }
 };
 
-struct HX_Name;
-
 struct HX_ScopeItem {
   std::string id;
   std::string kind;
-  const HX_ScopeItem* parent = nullptr;
-  const HX_Name* function = nullptr;  // whose body a function scope is
+  HX_ScopeItem* parent = nullptr;
+  std::map<std::string, const HX_ScopeItem*> blocks = {};  // in it, by id
 };
 
 /// A message of the library, or a remark of the host itself.
@@ -109,6 +107,8 @@ struct HX_Name {
   double zero = 0;
   std::vector<const HX_Name*> dependsOn;
 
+  const HX_ScopeItem* body = nullptr;  // of a function that has one
+
   std::string sourcePath;  // of the best of the sources
   std::string formal;
   std::string actual;
@@ -140,6 +140,7 @@ struct HX_Model {
   std::set<std::string> words;  // of the word lists
   std::deque<HX_TypeItem> types;
   std::deque<HX_ScopeItem> scopes;  // parents first
+  HX_ScopeItem* fileScope = nullptr;
   std::deque<HX_Name> names;
 
   // Seen through the library.

@@ -1,7 +1,9 @@
 // The data types of a model.
 #include <cfloat>
+#include <cmath>
+#include <set>
 
-#include "host/HX_ModelReader.h"
+#include "host/HX_ModelParts.h"
 #include "host/HX_Text.h"
 
 namespace {
@@ -18,49 +20,83 @@ const std::map<std::string, HX_NumericalType> kCTypes = {
     {"double", {-DBL_MAX, DBL_MAX, 64, true}},
 };
 
-void completeInteger64(const HX_Json& node, HX_TypeItem& item) {
-  const double size = 18446744073709551616.0;  // 2^64
-  if (node.value("signed", true))
-    item.numerical.emplace(-size / 2, size / 2, 64, true);
-  else
-    item.numerical.emplace(0, size, 64, false);
-  item.type.set64BitInteger();
+// What the library is told of a type depends on its kind.
+void completeKind(const HX_Json& node, HX_TypeItem& item) {
+  HX_DataType& type = item.type;
+  HX_DataType* of = item.of != nullptr ? &item.of->type : nullptr;
+  if (item.kind == "base") {
+    type.setBase();
+    item.numerical = kCTypes.at(item.cType);
+  } else if (item.kind == "derived") {
+    type.setDerivedFrom(of);
+  } else if (item.kind == "numerical") {
+    type.setOrigin(of).setUnderlyingType(of);
+  } else if (item.kind == "array") {
+    type.setElement(of);
+  } else if (item.kind == "struct") {
+    type.setUnnamed(HX_DataType::eUnnamedStruct, !item.isNameless);
+  } else if (item.kind == "enum") {
+    type.setUnnamed(HX_DataType::eUnnamedEnum, !item.isNameless);
+  } else if (item.kind == "bitField") {
+    type.setBitfield();
+    item.numerical.emplace(0, std::ldexp(1, item.bits) - 1, item.bits, false);
+  } else if (node.value("signed", true)) {
+    type.set64BitInteger();
+    item.numerical.emplace(-0x1p63, 0x1p63, 64, true);
+  } else {
+    type.set64BitInteger();
+    item.numerical.emplace(0, 0x1p64, 64, false);
+  }
 }
 
-void completeBitField(const HX_Json&, HX_TypeItem& item) {
-  const auto largest = static_cast<double>((1LL << item.bits) - 1);
-  item.numerical.emplace(0, largest, item.bits, false);
-  item.type.setBitfield();
-}
+class TypeReader {
+ public:
+  TypeReader(HX_Model& model, HX_TypeIds& ids) : m_Model(model), m_Ids(ids) {}
 
-using Complete = void (*)(const HX_Json& node, HX_TypeItem& item);
+  void begin(const HX_Json& node) {
+    HX_TypeItem& item = m_Model.types.emplace_back(HX_FromUtf8(node["name"]));
+    item.id = node["id"];
+    item.name = node["name"];
+    item.kind = node["kind"];
+    item.cType = node.value("c", "");
+    item.bits = node.value("bits", 0);
+    item.length = node.value("length", 0);
+    item.isNameless = node.value("nameless", false);
+    if (node.contains("cut")) item.type.setCut(HX_FromUtf8(node["cut"]));
+    m_Ids.enter(node, &item);
+    if (!item.isNameless) takeCodeName(node["name"]);
+  }
 
-const std::map<std::string, Complete> kKinds = {
-    {"base",
-     [](const HX_Json&, HX_TypeItem& item) {
-       item.numerical = kCTypes.at(item.cType);
-       item.type.setBase();
-     }},
-    {"derived",
-     [](const HX_Json&, HX_TypeItem& item) {
-       item.type.setDerivedFrom(&item.of->type);
-     }},
-    {"numerical",
-     [](const HX_Json&, HX_TypeItem& item) {
-       item.type.setOrigin(&item.of->type).setUnderlyingType(&item.of->type);
-     }},
-    {"integer64", completeInteger64},
-    {"array", [](const HX_Json&,
-                 HX_TypeItem& item) { item.type.setElement(&item.of->type); }},
-    {"bitField", completeBitField},
-    {"struct",
-     [](const HX_Json&, HX_TypeItem& item) {
-       item.type.setUnnamed(HX_DataType::eUnnamedStruct, !item.isNameless);
-     }},
-    {"enum",
-     [](const HX_Json&, HX_TypeItem& item) {
-       item.type.setUnnamed(HX_DataType::eUnnamedEnum, !item.isNameless);
-     }},
+  // A type may stand on a later one.
+  void complete(const HX_Json& node, HX_TypeItem& item) {
+    if (node.contains("of")) item.of = HX_FindNamedType(m_Ids, node["of"]);
+    if (item.kind == "derived" &&
+        item.of->type.getBaseTypeProperties() == nullptr)
+      m_Ids.document.fail(node["of"], "the id of a type with a cut");
+    completeKind(node, item);
+    for (const HX_Json& field : HX_FieldOf(node, "fields")) {
+      HX_TypeItem* type = m_Ids.find(field["type"]);
+      if (type->kind != "bitField")
+        type = HX_FindNamedType(m_Ids, field["type"]);
+      item.fields.emplace_back(field["name"], type);
+    }
+    for (const HX_Json& value : HX_FieldOf(node, "values")) {
+      takeCodeName(value["name"]);
+      item.values.emplace_back(value["name"], value["value"].get<int>());
+    }
+  }
+
+ private:
+  // Types and enumeration constants share the names of the file.
+  void takeCodeName(const HX_Json& name) {
+    if (!m_CodeNames.insert(name).second)
+      m_Ids.document.fail(name,
+                          "a name that is not taken yet, found " + name.dump());
+  }
+
+  HX_Model& m_Model;
+  HX_TypeIds& m_Ids;
+  std::set<std::string> m_CodeNames;
 };
 
 }  // namespace
@@ -76,26 +112,21 @@ const HX_TypeItem* HX_TypeItem::scalar() const {
   return item;
 }
 
-void HX_ModelReader::readTypes(Json types) {
-  for (Json node : types) {
-    HX_TypeItem& item = m_Model.types.emplace_back(HX_FromUtf8(node["name"]));
-    item.id = node["id"];
-    item.name = node["name"];
-    item.kind = node["kind"];
-    item.cType = node.value("c", "");
-    item.bits = node.value("bits", 0);
-    item.length = node.value("length", 0);
-    item.isNameless = node.value("nameless", false);
-    if (node.contains("cut")) item.type.setCut(HX_FromUtf8(node["cut"]));
-    m_Types.enter(node, &item);
-    if (!item.isNameless) takeCodeName(node["name"]);
-  }
-  // A later type may stand on an earlier one and the other way round.
+HX_TypeItem* HX_FindNamedType(const HX_TypeIds& ids, const HX_Json& id) {
+  HX_TypeItem* type = ids.find(id);
+  if (type->isNameless || type->kind == "bitField")
+    ids.document.fail(id, "the id of a type with a name, no bit field");
+  return type;
+}
+
+void HX_ReadTypes(const HX_Json& types, HX_Model& model, HX_TypeIds& ids) {
+  TypeReader reader(model, ids);
+  for (const HX_Json& node : types) reader.begin(node);
   std::size_t index = 0;
-  for (Json node : types) completeType(node, m_Model.types[index++]);
+  for (const HX_Json& node : types) reader.complete(node, model.types[index++]);
 
   HX_TypeItem* bitFieldBase = nullptr;  // that with the least id
-  for (HX_TypeItem& item : m_Model.types) {
+  for (HX_TypeItem& item : model.types) {
     const bool isBase = item.cType == "unsigned int";
     if (isBase && (bitFieldBase == nullptr || item.id < bitFieldBase->id))
       bitFieldBase = &item;
@@ -105,37 +136,5 @@ void HX_ModelReader::readTypes(Json types) {
     item.type.setNumerical(const_cast<HX_NumericalType*>(&*scalar->numerical));
   }
   if (bitFieldBase != nullptr)
-    m_Model.typeServer.getBaseServer()->setBitfieldBaseType(
-        &bitFieldBase->type);
-}
-
-void HX_ModelReader::completeType(Json node, HX_TypeItem& item) {
-  if (node.contains("of")) item.of = findNamedType(node["of"]);
-  if (item.kind == "derived" &&
-      item.of->type.getBaseTypeProperties() == nullptr)
-    m_Document.fail(node["of"], "the id of a type with a cut");
-  kKinds.at(item.kind)(node, item);
-  for (Json field : HX_FieldOf(node, "fields")) {
-    HX_TypeItem* type = m_Types.find(field["type"]);
-    if (type->kind != "bitField") type = findNamedType(field["type"]);
-    item.fields.emplace_back(field["name"], type);
-  }
-  for (Json value : HX_FieldOf(node, "values")) {
-    takeCodeName(value["name"]);
-    item.values.emplace_back(value["name"], value["value"].get<int>());
-  }
-}
-
-// A type that the code can declare something with.
-HX_TypeItem* HX_ModelReader::findNamedType(Json id) const {
-  HX_TypeItem* type = m_Types.find(id);
-  if (type->isNameless || type->kind == "bitField")
-    m_Document.fail(id, "the id of a type with a name, no bit field");
-  return type;
-}
-
-// Types and enumeration constants share the names of the file.
-void HX_ModelReader::takeCodeName(Json name) {
-  if (!m_CodeNames.insert(name).second)
-    m_Document.fail(name, "a name that is not taken yet, found " + name.dump());
+    model.typeServer.getBaseServer()->setBitfieldBaseType(&bitFieldBase->type);
 }

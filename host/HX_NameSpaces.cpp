@@ -15,7 +15,7 @@ HX_NameSpaces::HX_NameSpaces(const HX_Model& model,
   m_Ids.boot();
   for (const HX_ScopeItem& item : model.scopes) {
     Space& space = m_Spaces.try_emplace(&item, &m_Ids).first->second;
-    if (item.kind == "file") m_pFile = space.scoped.newEnv();
+    if (item.kind == "file") space.scoped.setScope(m_File.newEnv());
     if (item.parent != nullptr)
       space.scoped.newScope(m_Spaces.at(item.parent).scoped.getScope());
   }
@@ -26,7 +26,7 @@ HX_NameSpaces::HX_NameSpaces(const HX_Model& model,
 }
 
 HX_NameSpaces::~HX_NameSpaces() {
-  delete m_pFile;
+  delete m_File.getScope();
   HxCNames::shutdown();
   m_Ids.shutdown();
 }
@@ -34,14 +34,12 @@ HX_NameSpaces::~HX_NameSpaces() {
 // The names of types are not formed but given; each is checked before it
 // becomes a reserved word itself.
 void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
-  HxCNameSpace file(&m_Ids);
-  file.setScope(m_pFile);
   for (const HX_TypeItem* type : types) {
     for (const auto& [field, fieldType] : type->fields)
       m_Names.isStringValidCVariableName(field.c_str());
     for (const auto& [constant, value] : type->values) {
       m_Names.isStringValidCVariableName(constant.c_str());
-      file.defineString(constant.c_str());
+      m_File.defineString(constant.c_str());
     }
     if (!type->isNameless)
       m_Names.isStringValidCVariableName(type->name.c_str());

@@ -58,7 +58,7 @@ class HX_NameSpaces {
   void deriveFreeName(Space& space, KyCXString& text);
 
   HxCXStringIdServer m_Ids;
-  HxCNameSpace::Scope* m_pFile = nullptr;  // with all scopes in it; owned
+  HxCNameSpace m_File{&m_Ids};  // its scope, with all in it, is owned
   std::map<const HX_ScopeItem*, Space> m_Spaces;
   std::deque<Symbol> m_Symbols;
   HxCNames m_Names;
