@@ -35,8 +35,18 @@ HX_ProgramResult HX_RunCodegen(const std::string& arguments) {
   return HX_RunCommand(HX_CODEGEN_COMMAND " " + arguments);
 }
 
+std::string HX_WriteModel(const nlohmann::json& model) {
+  const fs::path path = HX_ScratchFolder() / "model.json";
+  HX_WriteText(path, model.dump());
+  return path.string();
+}
+
 nlohmann::json HX_DemoModel() {
   return nlohmann::json::parse(HX_ReadText(HX_DEMO_MODEL));
+}
+
+nlohmann::json HX_CaseTable(const std::string& file) {
+  return nlohmann::json::parse(HX_ReadText(fs::path(HX_TEST_FOLDER) / file));
 }
 
 nlohmann::json HX_SmallModel() {

@@ -13,15 +13,9 @@ using testing::IsEmpty;
 
 namespace {
 
-fs::path writeModel(const json& model) {
-  const fs::path path = HX_ScratchFolder() / "model.json";
-  HX_WriteText(path, model.dump());
-  return path;
-}
-
 json namesOf(const json& model, int code) {
   const HX_ProgramResult result =
-      HX_RunCodegen("names --json " + writeModel(model).string());
+      HX_RunCodegen("names --json " + HX_WriteModel(model));
   EXPECT_EQ(code, result.code) << result.err;
   return json::parse(result.out);
 }
@@ -100,76 +94,9 @@ TEST(NamesTest, TableShowsNamesWithChangesAndMessages) {
                                "ignored.\n"));
 }
 
-struct ConflictCase {
-  const char* why;
-  const char* names;
-  const char* actual;  // of the last name
-  const char* changes;
-  const char* message;  // the only one of the last name, or null
-};
-
 // The scopes are "file" with the bodies "f" and "g", "f" with the block "b",
-// and the flat "os".
-const ConflictCase kConflicts[] = {
-    {"scopes beside each other do not see each other",
-     R"([{"id":"1","template":"i","scope":"f"},
-         {"id":"2","template":"i","scope":"g"}])",
-     "i", "[]", nullptr},
-    {"around", R"([{"id":"1","template":"i"},
-                   {"id":"2","template":"i","scope":"b"}])",
-     "i_a", R"(["taken by '1'"])", nullptr},
-    {"inside", R"([{"id":"1","template":"i","scope":"b"},
-                   {"id":"2","template":"i"}])",
-     "i_a", R"(["taken by '1'"])", nullptr},
-    {"flat", R"([{"id":"1","template":"i","scope":"os"},
-                 {"id":"2","template":"i","scope":"os"}])",
-     "i_a", R"(["taken by '1'"])", nullptr},
-    {"flat and scoped", R"([{"id":"1","template":"i","scope":"os"},
-                            {"id":"2","template":"i"}])",
-     "i", "[]", nullptr},
-    {"taken and fixed", R"([{"id":"1","template":"i"},
-                            {"id":"2","template":"i:i"}])",
-     "i", "[]",
-     "error 0 The name 'i' is taken by '1', and its template does "
-     "not let it change ($R)."},
-    {"fixed in the flat", R"([{"id":"1","template":"i","scope":"os"},
-                             {"id":"2","template":"i:i","scope":"os"}])",
-     "i", "[]",
-     "error 0 The name 'i' is taken by '1', and its template does "
-     "not let it change ($R)."},
-    {"fixed keyword", R"([{"id":"1","template":"int:int"}])", "int", "[]",
-     "error 17056 C keyword int used as identifier."},
-    {"fixed base type", R"([{"id":"1","template":"Int8:Int8"}])", "Int8", "[]",
-     "error 17057 Base type name Int8 used as identifier."},
-    {"keyword", R"([{"id":"1","template":"int"}])", "int_a", R"(["keyword"])",
-     nullptr},
-    {"keyword in the flat", R"([{"id":"1","template":"int","scope":"os"}])",
-     "int_a", R"(["keyword"])", nullptr},
-    {"keyword of a later standard", R"([{"id":"1","template":"nullptr"}])",
-     "nullptr_a", R"(["keyword"])", nullptr},
-    {"library macro", R"([{"id":"1","template":"EOF:EOF$R"}])", "EOF_a",
-     R"(["keyword"])", nullptr},
-    {"case counts", R"([{"id":"1","template":"Int"}])", "Int", "[]", nullptr},
-    {"base type name", R"([{"id":"1","template":"Int8"}])", "Int8_a",
-     R"(["base type name"])", nullptr},
-    {"type name", R"([{"id":"1","template":"state_t"}])", "state_t_a",
-     R"(["type name"])", nullptr},
-    {"constant", R"([{"id":"1","template":"ON"}])", "ON_a",
-     R"(["taken by a constant"])", nullptr},
-    {"empty", R"([{"id":"1","template":"$L"}])", "", "[]",
-     "error 0 The name is empty: nothing is defined."},
-    {"three parts", R"([{"id":"1","template":"a:b$R:c"}])", "b", "[]",
-     "warning 0 The name template has more than two parts; the first two "
-     "count."},
-    {"long and fixed",
-     R"([{"id":"1","template":"a:a2345678901234567890123456789012"}])",
-     "a2345678901234567890123456789012", "[]",
-     "warning 0 The name is longer than 31 characters, and its template does "
-     "not let it change ($R)."},
-    {"long", R"([{"id":"1","template":"a2345678901234567890123456789012"}])",
-     "a23456789012345__90123456789012", R"(["shortened"])", nullptr},
-};
-
+// and the flat "os". What is expected is expected of the last name; the message
+// is its only one.
 TEST(NamesTest, ConflictsAreResolvedOrReported) {
   json model = HX_SmallModel();
   model["options"] = {{"limitNames", true},
@@ -184,27 +111,23 @@ TEST(NamesTest, ConflictsAreResolvedOrReported) {
              "scopes":[{"id":"b","kind":"block"}]},
             {"id":"g","kind":"function","function":"G"}]},
           {"id":"os","kind":"flat"}])");
-  for (const ConflictCase& row : kConflicts) {
-    SCOPED_TRACE(row.why);
-    model["names"] = json::parse(
-        R"([{"id":"F","template":"F","kind":"function"},
-            {"id":"G","template":"G","kind":"function"}])");
-    for (const json& name : json::parse(row.names))
-      model["names"].push_back(name);
-    const bool isError =
-        row.message != nullptr && std::string(row.message).rfind("error") == 0;
-    const json name = namesOf(model, isError ? 1 : 0)["names"].back();
-    EXPECT_EQ(row.actual, name["actual"]);
-    EXPECT_EQ(json::parse(row.changes), name["changes"]);
-    std::vector<std::string> messages;
-    for (const json& message : name["messages"])
-      messages.push_back(message["severity"].get<std::string>() + " " +
-                         message["id"].dump() + " " +
-                         message["text"].get<std::string>());
-    if (row.message == nullptr)
-      EXPECT_THAT(messages, IsEmpty());
-    else
-      EXPECT_THAT(messages, ElementsAre(row.message));
+  for (const json& row : HX_CaseTable("conflicts.json")) {
+    SCOPED_TRACE(row["why"]);
+    model["names"] = row["names"];
+    for (const char* function : {"F", "G"})
+      model["names"].insert(
+          model["names"].begin(),
+          json{{"id", function}, {"template", function}, {"kind", "function"}});
+    const std::string message = row.value("message", "");
+    const int code = message.rfind("error", 0) == 0 ? 1 : 0;
+    const json name = namesOf(model, code)["names"].back();
+    EXPECT_EQ(row["actual"], name["actual"]);
+    EXPECT_EQ(row["changes"], name["changes"]);
+    std::string messages;
+    for (const json& found : name["messages"])
+      messages += found["severity"].get<std::string>() + " " +
+                  found["id"].dump() + " " + found["text"].get<std::string>();
+    EXPECT_EQ(message, messages);
   }
 }
 
@@ -246,13 +169,13 @@ TEST(NamesTest, CyclesAreReportedWithTheirNames) {
     EXPECT_THAT(messages[0]["text"].get<std::string>(), HasSubstr("b"));
 
     const fs::path out = HX_ScratchFolder() / "out";
-    EXPECT_EQ(1, HX_RunCodegen("generate " + writeModel(row.model).string() +
+    EXPECT_EQ(1, HX_RunCodegen("generate " + HX_WriteModel(row.model) +
                                " --out " + out.string())
                      .code);
     EXPECT_FALSE(fs::exists(out));
-    EXPECT_EQ(1, HX_RunCodegen("explain " + writeModel(types).string() +
-                               " --name any")
-                     .code);
+    EXPECT_EQ(
+        1,
+        HX_RunCodegen("explain " + HX_WriteModel(types) + " --name any").code);
   }
 }
 
