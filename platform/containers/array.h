@@ -14,14 +14,19 @@ template <class T>
 class array {
  public:
   array() = default;
+  /// \p size value-initialised elements; must not be negative.
   explicit array(int size) : m_Elements(static_cast<std::size_t>(size)) {}
+  /// The elements listed.
   array(std::initializer_list<T> elements) : m_Elements(elements) {}
 
+  /// The number of elements.
   int size() const { return static_cast<int>(m_Elements.size()); }
+  /// The first index.
   int low() const { return 0; }
   /// The last index; -1 for an empty array.
   int high() const { return size() - 1; }
 
+  /// The element; valid until resize().
   T& operator[](int index) {
     return m_Elements[static_cast<std::size_t>(index)];
   }
@@ -32,6 +37,7 @@ class array {
   /// Keeps the elements that still fit; new ones are value-initialised.
   void resize(int size) { m_Elements.resize(static_cast<std::size_t>(size)); }
 
+  /// For loops over all elements, in the order of their indices.
   auto begin() { return m_Elements.begin(); }
   auto end() { return m_Elements.end(); }
   auto begin() const { return m_Elements.begin(); }

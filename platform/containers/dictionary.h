@@ -31,6 +31,7 @@ class dictionary {
   class item {
    public:
     item() = default;
+    /// False for null.
     explicit operator bool() const { return m_Valid; }
 
    private:
@@ -42,8 +43,10 @@ class dictionary {
     bool m_Valid = false;
   };
 
+  /// The number of entries.
   int size() const { return static_cast<int>(m_Map.size()); }
   bool empty() const { return m_Map.empty(); }
+  /// Deletes all entries.
   void clear() { m_Map.clear(); }
 
   /// The entry of \p key, or null.
@@ -57,6 +60,7 @@ class dictionary {
   /// Nothing happens if \p key is not there.
   void del(const Key& key) { m_Map.erase(key); }
 
+  /// The key, and the information, of an entry; \p it must not be null.
   const Key& key(item it) const { return it.m_Place->first; }
   const Inf& inf(item it) const { return it.m_Place->second; }
   Inf& operator[](item it) { return it.m_Place->second; }

@@ -25,6 +25,7 @@ namespace leda {
 class HX_PLATFORM_API integer {
  public:
   constexpr integer() = default;
+  /// The same value.
   constexpr integer(int value)
       : m_Small(value < 0 ? 0 - static_cast<std::uint64_t>(value)
                           : static_cast<std::uint64_t>(value)),
@@ -35,6 +36,7 @@ class HX_PLATFORM_API integer {
   /// 0.
   explicit integer(const char* text);
 
+  /// The same value, in memory of its own.
   integer(const integer& other)
       : m_Small(other.m_Small), m_IsNegative(other.m_IsNegative) {
     if (other.m_pLarge) copyLarge(other);
@@ -67,11 +69,13 @@ class HX_PLATFORM_API integer {
     }
     return shifted(bits);
   }
+  /// The value with the other sign.
   integer operator-() const {
     integer result(*this);
     result.m_IsNegative = !m_IsNegative && used_words() != 0;
     return result;
   }
+  /// Exact: there are no bounds.
   friend integer operator+(const integer& a, const integer& b) {
     if (a.m_pLarge || b.m_pLarge) return sum(a, b);
     if (a.m_IsNegative == b.m_IsNegative) {
@@ -84,9 +88,11 @@ class HX_PLATFORM_API integer {
     return integer(b.m_Small - a.m_Small,
                    b.m_IsNegative && a.m_Small != b.m_Small);
   }
+  /// Exact: there are no bounds.
   friend integer operator-(const integer& a, const integer& b) {
     return a + -b;
   }
+  /// By value.
   friend std::strong_ordering operator<=>(const integer& a, const integer& b) {
     if (a.m_IsNegative != b.m_IsNegative)
       return b.m_IsNegative <=> a.m_IsNegative;
@@ -96,6 +102,7 @@ class HX_PLATFORM_API integer {
     // NOLINTNEXTLINE(modernize-use-nullptr)
     return a.m_IsNegative ? 0 <=> order : order;
   }
+  /// By value.
   friend bool operator==(const integer& a, const integer& b) {
     return std::is_eq(a <=> b);
   }
@@ -119,6 +126,7 @@ class HX_PLATFORM_API integer {
   bool m_IsNegative = false;
 };
 
+/// -1, 0 or 1.
 inline int sign(const integer& x) { return x.sign(); }
 
 }  // namespace leda

@@ -18,7 +18,9 @@ template <class T>
 class list_item {
  public:
   list_item() = default;
+  /// False for null.
   explicit operator bool() const { return m_Valid; }
+  /// True for the same place, and for two nulls.
   friend bool operator==(const list_item& a, const list_item& b) {
     return a.m_Valid == b.m_Valid && (!a.m_Valid || a.m_Place == b.m_Place);
   }
@@ -37,10 +39,13 @@ class list_item {
 template <class T>
 class list {
  public:
+  /// A place in a list of this type.
   using item = list_item<T>;
 
+  /// The number of elements, and whether it is 0.
   bool empty() const { return m_Elements.empty(); }
   int size() const { return static_cast<int>(m_Elements.size()); }
+  /// Deletes all elements, and with them their items.
   void clear() { m_Elements.clear(); }
 
   /// The first item, null for an empty list.
@@ -52,18 +57,23 @@ class list {
   /// The item after \p it, null after the last one.
   item succ(item it) const { return at(std::next(it.m_Place)); }
 
+  /// The element at \p it, which must not be null.
   T& operator[](item it) { return *it.m_Place; }
   const T& operator[](item it) const { return *it.m_Place; }
   const T& contents(item it) const { return *it.m_Place; }
   /// The first element; the list must not be empty.
   const T& front() const { return m_Elements.front(); }
 
+  /// Puts a copy of \p element at the end. \return its place
   item append(const T& element) {
     return item(m_Elements.insert(m_Elements.end(), element));
   }
+  /// Puts a copy of \p element before \p it, which must not be null. \return
+  /// its place
   item insert_before(const T& element, item it) {
     return item(m_Elements.insert(it.m_Place, element));
   }
+  /// Deletes the element at \p it, which must not be null.
   void del_item(item it) { m_Elements.erase(it.m_Place); }
 
   /// Removes and returns the first element; the list must not be empty.
@@ -73,6 +83,7 @@ class list {
     return element;
   }
 
+  /// For loops over all elements, from the first to the last.
   auto begin() const { return m_Elements.begin(); }
   auto end() const { return m_Elements.end(); }
 

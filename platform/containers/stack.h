@@ -12,8 +12,10 @@ namespace leda {
 template <class T>
 class stack {
  public:
+  /// The number of elements, and whether it is 0.
   bool empty() const { return m_Elements.empty(); }
   int size() const { return static_cast<int>(m_Elements.size()); }
+  /// Puts a copy of \p element on top.
   void push(const T& element) { m_Elements.push_back(element); }
 
   /// The latest element; the stack must not be empty.
@@ -26,6 +28,7 @@ class stack {
     return element;
   }
 
+  /// Removes all elements.
   void clear() { m_Elements.clear(); }
 
  private:

@@ -20,21 +20,27 @@
 /// Names compare by character. Handles count from 1 and stay until clear().
 class HX_PLATFORM_API HX_DdTree {
  public:
+  /// A handle that no object has.
   static constexpr unsigned long kInvalidHandle = ~0UL;
+  /// The kind of software components.
   static constexpr unsigned short kSoftwareComponent = 145;
 
   /// A property that refers to another object by its path below the pool.
   struct Reference {
-    std::string property;
-    std::string path;
+    std::string property;  ///< its name
+    std::string path;      ///< without a '/' in front
   };
 
+  /// The one tree of the process.
   static HX_DdTree& instance();
+  /// Deletes all objects.
   void clear();
 
   /// The handle of the object at \p path, which is made if it is new, like
   /// every missing object above it (with kind 0).
   unsigned long add(const std::string& path, unsigned short kind = 0);
+  /// Adds a property, whether or not there is one of that name; needs a valid
+  /// handle.
   void addReference(unsigned long handle, const std::string& property,
                     const std::string& path);
 
@@ -42,7 +48,7 @@ class HX_PLATFORM_API HX_DdTree {
   unsigned long find(const std::string& path) const;
   bool isValid(unsigned long handle) const;
 
-  // These need a valid handle.
+  /// These need a valid handle.
   const std::string& path(unsigned long handle) const;
   std::string name(unsigned long handle) const;
   const std::vector<Reference>& references(unsigned long handle) const;

@@ -17,9 +17,10 @@ HX_PLATFORM_API int DDAPIHeapBalance();
 
 namespace kyddapi {
 
+/// A handle in a list of them.
 struct KYSDDHandleNode {
-  KYSDDHandleNode* next;
-  unsigned long handle;
+  KYSDDHandleNode* next;  ///< null at the end
+  unsigned long handle;   ///< of an object
 };
 
 /// A connection to one object of the data dictionary.
@@ -45,6 +46,8 @@ class HX_PLATFORM_API KYCDDObject {
   /// \return false, with nothing handed out, for an index that does not exist
   bool ReadRefPathFromDDK(long index, char*& path, unsigned long& length,
                           unsigned short reserved) const;
+  /// The name of property \p index, and its length in bytes. \return false,
+  /// with nothing handed out, for an index that does not exist
   bool GetPropertyName(char*& name, unsigned short& length, long index) const;
   /// The object's own name; false for an unconnected object.
   bool GetName(char*& name, unsigned short& length) const;
@@ -53,6 +56,7 @@ class HX_PLATFORM_API KYCDDObject {
   unsigned long m_Handle;
 };
 
+/// An object that is a software component; the kind is not checked.
 class HX_PLATFORM_API KYCDDSoftwareComponent : public KYCDDObject {
  public:
   using KYCDDObject::KYCDDObject;

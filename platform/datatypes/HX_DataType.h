@@ -19,6 +19,7 @@ class HxCSrcRef;
 /// What only a base type has.
 class HX_BaseTypeProperties {
  public:
+  /// \param cut  the short form of the type's name
   explicit HX_BaseTypeProperties(const KyCXString& cut) : m_Cut(cut) {}
   /// The short form of the type's name; owned by the properties, never null.
   KyCXString* getCut() { return &m_Cut; }
@@ -34,12 +35,14 @@ class HX_DataType {
   /// Kinds that have neither a base type nor a cut.
   enum UnnamedKind { eNamed, eUnnamedStruct, eUnnamedEnum };
 
+  /// A type that is none of the kinds below, until it is told.
   explicit HX_DataType(const KyCXString& nameInCode)
       : m_NameInCode(nameInCode) {}
   HX_DataType(const HX_DataType&) = delete;
   HX_DataType& operator=(const HX_DataType&) = delete;
   virtual ~HX_DataType() = default;
 
+  /// Each gives this type back, so that calls can be chained.
   HX_DataType& setSrcRef(const HxCSrcRef* srcRef) {
     m_pSrcRef = srcRef;
     return *this;
@@ -91,6 +94,7 @@ class HX_DataType {
     return *this;
   }
 
+  /// What was set, or what the kind implies.
   const HxCSrcRef* getSrcRef() const { return m_pSrcRef; }
   const KyCXString& getNameInCode() const { return m_NameInCode; }
   virtual bool isUnnamedStruct() const { return m_Unnamed == eUnnamedStruct; }

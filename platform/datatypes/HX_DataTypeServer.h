@@ -7,6 +7,7 @@
 
 class HxCSrcRef;
 
+/// What is known of base types as a whole.
 class HX_BaseTypeServer {
  public:
   /// The type that bit fields are declared with; null if there is none.
@@ -17,6 +18,7 @@ class HX_BaseTypeServer {
   HX_DataType* m_pBitfieldBase = nullptr;
 };
 
+/// Owns the server of the base types; types are not owned.
 class HX_DataTypeServer {
  public:
   /// The element type of an array (of arrays), any other type itself.

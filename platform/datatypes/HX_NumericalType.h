@@ -17,6 +17,7 @@ class HX_NumericalType {
         m_IsSigned(isSigned) {}
   virtual ~HX_NumericalType() = default;
 
+  /// As given to the constructor.
   virtual double getMaximum() const { return m_Maximum; }
   virtual double getMinimum() const { return m_Minimum; }
   virtual int getBitWidth() const { return m_BitWidth; }

@@ -20,6 +20,8 @@
 class KyCXString;
 
 #if defined(__GNUC__)
+/// Lets the compiler check a printf format: the positions of the format and of
+/// its first argument, counted from 1.
 #define HX_PRINTF_LIKE(text, first) __attribute__((format(printf, text, first)))
 #else
 #define HX_PRINTF_LIKE(text, first)

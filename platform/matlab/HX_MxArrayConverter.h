@@ -12,7 +12,9 @@ class KyCXString;
 /// result is false and the value is not written.
 class HX_PLATFORM_API HX_MxArrayConverter {
  public:
+  /// The characters of a text array.
   bool mxArrayToString(const mxArray* array, KyCXString& text) const;
+  /// The number in an array of double.
   bool mxArrayToDouble(const mxArray* array, double& value) const;
 };
 

@@ -13,6 +13,7 @@
 class HX_SimulinkTree;
 class KyCXString;
 
+/// Asks the open model; one for the process.
 class HX_PLATFORM_API HX_SimulinkInterface {
  public:
   /// A handle that no block has.

@@ -27,12 +27,16 @@ struct HX_Message {
   std::string text;                   ///< formatted
 };
 
+/// Records every message and hands it on. The recorded ones are kept until
+/// clear().
 class HX_PLATFORM_API HX_MessageHandler {
  public:
+  /// Receives a message; it is valid during the call only.
   using Sink = std::function<void(const HX_Message&)>;
   /// Receives file, line and expression; answers 1 to debug.
   using DebugReport = std::function<int(const char*, int, const char*)>;
 
+  /// The one handler of the process.
   static HX_MessageHandler& instance();
 
   /// Every message since the last clear(), in the order of reporting.
@@ -47,6 +51,7 @@ class HX_PLATFORM_API HX_MessageHandler {
   void setSink(Sink sink) { m_Sink = std::move(sink); }
   static void writeToStandardError(const HX_Message& message);
 
+  /// What ShowInternalInfo() answers: whether debug checks report.
   void setShowInternalInfo(bool show) { m_ShowInternalInfo = show; }
   bool showInternalInfo() const { return m_ShowInternalInfo; }
 

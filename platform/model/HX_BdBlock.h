@@ -10,10 +10,12 @@ class HxCSrcRef;
 /// The source reference is not owned; null for a block without an origin.
 class HX_BdBlock {
  public:
+  /// \param rawName  the name before it is made a C identifier
   explicit HX_BdBlock(const KyCXString& rawName,
                       const HxCSrcRef* srcRef = nullptr)
       : m_RawName(rawName), m_pSrcRef(srcRef) {}
 
+  /// As given to the constructor.
   const KyCXString& getRawName() const { return m_RawName; }
   const HxCSrcRef* getSrcRef() const { return m_pSrcRef; }
 

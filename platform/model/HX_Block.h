@@ -21,12 +21,15 @@ class HX_Block {
   /// Reads as a negative number: the block lies in no numbered subsystem.
   static constexpr unsigned int kNoSubsystem = 0xFFFFFFFF;
 
+  /// A block of \p name, its own without a path, below \p parent; null for the
+  /// model itself.
   explicit HX_Block(const KyCXString& name, HX_Block* parent = nullptr)
       : m_Name(name), m_pParent(parent) {}
   HX_Block(const HX_Block&) = delete;
   HX_Block& operator=(const HX_Block&) = delete;
   virtual ~HX_Block() = default;
 
+  /// As given to the constructor.
   const KyCXString& getName() const { return m_Name; }
   HX_Block* getParent() const { return m_pParent; }
 

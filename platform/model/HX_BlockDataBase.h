@@ -7,8 +7,10 @@
 
 #include "platform/matlab/HX_SimulinkInterface.h"
 
+/// Holds the handle that each block has in the simulation tool.
 class HX_BlockDataBase {
  public:
+  /// Enters a block, or gives it another handle.
   void setSlBlockHandle(int blockId, double handle) {
     m_Handles[blockId] = handle;
   }

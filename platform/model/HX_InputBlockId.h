@@ -12,9 +12,11 @@ class HX_BlockDataBase;
 /// The data base is not owned and outlives the identifier.
 class HX_InputBlockId {
  public:
+  /// \p blockId need not be entered in \p blocks.
   HX_InputBlockId(HX_BlockDataBase& blocks, int blockId)
       : m_pBlocks(&blocks), m_BlockId(blockId) {}
 
+  /// As given to the constructor.
   int getBlockId() const { return m_BlockId; }
   HX_BlockDataBase& getBlockDataBase() const { return *m_pBlocks; }
 

@@ -5,9 +5,12 @@
 
 #include "platform/strings/KyCXString.h"
 
+/// What holds for a whole partition.
 class HX_BcPartitionContext {
  public:
+  /// \param id  the identifier of its subsystem, the value of $I
   explicit HX_BcPartitionContext(const KyCXString& id) : m_Id(id) {}
+  /// As given to the constructor.
   const KyCXString& getSubsystemIdentifier() const { return m_Id; }
 
  private:
@@ -17,8 +20,10 @@ class HX_BcPartitionContext {
 /// The context is not owned; null if the partition has none.
 class HX_BdPartition {
  public:
+  /// \param context  may be null
   explicit HX_BdPartition(HX_BcPartitionContext* context)
       : m_pContext(context) {}
+  /// As given to the constructor.
   HX_BcPartitionContext* getPartitionContext() const { return m_pContext; }
 
  private:
@@ -28,7 +33,9 @@ class HX_BdPartition {
 /// The partition is not owned; null before the view is partitioned.
 class HxCIvData {
  public:
+  /// \param root  may be null
   explicit HxCIvData(HX_BdPartition* root) : m_pRoot(root) {}
+  /// As given to the constructor.
   HX_BdPartition* getIvHxRootPartition() const { return m_pRoot; }
 
  private:

@@ -5,6 +5,7 @@
 
 #include "platform/strings/KyCXString.h"
 
+/// The host sets them before the run; see HxCGlobal::setOptions().
 class HX_Options {
  public:
   /// Whether generated names are cut to HxCSymbol::sm_MaxNameLength.

@@ -9,8 +9,10 @@
 
 class HX_Block;
 
+/// Blocks are known by their address; they are not owned.
 class HX_SlBlockHandlesDB {
  public:
+  /// Enters a block, or gives it another handle.
   void setSlBlockHandle(const HX_Block* block, double handle) {
     m_Handles[block] = handle;
   }

@@ -16,6 +16,7 @@ class HxCIvData;
 /// the block handles, and null for the others.
 class HX_PLATFORM_API HxCGlobal {
  public:
+  /// Each of these reads or sets one entry.
   static HX_OptionsExt* getOptions();
   static void setOptions(HX_OptionsExt* options);
   static HX_SlBlockHandlesDB* getSlBlockHandlesDB();
@@ -26,6 +27,7 @@ class HX_PLATFORM_API HxCGlobal {
   static void setDataTypeServer(HX_DataTypeServer* server);
 };
 
+/// The model that code is generated for; empty at first.
 HX_PLATFORM_API const KyCXString& GLB_GetModelName();
 HX_PLATFORM_API void GLB_SetModelName(const KyCXString& name);
 /// The subsystem that code is generated for.

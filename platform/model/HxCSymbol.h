@@ -16,11 +16,14 @@ class HxCSymbol {
   /// internal identifiers (5.2.4.1).
   static constexpr int sm_MaxNameLength = 31;
 
+  /// What a symbol stands for.
   enum HxESymbolKindTag { eVariable = 1, eConstant = 2, eFunction = 3 };
 
+  /// \param kind  a HxESymbolKindTag, or a number of the host's own
   HxCSymbol(const KyCXString& name, int kind, HX_DataType* dataType = nullptr)
       : m_Name(name), m_Kind(kind), m_pDataType(dataType) {}
 
+  /// As given to the constructor.
   const KyCXString& getName() const { return m_Name; }
   int getKind() const { return m_Kind; }
   HX_DataType* getDataType() const { return m_pDataType; }

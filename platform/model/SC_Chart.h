@@ -5,8 +5,10 @@
 
 #include "platform/strings/KyCXString.h"
 
+/// Known by the place where it is generated; states point to it.
 class SC_Chart {
  public:
+  /// \param subsystemId  see getSubsystemId()
   explicit SC_Chart(const KyCXString& subsystemId)
       : m_SubsystemId(subsystemId) {}
 

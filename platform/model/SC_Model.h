@@ -22,6 +22,7 @@ class SC_Model {
   SC_Model& operator=(const SC_Model&) = delete;
   virtual ~SC_Model() = default;
 
+  /// As given to the constructor.
   int getId() const { return m_Id; }
   const char* getName() const { return m_Name.cstring(); }
   /// The name with its path in the chart, as a user reads it.
@@ -31,6 +32,7 @@ class SC_Model {
   const KyCXString& getHierarchy() const { return m_Hierarchy; }
   void setHierarchy(const KyCXString& text) { m_Hierarchy = text; }
 
+  /// The number in its chart, as given to the constructor.
   virtual int getObjectNumber() const { return m_Number; }
 
   /// The block that contains the object.

@@ -10,9 +10,11 @@ class SC_Chart;
 /// The chart is not owned and never null.
 class SC_State : public SC_Model {
  public:
+  /// See SC_Model; \p chart must not be null.
   SC_State(int id, int number, const KyCXString& name, SC_Chart* chart)
       : SC_Model(id, number, name), m_pChart(chart) {}
 
+  /// As given to the constructor.
   SC_Chart* getChart() const { return m_pChart; }
 
  private:

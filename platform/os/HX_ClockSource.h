@@ -14,6 +14,7 @@
 
 #include "platform/HX_PlatformExport.h"
 
+/// What the clocks of the process ask. A host may put its own source in place.
 class HX_PLATFORM_API HX_ClockSource {
  public:
   virtual ~HX_ClockSource();

@@ -8,8 +8,10 @@
 
 #include "platform/HX_PlatformExport.h"
 
+/// Names a thread; it is not to be closed.
 using HX_ThreadHandle = void*;
 
+/// Levels with a name.
 inline constexpr int THREAD_PRIORITY_LOWEST = -2;
 inline constexpr int THREAD_PRIORITY_NORMAL = 0;
 /// What GetThreadPriority() answers when it cannot tell.

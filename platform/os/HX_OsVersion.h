@@ -19,24 +19,25 @@
 
 #include "platform/HX_PlatformExport.h"
 
+/// Names a loaded module.
 using HX_ModuleHandle = const void*;
 
 /// The value of the root of a block. The four parts of a version are the high
 /// and low halves of its MS and LS words, in this order.
 struct VS_FIXEDFILEINFO {
-  std::uint32_t dwSignature;  // 0xFEEF04BD
-  std::uint32_t dwStrucVersion;
-  std::uint32_t dwFileVersionMS;
-  std::uint32_t dwFileVersionLS;
-  std::uint32_t dwProductVersionMS;
-  std::uint32_t dwProductVersionLS;
-  std::uint32_t dwFileFlagsMask;
-  std::uint32_t dwFileFlags;
-  std::uint32_t dwFileOS;
-  std::uint32_t dwFileType;
-  std::uint32_t dwFileSubtype;
-  std::uint32_t dwFileDateMS;
-  std::uint32_t dwFileDateLS;
+  std::uint32_t dwSignature;         ///< 0xFEEF04BD
+  std::uint32_t dwStrucVersion;      ///< of this structure; 0x10000
+  std::uint32_t dwFileVersionMS;     ///< first two parts
+  std::uint32_t dwFileVersionLS;     ///< last two parts
+  std::uint32_t dwProductVersionMS;  ///< first two parts
+  std::uint32_t dwProductVersionLS;  ///< last two parts
+  std::uint32_t dwFileFlagsMask;     ///< which flags count
+  std::uint32_t dwFileFlags;         ///< debug, prerelease, ...
+  std::uint32_t dwFileOS;            ///< the system it is made for
+  std::uint32_t dwFileType;          ///< program, library, ...
+  std::uint32_t dwFileSubtype;       ///< of drivers and fonts
+  std::uint32_t dwFileDateMS;        ///< high word; mostly 0
+  std::uint32_t dwFileDateLS;        ///< low word; mostly 0
 };
 
 /// The loaded module \p name, null if there is none. Not to be released.
@@ -60,10 +61,10 @@ HX_PLATFORM_API std::uint32_t GetFileVersionInfoSizeA(const char* path,
 HX_PLATFORM_API int GetFileVersionInfoA(const char* path, std::uint32_t handle,
                                         std::uint32_t size, void* block);
 
-/// Finds a value of a block of GetFileVersionInfoA() by its path: "\" is the
-/// root (a VS_FIXEDFILEINFO), "\VarFileInfo\Translation" the languages (low 16
-/// bits) and code pages (high 16 bits) as 32-bit words,
-/// "\StringFileInfo\040904B0\CompanyName" a zero-terminated text of that
+/// Finds a value of a block of GetFileVersionInfoA() by its path: "\\" is the
+/// root (a VS_FIXEDFILEINFO), "\\VarFileInfo\\Translation" the languages (low
+/// 16 bits) and code pages (high 16 bits) as 32-bit words,
+/// "\\StringFileInfo\\040904B0\\CompanyName" a zero-terminated text of that
 /// language and code page in hexadecimal. Letter case and the first backslash
 /// do not matter.
 /// \param[out] value  inside \p block; written when the result is not 0

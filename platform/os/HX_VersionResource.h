@@ -31,8 +31,10 @@
 /// A value type; what was not set is not in the block.
 class HX_PLATFORM_API HX_VersionResource {
  public:
+  /// The four parts of a version, the most significant first.
   using Version = std::array<std::uint16_t, 4>;
 
+  /// Sets the fixed part of the resource.
   void setVersions(const Version& product, const Version& file);
   /// The first translation is the one that readers take.
   void addTranslation(std::uint16_t language, std::uint16_t codePage);

@@ -52,6 +52,7 @@ class HX_PLATFORM_API KyCXString {
     if (ownsMemory()) release();
   }
 
+  /// Copies, moves, or reads as the constructors do.
   KyCXString& operator=(const KyCXString& other);
   KyCXString& operator=(KyCXString&& other) noexcept;
   KyCXString& operator=(const char* text);
@@ -75,6 +76,7 @@ class HX_PLATFORM_API KyCXString {
   /// asks for no more memory. The text stays.
   void reserve(int length) { makeRoom(length); }
 
+  /// Appends \p text, which may be this object itself.
   KyCXString& operator+=(const KyCXString& text) {
     const int room = m_Capacity - m_Length;
     if (m_Wide != nullptr || text.m_Wide != nullptr || text.m_Length > room)
@@ -85,6 +87,7 @@ class HX_PLATFORM_API KyCXString {
     m_Text[m_Length] = 0;
     return *this;
   }
+  /// Appends ISO-8859-1 characters; null counts as empty.
   KyCXString& operator+=(const char* text);
   KyCXString& operator+=(char character) {
     if (m_Wide != nullptr || m_Length == m_Capacity)
@@ -126,6 +129,7 @@ class HX_PLATFORM_API KyCXString {
   /// separators give n + 1 parts, an empty text gives one empty part.
   void split(char separator, leda::array<KyCXString>& parts) const;
 
+  /// Changes the case of letters.
   KyCXString& toLower();
   KyCXString& toUpper();
   /// Removes white space at the chosen ends.
@@ -162,6 +166,7 @@ class HX_PLATFORM_API KyCXString {
   /// \p other: by the first unit that differs, else the shorter first.
   int compareWith(const KyCXString& other) const;
 
+  /// By units, as compareWith() has it.
   friend bool operator==(const KyCXString& a, const KyCXString& b) {
     if (a.m_Length != b.m_Length) return false;
     if (a.m_Wide == nullptr && b.m_Wide == nullptr)
@@ -169,14 +174,17 @@ class HX_PLATFORM_API KyCXString {
                          static_cast<std::size_t>(a.m_Length)) == 0;
     return a.compareWith(b) == 0;
   }
+  /// By units, as compareWith() has it.
   friend bool operator<(const KyCXString& a, const KyCXString& b) {
     return a.compareWith(b) < 0;
   }
+  /// \p a followed by \p b.
   friend KyCXString operator+(const KyCXString& a, const KyCXString& b) {
     KyCXString sum(a);
     sum += b;
     return sum;
   }
+  /// The same; \p a lends its memory.
   friend KyCXString operator+(KyCXString&& a, const KyCXString& b) {
     a += b;
     return static_cast<KyCXString&&>(a);

@@ -6,15 +6,17 @@
 #ifndef CONTROL_ERR_CATALOGUE_H
 #define CONTROL_ERR_CATALOGUE_H
 
+/// One message: how it is numbered, classed and worded.
 struct ERR_CatalogueRow {
-  int number;  ///< what ERR_EmitErrorMessage() receives
-  int id;      ///< what a user sees
-  const char* category;
-  int severity;      ///< 0 to 7, see ERR_EmitErrorMessage()
-  bool hasSrcRef;    ///< the emitter takes a source reference first
-  const char* text;  ///< a printf format
+  int number;            ///< what ERR_EmitErrorMessage() receives
+  int id;                ///< what a user sees
+  const char* category;  ///< the group it is shown in
+  int severity;          ///< 0 to 7, see ERR_EmitErrorMessage()
+  bool hasSrcRef;        ///< the emitter takes a source reference first
+  const char* text;      ///< a printf format
 };
 
+/// The groups of messages, as a user reads them.
 inline constexpr const char* kGeneralMessages = "General Messages";
 inline constexpr const char* kSystemMessages = "Operating System Messages";
 inline constexpr const char* kCompileMessages = "Compile Time Messages";

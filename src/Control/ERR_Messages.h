@@ -74,6 +74,8 @@ void emitPlain(Args... args) {
 
 }  // namespace err_detail
 
+/// The emitters. Each reports the row of its number, with the severity that the
+/// row has; times are in seconds.
 inline void ERR_Msg2(const char* label, double seconds) {
   err_detail::emitPlain<2>(label, seconds);
 }
@@ -106,7 +108,6 @@ inline void ERR_Msg1204(const HxCSrcRef* srcRef, const char* nameTemplate) {
 inline void ERR_Msg1205(const HxCSrcRef* srcRef, const char* nameTemplate) {
   err_detail::emitAt<1205>(srcRef, nameTemplate);
 }
-/// \param period, offset  seconds
 inline void ERR_Msg1206(const HxCSrcRef* srcRef, const char* macro,
                         const char* timeBase, double period, double offset) {
   err_detail::emitAt<1206>(srcRef, macro, timeBase, period, offset);

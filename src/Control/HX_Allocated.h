@@ -23,11 +23,15 @@ HX_UTILS_API void HX_Free(void* block) noexcept;
 /// constructor runs and nothing is thrown. Arrays are left to the global new.
 class HX_Allocated {
  public:
+  /// By HX_Allocate() and HX_Free(); null if there is no memory.
   static void* operator new(std::size_t size) noexcept {
     return HX_Allocate(size);
   }
+  /// Constructs at a place that the caller owns.
   static void* operator new(std::size_t, void* place) noexcept { return place; }
+  /// Gives back what the first form of new has taken; null is ignored.
   static void operator delete(void* block) noexcept { HX_Free(block); }
+  /// Takes nothing back: the place is the caller's.
   static void operator delete(void*, void*) noexcept {}
 
  protected:

@@ -8,6 +8,8 @@
 
 #include "HX_Export.h"
 
+/// The counters. The common ones are for whoever debugs; the last one counts
+/// evaluated MATLAB expressions.
 enum ScEDebugCounter : int {
   eCounterCommon1 = 0,
   eCounterCommon2 = 1,
@@ -20,8 +22,11 @@ enum ScEDebugCounter : int {
   eCounterCommon9 = 8,
   eCounterEvalMlExpr = 9
 };
+/// How many there are.
 inline constexpr int kDebugCounters = 10;
 
+/// The clocks. The common ones are for whoever debugs; the last one measures
+/// the evaluation of MATLAB expressions.
 enum ScEDebugClock : int {
   eClockCommon1 = 0,
   eClockCommon2 = 1,
@@ -45,11 +50,13 @@ enum ScEDebugClock : int {
   eClockCommon20 = 19,
   eClockEvalMlExpr = 20
 };
+/// How many there are.
 inline constexpr int kDebugClocks = 21;
 
 /// The texts are constant; a value outside its enumeration has an empty one.
 class HX_UTILS_API HxCDebugElements {
  public:
+  /// What the counter, or the clock, is shown as.
   static const char* getCounterComment(ScEDebugCounter counter);
   static const char* getClockComment(ScEDebugClock clock);
 };

@@ -47,16 +47,17 @@ class HX_UTILS_API HxCDebugServer : public HX_Allocated {
   /// Sums of one clock, in raw times: ticks of the high-resolution counter or,
   /// where there is none, milliseconds of the process clock.
   struct HxCDebugClock {
-    std::int64_t total = 0;
-    std::int64_t maximum = 0;       // the longest single interval
-    std::int64_t runningStart = 0;  // 0: not running
-    std::int64_t calls = 0;         // counted starts
+    std::int64_t total = 0;         ///< of all intervals that ended
+    std::int64_t maximum = 0;       ///< the longest single interval
+    std::int64_t runningStart = 0;  ///< 0: not running
+    std::int64_t calls = 0;         ///< counted starts
   };
 
+  /// A run time under way.
   struct HxCDebugRuntime {
-    static constexpr int kMaxNameLength = 63;
-    std::int64_t start = 0;  // raw time
-    char name[kMaxNameLength + 1] = "";
+    static constexpr int kMaxNameLength = 63;  ///< in bytes; the rest is cut
+    std::int64_t start = 0;                    ///< raw time
+    char name[kMaxNameLength + 1] = "";        ///< zero-terminated
   };
 
   HxCDebugServer();
@@ -78,6 +79,7 @@ class HX_UTILS_API HxCDebugServer : public HX_Allocated {
   /// Allows the next boot(). Writes nothing. \return true
   bool shutdown();
 
+  /// Adds 1.
   void count(ScEDebugCounter counter);
   /// 0 for a value outside the enumeration.
   std::int64_t getCounter(ScEDebugCounter counter) const;

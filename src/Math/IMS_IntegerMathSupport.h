@@ -59,6 +59,7 @@ HX_UTILS_API bool IMS_Fits32Bit(long long v);
 HX_UTILS_API long long IMS_GetLower32Bit(long long v);
 HX_UTILS_API long long IMS_GetUpper32Bit(long long v);
 
+/// True for 0 and for negative even values too.
 HX_UTILS_API bool IMS_IsEven(long long v);
 
 /// Rounds half away from zero; saturates at the bounds of the type. NaN gives

@@ -11,10 +11,12 @@
 
 #include <bit>
 
+/// The logarithm of \p value, rounded down: [0, 63]; 0 for 0, -1 below.
 constexpr int IMS_Log2(unsigned int value) {
   return static_cast<int>(std::bit_width(value | 1U)) - 1;
 }
 
+/// \copydoc IMS_Log2(unsigned int)
 constexpr int IMS_Log2(long long value) {
   if (value < 0) return -1;
   return static_cast<int>(
@@ -22,10 +24,12 @@ constexpr int IMS_Log2(long long value) {
          1;
 }
 
+/// \copydoc IMS_Log2(unsigned int)
 constexpr int IMS_Log2(int value) {
   return IMS_Log2(static_cast<long long>(value));
 }
 
+/// \copydoc IMS_Log2(unsigned int)
 constexpr int IMS_Log2(long value) {
   return IMS_Log2(static_cast<long long>(value));
 }

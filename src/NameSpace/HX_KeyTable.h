@@ -33,9 +33,9 @@ class HX_KeyTable {
  public:
   /// Valid until the next add() or erase().
   struct Slot {
-    int key;
-    unsigned uses;  // the owner's count; 0 marks a free slot
-    [[no_unique_address]] Value value;
+    int key;        ///< not to be changed
+    unsigned uses;  ///< the owner's count; 0 marks a free slot
+    [[no_unique_address]] Value value;  ///< the owner's
   };
 
   HX_KeyTable() = default;
@@ -43,6 +43,7 @@ class HX_KeyTable {
   HX_KeyTable& operator=(const HX_KeyTable&) = delete;
   ~HX_KeyTable() { HX_Free(m_Slots); }
 
+  /// The number of entries, equal keys counted each.
   unsigned size() const { return m_Size; }
 
   /// The entry of \p key whose value satisfies \p match, null if there is none.
@@ -55,6 +56,7 @@ class HX_KeyTable {
       if (slot.key == key && match(slot.value)) return &slot;
     }
   }
+  /// An entry of \p key, whichever value it has; null if there is none.
   Slot* find(int key) const {
     return find(key, [](const Value&) { return true; });
   }

@@ -25,8 +25,11 @@ class HX_PlainArray {
   HX_PlainArray& operator=(const HX_PlainArray&) = delete;
   ~HX_PlainArray() { HX_Free(m_Values); }
 
+  /// The number of values.
   unsigned size() const { return m_Size; }
+  /// Valid until the next append().
   const Value& operator[](unsigned index) const { return m_Values[index]; }
+  /// For loops over all values; valid until the next append().
   const Value* begin() const { return m_Values; }
   const Value* end() const { return m_Values + m_Size; }
 

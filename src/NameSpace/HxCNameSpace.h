@@ -35,6 +35,7 @@ class KyCXString;
 /// no assertion).
 class HX_UTILS_API HxCNameSpace : public HX_Allocated {
  public:
+  /// A scope as this class makes it; its values are owned by it.
   using Scope = HxCObjectEnvironment<HxCSmbScopeData*>;
 
   /// The handles constructed from a server so far; copies do not count.
@@ -53,6 +54,7 @@ class HX_UTILS_API HxCNameSpace : public HX_Allocated {
   /// \return the current scope; null if there was no memory
   Scope* newScope(Scope* parent);
 
+  /// The current scope, null if the handle has none.
   Scope* getScope() const { return m_pScope; }
   /// Null empties the handle.
   void setScope(Scope* scope) { m_pScope = scope; }

@@ -47,6 +47,7 @@ class HxCObjectEnvironment : public HX_Allocated {
       : m_pParent(parent) {}
   HxCObjectEnvironment(const HxCObjectEnvironment&) = delete;
   HxCObjectEnvironment& operator=(const HxCObjectEnvironment&) = delete;
+  /// Destroys the values, and the children that this scope owns.
   ~HxCObjectEnvironment();
 
   /// Appends \p scope, created with new, to the children. The lists of
@@ -63,6 +64,7 @@ class HxCObjectEnvironment : public HX_Allocated {
   ///         this scope holds \p key already or there is no memory
   bool defineKey(int key, T value);
 
+  /// True if this very scope holds \p key.
   bool containsInScope(int key) const { return m_Entries.find(key) != nullptr; }
   /// The value of \p key in this scope; null if it has none or is not here.
   T lookupInScope(int key) const;

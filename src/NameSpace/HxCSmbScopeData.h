@@ -11,11 +11,14 @@ class HxCSymbol;
 /// whoever makes names unique, starts at 0 and has no bounds.
 class HxCSmbScopeData : public HX_Allocated {
  public:
+  /// An entry for \p symbol, which may be null; no collisions.
   explicit HxCSmbScopeData(HxCSymbol* symbol) : m_pSymbol(symbol) {}
 
+  /// The symbol; null if it has none.
   HxCSymbol* getSymbol() const { return m_pSymbol; }
   void setSymbol(HxCSymbol* symbol) { m_pSymbol = symbol; }
 
+  /// How many names have collided with this one, as its user counts.
   int getCollisionCount() const { return m_CollisionCount; }
   void setCollisionCount(int count) { m_CollisionCount = count; }
   void incrCollisionCount() { ++m_CollisionCount; }

@@ -48,6 +48,7 @@ class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
   HxCCIdentifier(const char* name);
   HxCCIdentifier(const HxCCIdentifier&) = default;
   HxCCIdentifier& operator=(const HxCCIdentifier&) = default;
+  /// Like setName().
   HxCCIdentifier& operator=(const KyCXString& name);
   HxCCIdentifier& operator=(const char* name);
   virtual ~HxCCIdentifier();
@@ -57,9 +58,12 @@ class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
   /// \return false if \p name has more than two parts; the first two count.
   bool setName(const KyCXString& name);
 
+  /// That part of the template; a template of one part is both, and the actual
+  /// one then ends in "$R".
   const KyCXString& getRawName(HxENameTypeTag type) const {
     return name(type).raw;
   }
+  /// The name as far as it is expanded; the raw name at first.
   const KyCXString& getCookedName(HxENameTypeTag type) const {
     return name(type).cooked;
   }
@@ -79,10 +83,12 @@ class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
   /// that limits the length of names is on.
   void adaptSize();
 
+  /// Which of the two names stands for the identifier where no type is given.
   bool isFormalNameActive() const { return m_FormalNameActive; }
   void activateFormalName() { m_FormalNameActive = true; }
   void activateActualName() { m_FormalNameActive = false; }
 
+  /// How far the names are expanded; set by whoever expands them.
   HxECookLevelTag getCookLevel() const { return m_CookLevel; }
   void setCookLevel(HxECookLevelTag level) { m_CookLevel = level; }
 
@@ -111,6 +117,8 @@ class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
   }
   bool getDollarNUsed(HxENameTypeTag type) const;
 
+  /// The label of the signal that the name is for, the value of $L; empty if it
+  /// has none.
   const KyCXString& getSignalLabel() const { return m_SignalLabel; }
   void setSignalLabel(const KyCXString& label) { m_SignalLabel = label; }
 

@@ -54,6 +54,7 @@ class SC_Model;
 /// stays as text. $D alone differs: provisional, it always becomes "_D".
 class HX_UTILS_API HxCNames : public HX_Allocated {
  public:
+  /// The bits of the macros in a macro bit set.
   enum HxEMacroBitTag : unsigned int {
     eMacroLabel = 0x1,             ///< $L
     eMacroBlockName = 0x2,         ///< $B

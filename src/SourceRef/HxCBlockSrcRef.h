@@ -19,6 +19,7 @@ class HX_UTILS_API HxCBlockSrcRef : public HxCSrcRef {
   /// The block's full path with blanks for white space; empty without a block.
   void toString(KyCXString& text) const override;
 
+  /// The block; null if there is none.
   HX_Block* getBlock() const { return m_pBlock; }
   void setBlock(HX_Block* block) { m_pBlock = block; }
 

@@ -21,6 +21,7 @@ class HX_UTILS_API HxCDdSrcRef : public HxCSrcRef {
   void toString(KyCXString& text) const override;
   HxCSrcRef* clone() const override;
 
+  /// The handle as it was given, whether or not there is such an object.
   unsigned long getDdHandle() const { return m_Handle; }
 
   /// \param[out] path  the object's full path; "Handle: 4711" for a handle

@@ -17,6 +17,7 @@ class mxArray;
 /// outlive the reference, its copies and its clones. Copies keep the number.
 class HX_UTILS_API HxCInputBlockSrcRef : public HxCSrcRef {
  public:
+  /// A reference to the block that \p id names.
   explicit HxCInputBlockSrcRef(const HX_InputBlockId& id);
   HxCInputBlockSrcRef(const HxCInputBlockSrcRef&) = default;
   HxCInputBlockSrcRef& operator=(const HxCInputBlockSrcRef&) = default;

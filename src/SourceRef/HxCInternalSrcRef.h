@@ -26,6 +26,7 @@ class HX_UTILS_API HxCInternalSrcRef : public HxCSrcRef {
   const HxCInternalSrcRef* isInternal() const override;
   void toString(KyCXString& text) const override;
 
+  /// The place and its cause, as they were given.
   const KyCXString& getFile() const { return m_File; }
   void setFile(const KyCXString& file) { m_File = file; }
   int getLine() const { return m_Line; }

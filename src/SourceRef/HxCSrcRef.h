@@ -39,8 +39,9 @@ class HX_UTILS_API HxCSrcRef : public HX_Dumpable, public HX_Allocated {
   /// of this reference. The flag is not used. \return \p dumper
   virtual HX_Dump* dump(HX_Dump* dumper, bool recursive);
 
+  /// This reference; never null.
   virtual const HxCSrcRef* isSrcRef() const;
-  // Each of these is this reference in the one class it names, else null.
+  /// Each of these is this reference in the one class it names, else null.
   virtual const HxCBlockSrcRef* isBlock() const;
   virtual const HxCStateflowSrcRef* isStateflow() const;
   virtual const HxCModuleSrcRef* isModule() const;
@@ -55,6 +56,7 @@ class HX_UTILS_API HxCSrcRef : public HX_Dumpable, public HX_Allocated {
   /// its number.
   virtual HxCSrcRef* clone() const;
 
+  /// The number, from 0 in the order of creation; copies share it.
   int getSrcRefId() const { return m_Id; }
 
  private:

@@ -50,6 +50,7 @@ class HX_UTILS_API HxCSrcRefSet : public HX_Allocated {
     m_Content.one = nullptr;
   }
 
+  /// The number of different references.
   int getSrcRefCnt() const;
 
   /// The first reference; null if there is none.

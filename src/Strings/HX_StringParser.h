@@ -17,6 +17,7 @@
 /// Holds no data. No operation reports a message. Letter case is that of ASCII.
 class HX_UTILS_API HX_StringParser : public HX_Allocated {
  public:
+  /// At which ends to remove.
   enum remove_etp : int {
     eRemoveLeading = 0,
     eRemoveTrailing = 1,

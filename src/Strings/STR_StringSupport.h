@@ -14,12 +14,14 @@
 
 #include "HX_Export.h"
 
-// With a fixed type, so that values outside the enumerations are defined.
+/// Whether letter case counts. The type is fixed, so that values outside the
+/// enumeration are defined.
 enum STR_case_sensitive_etp : int {
-  STR_CASE_SENSITIVE = 0,
+  STR_CASE_SENSITIVE = 0,   ///< all bytes have to be the same
   STR_CASE_INSENSITIVE = 1  ///< 'A' to 'Z' equal 'a' to 'z'; no other letter
 };
 
+/// What STR_ProcessString() replaces.
 enum STR_process_mode_tp : int {
   STR_WHITESPACE_TO_BLANK = 0,
   STR_WHITESPACE_TO_UNDERSCORE = 1,

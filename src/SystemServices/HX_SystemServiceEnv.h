@@ -24,8 +24,9 @@ class HX_UTILS_API HX_SystemServiceEnv : public HX_Allocated {
   HX_SystemCall* getSystemCall();
   HX_SystemFileIo* getSystemFileIo();
 
+  /// Deletes the service; the next demand creates a new one.
   void releaseSystemCall();
-  /// Closes the files that are still open.
+  /// The same, and closes the files that are still open.
   void releaseSystemFileIo();
 
   /// Forgets the services without releasing them.

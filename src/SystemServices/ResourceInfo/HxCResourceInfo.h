@@ -31,6 +31,7 @@ class HX_UTILS_API HxCResourceInfo : public HX_Allocated {
   ///     whatever the first one gave
   bool retrieveResourceInfo();
 
+  /// The parts of the product's, and of the file's, version.
   int getProdMajor() const { return m_Product.majorPart; }
   int getProdMinor() const { return m_Product.minorPart; }
   int getProdSub() const { return m_Product.subPart; }
@@ -46,6 +47,7 @@ class HX_UTILS_API HxCResourceInfo : public HX_Allocated {
   /// Always all four parts: "2.2.0.0".
   KyCXString* getFileVersion() const { return m_pFileVersion.get(); }
 
+  /// The texts of these names in the resource's first language.
   KyCXString* getLegalCopyright() const { return m_pLegalCopyright.get(); }
   KyCXString* getCompanyName() const { return m_pCompanyName.get(); }
   KyCXString* getProductName() const { return m_pProductName.get(); }
