@@ -1,4 +1,4 @@
-# Installs the library, moves what was installed to WORK/moved, and looks for
+# Installs the library, moves what was installed to PREFIX, and looks for
 # paths of this machine in it. The static library is that of the build tree
 # TREE, the shared one is built first.
 cmake_minimum_required(VERSION 3.25)
@@ -11,13 +11,13 @@ if(KIND STREQUAL "shared")
                     OUTPUT_QUIET)
   endforeach()
 endif()
-file(REMOVE_RECURSE ${WORK}/installed ${WORK}/moved)
+file(REMOVE_RECURSE ${WORK}/installed ${PREFIX})
 execute_process(COMMAND ${CMAKE_COMMAND} --install ${TREE}
                         --prefix ${WORK}/installed
                 COMMAND_ERROR_IS_FATAL ANY OUTPUT_QUIET)
-file(RENAME ${WORK}/installed ${WORK}/moved)
+file(RENAME ${WORK}/installed ${PREFIX})
 
-file(GLOB_RECURSE files ${WORK}/moved/*)
+file(GLOB_RECURSE files ${PREFIX}/*)
 foreach(file IN LISTS files)
   # What the debugger reads may name the sources, and only this build has it.
   if(KIND STREQUAL "static" AND file MATCHES "\\.a$|/hx_codegen$")

@@ -1,7 +1,8 @@
-# Builds the project package/ with what Install.cmake left in WORK/moved.
+# Builds the project package/ with what is installed in PREFIX. PROGRAM says
+# whether the program is there too.
 set(folder ${WORK}/package)
 foreach(step IN ITEMS
-    "--fresh;-G;${GENERATOR};-S;${CMAKE_CURRENT_LIST_DIR}/package;-B;${folder};-DCMAKE_CXX_COMPILER=${COMPILER};-DCMAKE_PREFIX_PATH=${WORK}/moved;-DKIND=${KIND};-DMODEL=${SOURCE}/host/models/cruise_control.json"
+    "--fresh;-G;${GENERATOR};-S;${CMAKE_CURRENT_LIST_DIR}/package;-B;${folder};-DCMAKE_CXX_COMPILER=${COMPILER};-DCMAKE_PREFIX_PATH=${PREFIX};-DPROGRAM=${PROGRAM};-DMODEL=${SOURCE}/host/models/cruise_control.json"
     "--build;${folder}")
   execute_process(COMMAND ${CMAKE_COMMAND} ${step} COMMAND_ERROR_IS_FATAL ANY
                   OUTPUT_QUIET)
