@@ -409,6 +409,9 @@ TEST_F(FloatingPointSupportTest, EveryBuildGivesTheSameBits) {
   const auto both = [](double (*operation)(double)) {
     return [operation](double a, double b) { return operation(a * b); };
   };
+  const auto logNearOne = [](double a, double b) {
+    return FPS_Log2(1.0 + std::remainder(a * b, 0.3));
+  };
   const Row rows[] = {
       {"modulo", FPS_SimulinkAlikeModulo, 0xA89686C2229AD553},
       {"remainder", FPS_SimulinkAlikeRem, 0xC9DF848BF21AA200},
@@ -421,6 +424,7 @@ TEST_F(FloatingPointSupportTest, EveryBuildGivesTheSameBits) {
       {"round up", both(FPS_RoundUp), 0xEDC1FD04D5FB9A9C},
       {"round down", both(FPS_RoundDown), 0x17404CFEF5FB9A9C},
       {"logarithm", both(log2Of), 0x8986B89898067F94},
+      {"logarithm near 1", logNearOne, 0x03D2D73F7887163C},
       {"integer logarithm", both(log2Int), 0xF70517B4A8633825},
       {"power of two", both(powerOf2), 0x3323F7B4A8633825},
       {"greater power of two", both(greaterPowerOf2), 0xA294CFCD09233825},
