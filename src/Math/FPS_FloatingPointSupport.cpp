@@ -90,26 +90,19 @@ double snap(double x) {
   return truncate(nearest < x ? x - 1.0 : x);
 }
 
-// Rounds toward zero a moderate magnitude that is not snapped to the integer
-// above it. The sign of its value decides where the integer nearest to a half
-// lies.
-double roundMagnitudeDown(double magnitude, bool isNegative) {
+// Rounds a moderate magnitude to an integer, with a snap to the near one. The
+// sign of its value decides where the integer nearest to a half lies.
+double roundMagnitude(double magnitude, bool isNegative, bool isUp) {
   const double cut = cutOff(magnitude);
   const double above = cut + 1.0;
-  if (!isNear(magnitude, above)) return cut;
   const double rest = magnitude - cut;
-  const bool isBelow = isNegative ? rest <= 0.5 : rest < 0.5;
-  return isBelow ? cut : cutOff(magnitude + 1.0);
-}
-
-// The same away from zero, and not snapped to the integer below it.
-double roundMagnitudeUp(double magnitude, bool isNegative) {
-  const double cut = cutOff(magnitude);
-  const double rest = magnitude - cut;
-  if (isNear(magnitude, cut) && (isNegative ? rest <= 0.5 : rest < 0.5)) {
-    return cut;
-  }
-  return cutOff(magnitude + 1.0);
+  const bool isBelowHalf = isNegative ? rest <= 0.5 : rest < 0.5;
+  const bool isSnapped =
+      isUp ? kDefaultTolerance > rest || kDefaultTolerance * magnitude > rest
+           : kDefaultTolerance * above > above - magnitude;
+  if (isUp ? isSnapped && isBelowHalf : !isSnapped || isBelowHalf) return cut;
+  // Adding 1 may round to the integer after the one above.
+  return magnitude + 1.0 < above + 1.0 ? above : above + 1.0;
 }
 
 double log2OfReal(double x) { return HX_NaturalLog(x) / kShortLn2; }
@@ -237,8 +230,8 @@ double FPS_Round(double x) { return truncate(x < 0.0 ? x - 0.5 : x + 0.5); }
 // Subtracting a magnitude from 0.0 keeps a zero positive.
 double FPS_RoundUp(double x) {
   if (isModerate(x)) {
-    return x < 0.0 ? 0.0 - roundMagnitudeDown(-x, true)
-                   : roundMagnitudeUp(x, false);
+    return x < 0.0 ? 0.0 - roundMagnitude(-x, true, false)
+                   : roundMagnitude(x, false, true);
   }
   if (isIntegerValue(x)) return snap(x);
   return truncate(x < 0.0 ? x : x + 1.0);
@@ -246,8 +239,8 @@ double FPS_RoundUp(double x) {
 
 double FPS_RoundDown(double x) {
   if (isModerate(x)) {
-    return x < 0.0 ? 0.0 - roundMagnitudeUp(-x, true)
-                   : roundMagnitudeDown(x, false);
+    return x < 0.0 ? 0.0 - roundMagnitude(-x, true, true)
+                   : roundMagnitude(x, false, false);
   }
   if (isIntegerValue(x)) return snap(x);
   return truncate(x < 0.0 ? x - 1.0 : x);
