@@ -1,5 +1,6 @@
 # Debian packages: what programs load, what compiles against it, the program.
-# script/package builds, installs, tries and removes them.
+# script/package builds, installs, tries and removes them. They want
+# BUILD_SHARED_LIBS and the prefix /usr.
 set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME hx-utils)
 set(CPACK_PACKAGE_VERSION ${PROJECT_VERSION})
