@@ -1,5 +1,6 @@
 # What doxygen reads instead of a header, line for line:
 # - the comment at the top is that of the file, and the examples in it are code;
+#   the comment of the class that the file is named after begins with it;
 # - a comment stands for all declarations from there to the next empty line or
 #   comment: they become a group that shares it;
 # - copying, moving and destroying are told by the comment of the class, and
@@ -61,6 +62,9 @@ depth == 0 && /^ *\/\/\/([^<]|$)/ && (count == 0 || ends) {
 }
 count && depth == 0 && (/^ *(\/\/([^\/]|$)|$|#|public:|private:|protected:|}|template.*(class|struct)|class|struct|enum|namespace|friend)/) {
   if (ends || /^ *(#|}|template.*(class|struct)|class|struct|enum|namespace)/) {
+    if (!ends && match(FILENAME, /[^\/]*$/) &&
+        $0 ~ "^class .*" substr(FILENAME, RSTART, RLENGTH - 2) " ?[:{]")
+      sub(/\/\/\//, "/// \\intro{" substr(FILENAME, RSTART) "}", lines[1])
     flush()
     out($0)
     next
