@@ -1,5 +1,6 @@
 #include "Naming/HX_NamingFixture.h"
 #include "platform/model/HxCSymbol.h"
+#include "support/HX_PlainTemplate.h"
 
 namespace {
 
@@ -16,41 +17,6 @@ class SubstitutionTest : public HX_NamingFixture {
   bool replaced = false;
 };
 
-std::string inCase(std::string text, int (*change)(int)) {
-  for (char& c : text) c = static_cast<char>(change(c));
-  return text;
-}
-
-// The substitution written plainly.
-std::string plainSubstitution(const std::string& form, const std::string& macro,
-                              const std::string& value, int kind) {
-  const std::string low = kind == 0 ? macro : inCase(macro, std::tolower);
-  const std::string high = kind == 0 ? macro : inCase(macro, std::toupper);
-  std::string result;
-  for (std::size_t i = 0; i < form.size();) {
-    if (form[i] != '$') {
-      result += form[i++];
-      continue;
-    }
-    std::string key = form.substr(i + 1, macro.size());
-    if (kind == 1) key = inCase(key, std::tolower);
-    if (key == low || key == high) {
-      result += kind == 2 && key != low ? inCase(value, std::toupper) : value;
-      i += macro.size() + 1;
-      continue;
-    }
-    std::size_t end = i + 2;
-    if (form.substr(i + 1, 1) == "(") end = form.find(')', i);
-    if (form.substr(i + 1, 1) == "(" && end != std::string::npos) ++end;
-    if (form.substr(i + 1, 1) == "E")
-      end += static_cast<std::size_t>(
-          HxCNamesTestAccess::dollarELength(form.c_str(), int(end)));
-    result += form.substr(i, end - i);
-    i = std::min(end, form.size());
-  }
-  return result;
-}
-
 TEST_F(SubstitutionTest, EveryShortTemplateIsSubstitutedAsPlainly) {
   const std::string alphabet = "$nN(E)";
   std::vector<std::string> forms{"$"};
@@ -61,7 +27,7 @@ TEST_F(SubstitutionTest, EveryShortTemplateIsSubstitutedAsPlainly) {
       for (const std::string& form : forms) {
         const auto how = static_cast<HxCNames::tagMacroKindEnum>(kind);
         ASSERT_EQ(substitute(form, macro, "aZ$n", how),
-                  plainSubstitution(form, macro, "aZ$n", kind))
+                  HX_PlainSubstitution(form, macro, "aZ$n", kind))
             << form << " by " << macro << " kind " << kind;
       }
     }

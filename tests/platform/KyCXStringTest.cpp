@@ -1,23 +1,12 @@
 #include "platform/strings/KyCXString.h"
 
 #include <climits>
-#include <random>
 
 #include "support/HX_TestFixture.h"
 
 namespace {
 
 using Units = std::u16string;
-
-// A random text of up to 60 units around the inline capacity, a third of them
-// with units above 255. Few different units make matches likely.
-Units randomUnits(std::mt19937& random) {
-  static const Units kAlphabet = u"ab_1 \tZ\u00E4<>\u20AC";
-  const std::size_t kinds = kAlphabet.size() - (random() % 3 == 0 ? 0 : 1);
-  Units units(random() % 4 == 0 ? random() % 60 : random() % 6, u'a');
-  for (char16_t& unit : units) unit = kAlphabet[random() % kinds];
-  return units;
-}
 
 KyCXString textOf(const Units& units) {
   const std::vector<unsigned short> copy(units.begin(), units.end());
@@ -29,154 +18,6 @@ Units unitsOf(const KyCXString& text) {
   for (int i = 0; i < text.length(); ++i)
     units += static_cast<char16_t>(text[i]);
   return units;
-}
-
-Units plainSub(const Units& units, int from, int to) {
-  Units part;
-  for (int i = std::max(from, 0); i <= to && i < static_cast<int>(units.size());
-       ++i)
-    part += units[static_cast<std::size_t>(i)];
-  return part;
-}
-
-int plainFind(const Units& units, const Units& text, int from) {
-  // No place becomes -1.
-  return static_cast<int>(units.find(text, static_cast<std::size_t>(from)));
-}
-
-Units plainReplace(Units units, const Units& what, const Units& by) {
-  for (std::size_t at = 0; !what.empty(); at += by.size()) {
-    at = units.find(what, at);
-    if (at == Units::npos) break;
-    units.replace(at, what.size(), by);
-  }
-  return units;
-}
-
-// Two texts and their plain models; each step changes or asks the first, with
-// the second or the first itself as argument.
-struct Walk {
-  std::mt19937 random;
-  KyCXString text[2];
-  Units plain[2];
-
-  explicit Walk(unsigned int seed) : random(seed) {}
-
-  void step() {
-    if (plain[0].size() > 500) text[0] = "", plain[0].clear();
-    const std::size_t other = random() % 2;
-    const KyCXString& argument = text[other];
-    const Units argumentUnits = plain[other];
-    const int from = static_cast<int>(random() % 50) - 5;
-    const int to = static_cast<int>(random() % 50) - 5;
-    const Units old = plain[0];
-    switch (random() % 11) {
-      case 0:
-        text[0] = argument, plain[0] = argumentUnits;
-        break;
-      case 1:
-        text[0] += argument, plain[0] += argumentUnits;
-        break;
-      case 2:
-        text[0] = text[0].sub(from, to), plain[0] = plainSub(old, from, to);
-        break;
-      case 3:
-        text[0].appendSub(argument, from, to);
-        plain[0] += plainSub(argumentUnits, from, to);
-        break;
-      case 4:
-        text[0].replace(argument, text[1]);
-        plain[0] = plainReplace(old, argumentUnits, plain[1]);
-        break;
-      case 5:
-        text[0].replace("a", text[0]).trim(true, true);
-        plain[0] = plainReplace(old, u"a", old);
-        while (!plain[0].empty() && plain[0][0] <= u' ') plain[0].erase(0, 1);
-        while (!plain[0].empty() && plain[0].back() <= u' ')
-          plain[0].pop_back();
-        break;
-      case 6: {
-        KyCXString moved(std::move(text[0]));
-        EXPECT_TRUE(text[0].isEmpty());
-        text[0] += 'x';
-        text[0] = std::move(moved);
-        break;
-      }
-      case 7:
-        std::swap(text[0], text[1]), std::swap(plain[0], plain[1]);
-        break;
-      case 8:
-        text[0] = text[0].cstring() + std::min(text[0].length(), 3);
-        plain[0] = plainSub(old, 3, INT_MAX - 1);
-        for (char16_t& unit : plain[0]) unit = unit > 0xFF ? u'?' : unit;
-        break;
-      default:
-        plain[0] = randomUnits(random), text[0] = textOf(plain[0]);
-    }
-  }
-
-  void check() {
-    EXPECT_EQ(unitsOf(text[0]), plain[0]);
-    std::string narrow;
-    for (char16_t unit : plain[0])
-      narrow += static_cast<char>(unit > 0xFF ? u'?' : unit);
-    EXPECT_EQ(text[0].cstring(), narrow);
-    const int from = static_cast<int>(random() % 4);
-    EXPECT_EQ(text[0].find(text[1], from), plainFind(plain[0], plain[1], from));
-    EXPECT_EQ(text[0].find('\xE4', from), plainFind(plain[0], u"\u00E4", from));
-    EXPECT_EQ(text[0].startsWith(text[1]), plain[0].starts_with(plain[1]));
-    EXPECT_EQ(text[0] == text[1], plain[0] == plain[1]);
-    EXPECT_EQ(text[0] < text[1], plain[0] < plain[1]);
-    EXPECT_EQ(text[0].compareWith(text[1]) > 0, plain[0] > plain[1]);
-    EXPECT_EQ(unitsOf(text[0] + text[1]), plain[0] + plain[1]);
-  }
-};
-
-TEST(CXStringTest, WalksAsThePlainTextDoes) {
-  const unsigned int seed = std::random_device()();
-  SCOPED_TRACE(testing::Message() << "seed " << seed);
-  Walk walk(seed);
-  for (int i = 0; i < 5000 && !testing::Test::HasFailure(); ++i) {
-    walk.step();
-    walk.check();
-  }
-}
-
-TEST(CXStringTest, DerivedTextsKeepTheirPromises) {
-  const unsigned int seed = std::random_device()();
-  SCOPED_TRACE(testing::Message() << "seed " << seed);
-  std::mt19937 random(seed);
-  for (int i = 0; i < 1000 && !testing::Test::HasFailure(); ++i) {
-    const KyCXString text = textOf(randomUnits(random));
-    SCOPED_TRACE(text.cstring());
-    for (bool collapse : {false, true}) {
-      KyCXString name(text);
-      name.makeCIdentifier(collapse);
-      EXPECT_EQ(name.isValidCIdentifier(), !text.isEmpty());
-      if (text.isValidCIdentifier()) {
-        EXPECT_EQ(name, text);
-      }
-    }
-
-    leda::array<KyCXString> parts;
-    text.split('_', parts);
-    KyCXString joined = parts[0];
-    for (int part = 1; part < parts.size(); ++part) joined += "_" + parts[part];
-    EXPECT_EQ(joined, text);
-    for (const KyCXString& part : parts) EXPECT_FALSE(part.contains("_"));
-
-    const int limit = static_cast<int>(random() % 40);
-    KyCXString shortened(text);
-    shortened.shortenString(limit, 2, '_', KyCXString::ePositionMiddle);
-    EXPECT_EQ(shortened.length(), std::min(limit, text.length()));
-    // The end tells derived names apart.
-    const int kept = limit > 2 ? (limit - 2) / 2 : limit;
-    EXPECT_EQ(shortened.sub(shortened.length() - kept, INT_MAX),
-              text.sub(text.length() - kept, INT_MAX));
-    if (text.length() <= limit) {
-      EXPECT_EQ(shortened, text);
-    }
-  }
 }
 
 KyCXString& toIdentifier(KyCXString& t) { return t.makeCIdentifier(false); }

@@ -1,0 +1,65 @@
+// The program run over an arbitrary document.
+#include <unistd.h>
+
+#include <filesystem>
+#include <fstream>
+#include <iostream>
+#include <iterator>
+#include <sstream>
+
+#include "fuzz/HX_Fuzz.h"
+
+/// The main() of hx_codegen under another name.
+extern "C" int HX_CodegenMain(int argc, const char* const* argv);
+
+namespace {
+
+namespace fs = std::filesystem;
+
+// Catches what is written to a stream while it lives.
+class Catch {
+ public:
+  explicit Catch(std::ostream& stream)
+      : m_Stream(stream), m_pOld(stream.rdbuf(m_Text.rdbuf())) {}
+  Catch(const Catch&) = delete;
+  Catch& operator=(const Catch&) = delete;
+  ~Catch() { m_Stream.rdbuf(m_pOld); }
+  std::string text() const { return m_Text.str(); }
+
+ private:
+  std::ostream& m_Stream;
+  std::ostringstream m_Text;
+  std::streambuf* m_pOld;
+};
+
+// In memory, and gone with the object.
+struct Folder {
+  Folder() { fs::create_directory(path); }
+  ~Folder() { fs::remove_all(path); }
+  fs::path path = "/dev/shm/hx_fuzz_" + std::to_string(getpid());
+};
+
+}  // namespace
+
+void HX_CheckDocument(HX_Bytes& bytes) {
+  static const Folder s_folder;
+  const fs::path model = s_folder.path / "model.json";
+  const fs::path out = s_folder.path / "out";
+  const std::string document = bytes.rest();
+  std::ofstream(model, std::ios::binary) << document;
+  const char* const arguments[] = {
+      "hx_codegen",      "generate", model.c_str(), "--keywords",
+      HX_KEYWORD_FOLDER, "--json",   "--out",       out.c_str()};
+
+  const Catch output(std::cout), errors(std::cerr);
+  const int code = HX_CodegenMain(std::size(arguments), arguments);
+  const std::string text = errors.text();
+  HX_Require(code >= 0 && code <= 2, "an exit code");
+  HX_Require(fs::exists(out) == (code == 0), "files if and only if it is done");
+  HX_Require(output.text().empty() == (code != 0), "the same for the output");
+  if (code == 2)
+    HX_Require(text.starts_with("hx_codegen: " + model.string() + ": ") &&
+                   text.find('\n') == text.size() - 1,
+               "one line that names the document: " + text);
+  fs::remove_all(out);
+}

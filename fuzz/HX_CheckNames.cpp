@@ -1,0 +1,303 @@
+// Names of an arbitrary model on their whole road from template to C name.
+#include <cmath>
+#include <cstdlib>
+#include <set>
+
+#include "NameSpace/HX_LimitedNameSpace.h"
+#include "NameSpace/HxCNameSpace.h"
+#include "NameSpace/HxCXStringIdServer.h"
+#include "Naming/HxCNames.h"
+#include "SourceRef/HxCDdSrcRef.h"
+#include "SourceRef/HxCStateflowSrcRef.h"
+#include "fuzz/HX_Fuzz.h"
+#include "platform/datadictionary/HX_DdTree.h"
+#include "platform/datatypes/HX_DataType.h"
+#include "platform/datatypes/HX_DataTypeServer.h"
+#include "platform/messages/HX_MessageHandler.h"
+#include "platform/model/HX_BdBlock.h"
+#include "platform/model/HX_Options.h"
+#include "platform/model/HX_StateflowBlock.h"
+#include "platform/model/HxCGlobal.h"
+#include "platform/model/HxCSymbol.h"
+#include "platform/model/SC_Chart.h"
+#include "platform/model/SC_State.h"
+#include "support/HX_PlainTemplate.h"
+
+namespace {
+
+using Id = HxCCIdentifier;
+
+// Blocks car / ctrl / gain and a chart block with an object, types of each
+// kind, and dictionary objects in two components.
+struct Model {
+  explicit Model(HX_Bytes& bytes)
+      : choices(bytes.line()),
+        car(bytes.text()),
+        ctrl(bytes.text(), &car),
+        gain(bytes.text(), &ctrl),
+        mode("Mode", &ctrl),
+        ivBlock(bytes.text()),
+        chart(bytes.text()),
+        chartState(1, 4, bytes.text(), &chart),
+        event(2, choices.number(), bytes.text()),
+        types{{HX_DataType(bytes.text())}, {HX_DataType(bytes.text())},
+              {HX_DataType("Array")},      {HX_DataType("unnamed")},
+              {HX_DataType("Bits")},       {HX_DataType("Unknown")}},
+        dd(HX_DdTree::instance().add(bytes.line())) {
+    HxCNames::boot();
+    HxCGlobal::setOptions(&options);
+    HxCGlobal::setDataTypeServer(&typeServer);
+    GLB_SetModelName(bytes.text());
+    GLB_SetSubsystemName(bytes.text());
+    options.setLimitVariableNameLength(choices.flag());
+    options.setHxSystemID(bytes.text());
+    ctrl.setSubsystem(bytes.text(), static_cast<unsigned>(choices.number()));
+    gain.setNamedThroughParent(choices.flag());
+    mode.setChartState(choices.flag() ? &chartState : nullptr);
+    for (SC_Model* object : {static_cast<SC_Model*>(&chartState), &event}) {
+      object->setContainingBlock(&mode);
+      if (choices.flag()) SC_ModelAccess::setChartState(object, &chartState);
+    }
+    event.setHierarchy(bytes.text());
+    types[0].setCut(bytes.text()).setBase();
+    types[1].setDerivedFrom(choices.flag() ? &types[0] : nullptr);
+    types[2].setElement(&types[choices.below(2)]);
+    types[3].setUnnamed(choices.flag() ? HX_DataType::eUnnamedStruct
+                                       : HX_DataType::eUnnamedEnum,
+                        choices.flag());
+    types[4].setBitfield();
+    if (choices.flag())
+      typeServer.getBaseServer()->setBitfieldBaseType(&types[0]);
+    HX_DdTree& tree = HX_DdTree::instance();
+    for (const std::string component : {"/Pool/C1", "/Pool/C2"}) {
+      tree.add(component, HX_DdTree::kSoftwareComponent);
+      const unsigned long list = tree.add(component + "/RelatedVariables");
+      if (choices.flag()) tree.addReference(list, "Variable", bytes.line());
+    }
+  }
+  Model(const Model&) = delete;
+  Model& operator=(const Model&) = delete;
+  ~Model() {
+    HxCGlobal::setOptions(nullptr);
+    HxCGlobal::setDataTypeServer(nullptr);
+    HX_DdTree::instance().clear();
+    HxCNames::shutdown();
+    HX_MessageHandler::instance().clear();
+  }
+
+  HX_Bytes choices;
+  HX_OptionsExt options;
+  HX_DataTypeServer typeServer;
+  HX_Block car, ctrl, gain;
+  HX_StateflowBlock mode;
+  HX_BdBlock ivBlock;
+  SC_Chart chart;
+  SC_State chartState;
+  SC_Model event;
+  HX_DataType types[6];
+  HxCDdSrcRef dd;
+};
+
+std::size_t messageCount() {
+  return HX_MessageHandler::instance().messages().size();
+}
+
+KyCXString bothNames(const Id& id) {
+  return id.getCookedName(Id::eFormalName) + ":" +
+         id.getCookedName(Id::eActualName);
+}
+
+// What one name is for.
+struct Item {
+  Item(Model& model, HX_Bytes& bytes)
+      : isFormalActive(model.choices.flag()),
+        label(bytes.text()),
+        x(bytes.text()) {
+    HX_Bytes& choices = model.choices;
+    const HxCSrcRef* sources[] = {model.gain.getSrcRef(), nullptr,
+                                  model.event.getStateflowSrcRef(),
+                                  model.mode.getSrcRef(), &model.dd};
+    source = sources[choices.below(5)];
+    dd = choices.flag() ? &model.dd : nullptr;
+    ivBlock = choices.flag() ? &model.ivBlock : nullptr;
+    const int kind = choices.below(7);
+    type = kind == 0 ? nullptr : &model.types[kind - 1];
+    if (choices.flag()) return;
+    for (unsigned int* bits : {&retained, &provisional})
+      for (int shift = 0; shift < 24; shift += 8)
+        *bits |= static_cast<unsigned>(choices.number()) << shift;
+  }
+
+  Id begin(const KyCXString& form) const {
+    Id id(form);
+    id.setSourceRef(source);
+    id.setDdSourceRef(dd);
+    id.setSourceIVBlock(ivBlock);
+    id.setSignalLabel(label);
+    id.setDollarXValue(x);
+    if (!isFormalActive) id.activateActualName();
+    return id;
+  }
+  bool expand(HxCNames& names, Id& id) const {
+    return names.createNameFromForm(id, type, retained, provisional, false);
+  }
+
+  bool isFormalActive;
+  KyCXString label, x;
+  const HxCSrcRef* source;
+  const HxCSrcRef* dd;
+  HX_BdBlock* ivBlock;
+  HX_DataType* type;
+  unsigned int retained = 0;
+  unsigned int provisional = 0;
+};
+
+// A name is the sum of what its literal texts and macros give by themselves.
+void checkSum(const Item& item, const std::string& form) {
+  if (form.empty()) return;  // stands for a default
+  HxCNames names;
+  KyCXString sum;
+  bool complete = true, changeable = false;
+  HX_MessageHandler::instance().clear();
+  for (std::size_t at = 0, end = 0; at < form.size(); at = end) {
+    end = HX_PlainTokenEnd(form, at);
+    const std::string token = form.substr(at, end - at);
+    Id part = item.begin((token + ":" + token).c_str());
+    complete &= item.expand(names, part);
+    sum += part.getCookedName(Id::eFormalName);
+    changeable |= part.getIdentifierChangeable(Id::eFormalName);
+  }
+  const std::size_t messages = messageCount();
+  Id whole = item.begin((form + ":" + form).c_str());
+  HX_Require(item.expand(names, whole) == complete, "complete as the parts");
+  HX_Require(whole.getCookedName(Id::eFormalName) == sum,
+             "the parts give " + std::string(sum.cstring()));
+  HX_Require(whole.getIdentifierChangeable(Id::eFormalName) == changeable &&
+                 messageCount() == 2 * messages,
+             "changeable as the parts, with their messages");
+}
+
+void checkSubstitution(int kind, const Item& item, std::string form) {
+  const std::string macro = item.label.cstring();
+  std::string value = item.x.cstring();
+  std::erase(form, ':');
+  std::erase(value, ':');
+  Id id((form + ":").c_str());
+  HxCNames().substAllDollarZByValue(
+      id, macro.c_str(), Id(value.c_str()),
+      static_cast<HxCNames::tagMacroKindEnum>(kind));
+  const std::string plain = HX_PlainSubstitution(form, macro, value, kind);
+  HX_Require(id.getCookedName(Id::eFormalName) == plain.c_str(), plain);
+}
+
+void substitute(Model& model, HX_Bytes& bytes, const Item& item, Id& id) {
+  HxCNames names;
+  if (model.choices.flag()) {
+    HxCSymbol symbol(item.label, 1 + model.choices.below(3), item.type);
+    symbol.setDollarX(item.x.cstring());
+    names.handleSymbolNameMacro(id, &symbol);
+  }
+  if (!model.choices.flag()) return;
+  const double period = std::fabs(std::strtod(bytes.line().c_str(), nullptr));
+  const double offset = std::strtod(bytes.line().c_str(), nullptr);
+  names.replaceMultirateTimeName(id, period, offset, model.choices.flag());
+  names.replaceMultirateTaskISRName(id, item.label, id, false);
+  names.replaceMultirateMsgVarName(id, item.x);
+}
+
+// Expanded and made a C name of at most the length allowed.
+void checkRoad(Model& model, const Item& item, Id& id) {
+  HxCNames names;
+  const bool isFile = model.choices.below(8) == 7;
+  const auto expand = [&] {
+    return isFile ? names.handleFileNameMacro(id, item.isFormalActive)
+                  : item.expand(names, id);
+  };
+  expand();
+  const KyCXString once = bothNames(id);
+  const std::size_t messages = messageCount();
+  HX_Require(expand() && bothNames(id) == once && messageCount() == messages,
+             "a name expanded in full is left alone");
+  id.makeCIdentifier();
+  id.adaptSize();
+  const bool mayBeLong = !id.getIdentifierChangeable(Id::eActiveName) ||
+                         !model.options.getLimitVariableNameLength();
+  for (const auto type : {Id::eFormalName, Id::eActualName}) {
+    const KyCXString& name = id.getCookedName(type);
+    HX_Require(name.isEmpty() || name.isValidCIdentifier(), "an identifier");
+    HX_Require(mayBeLong || name.length() <= HxCSymbol::sm_MaxNameLength,
+               "not too long");
+  }
+  Id again = id;
+  again.makeCIdentifier();
+  again.adaptSize();
+  HX_Require(bothNames(again) == bothNames(id), "a C name is left alone");
+}
+
+// A file and a body in it, and a flat set: every name defined differs from the
+// words and, where it can be seen, from the others.
+struct Scopes {
+  Scopes() {
+    ids.boot();
+    body.newScope(file.newEnv());
+    KyCXString word("if");
+    flat.add(word);
+  }
+  Scopes(const Scopes&) = delete;
+  Scopes& operator=(const Scopes&) = delete;
+  ~Scopes() {
+    delete file.getScope();
+    ids.shutdown();
+  }
+
+  void define(HxCNameSpace& scope, const KyCXString& wanted, bool isLimited) {
+    HxCNames names;
+    KyCXString name = wanted, variant = wanted;
+    for (int i = 0;
+         !names.isStringValidCVariableName(name) || scope.stringInEnv(name);
+         ++i) {
+      name = wanted;
+      names.appendSuffix(name, i);
+    }
+    flat.addUnique(variant);
+    for (const KyCXString& given : {name, variant}) {
+      if (given == wanted) continue;
+      HX_Require(given.isValidCIdentifier() && !(given == "if"), "derived");
+      HX_Require(!isLimited || given.length() <= HxCSymbol::sm_MaxNameLength,
+                 "derived: not too long");
+    }
+    HX_Require(taken.insert(variant.cstring()).second, "given once");
+    int key = -1;
+    scope.createIdn(name, key);
+    HX_Require(scope.defineString(name) && !scope.defineString(name) &&
+                   scope.keyInScope(key) && name == ids.getString(key),
+               "defined once, and read back");
+  }
+
+  HxCXStringIdServer ids;
+  HxCNameSpace file{&ids}, body{&ids};
+  HX_LimitedNameSpace flat;
+  std::set<std::string> taken;
+};
+
+}  // namespace
+
+// The first line chooses, then come the texts of the model and of each name.
+void HX_CheckNames(HX_Bytes& bytes) {
+  constexpr int kNames = 40;
+  Model model(bytes);
+  Scopes scopes;
+  for (int i = 0; i == 0 || (i < kNames && !bytes.isEmpty()); ++i) {
+    const KyCXString text = bytes.text();
+    const std::string form = text.cstring();
+    const Item item(model, bytes);
+    checkSum(item, form.substr(0, form.find(':')));
+    checkSubstitution(model.choices.below(3), item, form);
+    Id id = item.begin(text);
+    substitute(model, bytes, item, id);
+    checkRoad(model, item, id);
+    scopes.define(model.choices.flag() ? scopes.file : scopes.body,
+                  id.getCookedName(Id::eActualName),
+                  model.options.getLimitVariableNameLength());
+  }
+}

@@ -1,0 +1,75 @@
+// Checks that must hold for every input, and the bytes that drive them.
+//
+// A check builds its case from the bytes, does the work and compares it with
+// a plain form. The fuzzers feed a check what the coverage suggests, the tests
+// the corpus and random changes of it.
+//
+//   void HX_CheckSplit(HX_Bytes& bytes) {
+//     const KyCXString text = bytes.text();
+//     ...
+//     HX_Require(joined == text, "split texts joined give the text");
+//   }
+
+#ifndef FUZZ_HX_FUZZ_H
+#define FUZZ_HX_FUZZ_H
+
+#include <algorithm>
+#include <stdexcept>
+#include <string>
+#include <utility>
+
+#include "platform/strings/KyCXString.h"
+
+/// Read from the front; an end gives zeros and empty texts.
+class HX_Bytes {
+ public:
+  explicit HX_Bytes(std::string bytes) : m_Bytes(std::move(bytes)) {}
+
+  bool isEmpty() const { return m_At >= m_Bytes.size(); }
+  /// One byte.
+  int number() {
+    return isEmpty() ? 0 : static_cast<unsigned char>(m_Bytes[m_At++]);
+  }
+  int below(int limit) { return number() % limit; }
+  bool flag() { return number() % 2 != 0; }
+  std::string line() { return upTo('\n'); }
+  /// A line; its bytes from 0xF8 on stand for the units from 0xFFF8 on.
+  KyCXString text() {
+    KyCXString text;
+    for (const char c : line()) {
+      const auto unit = static_cast<unsigned char>(c);
+      text.appendUnit(
+          static_cast<unsigned short>(unit < 0xF8 ? unit : unit | 0xFF00));
+    }
+    return text;
+  }
+  std::string rest() { return upTo(-1); }
+
+ private:
+  std::string upTo(int end) {
+    const std::size_t start = std::min(m_At, m_Bytes.size());
+    m_At = end < 0 ? std::string::npos
+                   : m_Bytes.find(static_cast<char>(end), start);
+    const std::string part = m_Bytes.substr(start, m_At - start);
+    if (m_At != std::string::npos) ++m_At;
+    return part;
+  }
+
+  std::string m_Bytes;
+  std::size_t m_At = 0;
+};
+
+/// Ends the check if \p holds is false.
+inline void HX_Require(bool holds, const std::string& claim) {
+  if (!holds) throw std::logic_error("does not hold: " + claim);
+}
+
+// The checks; each stands in a source of its own.
+void HX_CheckDocument(HX_Bytes& bytes);
+void HX_CheckEnvironment(HX_Bytes& bytes);
+void HX_CheckMessages(HX_Bytes& bytes);
+void HX_CheckNames(HX_Bytes& bytes);
+void HX_CheckParser(HX_Bytes& bytes);
+void HX_CheckString(HX_Bytes& bytes);
+
+#endif  // FUZZ_HX_FUZZ_H
