@@ -430,6 +430,13 @@ TEST_F(DependencySortingTest, WithoutMemoryTheSortFails) {
     EXPECT_FALSE(none.sort());
   }
   EXPECT_EQ(controller.liveBlocks(), 0);
+  HX_WithoutEachBlock("sort", [] {
+    HxCSsNode first("a"), second("b");
+    HxCDependencySorting sorter;
+    for (HxCDepSortNode* node : {&first, &second}) sorter.add(node);
+    sorter.addDependency(&second, &first);
+    return sorter.sort() && sorter.getNodes()[0] == &second;
+  });
 }
 
 TEST_F(DependencySortingTest, NodesKeepTheOrdinalOfTheCaller) {

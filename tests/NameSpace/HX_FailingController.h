@@ -9,9 +9,6 @@
 
 class HX_FailingController : public HX_CountingController {
  public:
-  /// Refuses all blocks until the first setPercent().
-  HX_FailingController() = default;
-
   /// Refuses that share of the blocks, chosen at random.
   void setPercent(unsigned percent, unsigned seed) {
     m_Percent = percent;
@@ -24,7 +21,7 @@ class HX_FailingController : public HX_CountingController {
   }
 
  private:
-  unsigned m_Percent = 100;
+  unsigned m_Percent = 0;
   std::mt19937 m_Random;
 };
 

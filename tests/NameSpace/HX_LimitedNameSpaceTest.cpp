@@ -6,7 +6,6 @@
 #include <random>
 #include <sstream>
 
-#include "NameSpace/HX_FailingController.h"
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
 #include "platform/model/HxCSymbol.h"
@@ -177,25 +176,6 @@ TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
       EXPECT_EQ(memory.liveBlocks(), 0);
     }
   }
-}
-
-TEST_F(LimitedNameSpaceTest, StaysSoundWithoutMemory) {
-  HX_FailingController memory;
-  memory.setPercent(20, 3);
-  {
-    HX_LimitedNameSpace names;
-    for (int i = 0; i < 500; ++i) {
-      KyCXString s(i % 5 == 0 ? HX_29 "3456" : "x"), before(s);
-      m_Options.setLimitVariableNameLength(i % 2 == 0);
-      bool derived = false;
-      const bool isTaken = names.isDefined(s);
-      names.deriveUniqueString(s, derived);
-      EXPECT_EQ(derived, isTaken);
-      EXPECT_FALSE(names.isDefined(s));
-      names.addUnique(before);
-    }
-  }
-  EXPECT_EQ(memory.liveBlocks(), 0);
 }
 
 }  // namespace

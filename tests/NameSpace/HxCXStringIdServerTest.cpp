@@ -6,7 +6,6 @@
 #include <map>
 #include <random>
 
-#include "NameSpace/HX_FailingController.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -111,27 +110,6 @@ TEST_F(StringIdServerTest, DownServerAssertsAndGivesNothing) {
   EXPECT_EQ(id, 5);
   EXPECT_EQ(messages().size(), 4U);
   EXPECT_THAT(messages(), testing::Each(StartsWith("7/3 ")));
-}
-
-TEST_F(StringIdServerTest, StaysSoundWithoutMemory) {
-  HX_FailingController memory;
-  EXPECT_TRUE(m_Ids.boot());
-  EXPECT_FALSE(m_Ids.isUp());
-  memory.setPercent(30, 7);
-  while (!m_Ids.isUp()) m_Ids.boot();
-  PlainServer plain;
-  int failures = 0;
-  for (int i = 0; i < 3000; ++i) {
-    const KyCXString s(i % 1000, false, true);
-    int id = -1;
-    if (!m_Ids.findOrAdd(s, id))
-      ++failures;
-    else
-      ASSERT_EQ(id, plain.getId(s)) << i;
-  }
-  EXPECT_GT(failures, 100);
-  m_Ids.shutdown();
-  EXPECT_EQ(memory.liveBlocks(), 0);
 }
 
 }  // namespace

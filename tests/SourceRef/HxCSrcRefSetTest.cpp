@@ -132,9 +132,14 @@ TEST_F(SrcRefSetTest, ServerOwnsEachReferenceItHandsOut) {
     EXPECT_EQ(controller.liveBlocks(), 3);
   }
   EXPECT_EQ(controller.liveBlocks(), 0);
-  controller.fail();
-  HxCSrcRefServer server;
-  EXPECT_EQ(server.getSrcRef(), nullptr);
+  HX_WithoutEachBlock("collect references", [] {
+    const HX_Block block("b");
+    HxCSrcRefServer references;
+    HxCSrcRefSet set(block.getSrcRef());
+    for (int i = 0; i < 3; ++i) set.addSrcRef(references.getSrcRef());
+    const std::unique_ptr<HxCSrcRef> clone(HxCDdSrcRef(1).clone());
+    return set.getSrcRefCnt() == 4 && clone;
+  });
 }
 
 TEST_F(SrcRefSetTest, ServerSortsTheReferencesOfASet) {

@@ -125,6 +125,10 @@ TEST_F(ResourceInfoTest, FailuresAreTracedWithTheirPlaceAndLeakNothing) {
   EXPECT_EQ(places[0], places[1]);
   EXPECT_NE(places[1], places[2]);
   EXPECT_NE(places[2], places[3]);
+  HX_WithoutEachBlock("read", [] {
+    HxCResourceInfo info;
+    return retrieves(info, resource());
+  });
 }
 
 TEST_F(ResourceInfoTest, WithoutTheModuleTheExecutableIsAsked) {

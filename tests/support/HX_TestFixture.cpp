@@ -44,7 +44,8 @@ void HX_TestFixture::reset() {
 }
 
 void* HX_CountingController::allocMemBlock(unsigned long size) {
-  if (m_Fails) return nullptr;
+  const int number = m_Asked++;
+  if (number >= m_FirstFailure && number <= m_LastFailure) return nullptr;
   ++m_Allocated;
   return HxCMemController::allocMemBlock(size);
 }
@@ -52,4 +53,23 @@ void* HX_CountingController::allocMemBlock(unsigned long size) {
 void HX_CountingController::freeMemBlock(void* block) {
   if (block != nullptr) ++m_Freed;
   HxCMemController::freeMemBlock(block);
+}
+
+void HX_WithoutEachBlock(const char* why, bool (*job)()) {
+  for (const bool allAfter : {false, true}) {
+    for (int missing = 0;; ++missing) {
+      SCOPED_TRACE(testing::Message()
+                   << why << " without block " << missing
+                   << (allAfter ? " and all later ones" : ""));
+      HX_CountingController memory;
+      memory.failAt(missing, allAfter);
+      const bool done = job();
+      ASSERT_EQ(memory.liveBlocks(), 0) << "leaks";
+      if (memory.asked() <= missing) {
+        EXPECT_TRUE(done && missing > 0);
+        break;
+      }
+      EXPECT_FALSE(done && missing == 0);
+    }
+  }
 }

@@ -6,6 +6,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <climits>
 #include <cstdint>
 #include <ostream>
 #include <string>
@@ -52,14 +53,30 @@ class HX_CountingController : public HxCMemController {
 
   int liveBlocks() const { return m_Allocated - m_Freed; }
   int allocated() const { return m_Allocated; }
+  /// Allocations asked for, failed ones included.
+  int asked() const { return m_Asked; }
   /// From now on every allocation fails.
-  void fail() { m_Fails = true; }
+  void fail() { failAt(m_Asked, true); }
+  /// The allocation with this number (the first is 0) fails, with \p allAfter
+  /// all later ones as well.
+  void failAt(int number, bool allAfter) {
+    m_FirstFailure = number;
+    m_LastFailure = allAfter ? INT_MAX : number;
+  }
 
  private:
+  int m_Asked = 0;
   int m_Allocated = 0;
   int m_Freed = 0;
-  bool m_Fails = false;
+  int m_FirstFailure = INT_MAX;
+  int m_LastFailure = -1;
 };
+
+/// Runs \p job again and again: without the first block that it asks for, then
+/// without the second, until none was missing; then the same without that block
+/// and all later ones. It must return all blocks each time, say false without
+/// its first block, and true at last.
+void HX_WithoutEachBlock(const char* why, bool (*job)());
 
 /// Installed while it lives; its time stands still until it is set.
 class HX_ManualClock : public HX_ClockSource {
