@@ -1,0 +1,95 @@
+// What the program does where it cannot write: one line, exit code 2, and
+// nothing is left behind.
+#include <gmock/gmock.h>
+
+#include <set>
+
+#include "host/HX_HostProgram.h"
+
+namespace fs = std::filesystem;
+using testing::HasSubstr;
+
+namespace {
+
+struct FaultCase {
+  const char* why;
+  const char* command;  // for the shell, see below
+  const char* message;
+};
+
+// $P is the program, $M the demo model, $B a document of which the name map
+// fills more than a pipe, $f an empty file, $d an empty folder, $p a pipe, $n a
+// new name.
+const FaultCase kFaults[] = {
+    {"full device", "$P names $M >/dev/full", "standard output"},
+    {"full device for the name map",
+     "$P generate $M --json --out $n >/dev/full", "standard output"},
+    {"full device for the summary", "$P generate $M --out $n >/dev/full",
+     "standard output"},
+    {"closed output", "$P names $M >&-", "standard output"},
+    {"closed output for the help", "$P --help >&-", "standard output"},
+    {"reader that leaves", "head -c 1 <$p >/dev/null & $P names $B --json >$p",
+     "standard output"},
+    {"file in place of the folder", "$P generate $M --out $f",
+     "cannot be written: "},
+    {"file on the way to the folder", "$P generate $M --out $f/a/b",
+     "cannot be written: "},
+    {"folder where no one may write", "$P generate $M --out /proc/hx/out",
+     "cannot be written: "},
+    {"profile where no one may write", "$P names $M --profile /proc/hx", ""},
+    {"files may not grow", "ulimit -f 4; $P generate $M --out $n/o",
+     "cannot be written: File too large"},
+    {"files may not grow in a folder", "ulimit -f 4; $P generate $M --out $d",
+     "cannot be written: File too large"},
+    {"folder removed between writing and placing",
+     "{ head -c 1; rm -rf $n; cat; } <$p >/dev/null & "
+     "$P generate $B --json --out $n >$p",
+     "cannot be written: "},
+    {"full disk",
+     "unshare -m sh -c 'mount -t tmpfs -o size=16k none $d && $P generate $M "
+     "--out $d; code=$?; ls -A $d; exit $code'",
+     "cannot be written: No space left"},
+    {"read-only folder",
+     "unshare -m sh -c 'mount --bind -o ro $d $d && $P generate $M --out $d'",
+     "cannot be written: Read-only"},
+    {"working folder removed", "cd $d; mkdir x; cd x; rmdir ../x; $P names $M",
+     ""},
+};
+
+TEST(FaultTest, OneLineTellsWhatCannotBeWrittenAndNothingIsLeft) {
+  const fs::path folder = HX_ScratchFolder();
+  const std::string big = (folder / "big.json").string();
+  const std::string work = (folder / "work").string();
+  HX_WriteText(big, HX_RunCodegen("synthesize --blocks 400").out);
+  const bool mayMount =
+      HX_RunCommand("unshare -m mount -t tmpfs none " + folder.string()).code ==
+      0;
+  for (const FaultCase& row : kFaults) {
+    SCOPED_TRACE(row.why);
+    if (!mayMount &&
+        std::string(row.command).find("mount") != std::string::npos) {
+      GTEST_LOG_(INFO) << "may not mount, skipped: " << row.why;
+      continue;
+    }
+    fs::remove_all(work);
+    HX_RunCommand("mkdir -p " + work + "/d; cd " + work + "; : >f; mkfifo p");
+    const HX_ProgramResult result = HX_RunCommand(
+        "(export P='" HX_CODEGEN_COMMAND "' M='" HX_DEMO_MODEL "' B='" + big +
+        "' d=" + work + "/d f=" + work + "/f p=" + work + "/p n=" + work +
+        "/n; " + row.command + ")");
+    EXPECT_EQ(2, result.code);
+    EXPECT_EQ("", result.out);
+    // After the messages about the model.
+    const std::size_t line = result.err.rfind("hx_codegen: ");
+    ASSERT_NE(line, std::string::npos) << result.err;
+    EXPECT_EQ(result.err.find("hx_codegen: "), line) << result.err;
+    EXPECT_EQ(result.err.find('\n', line), result.err.size() - 1);
+    EXPECT_THAT(result.err.substr(line), HasSubstr(row.message));
+    std::set<std::string> left;
+    for (const auto& entry : fs::recursive_directory_iterator(work))
+      left.insert(entry.path().filename());
+    EXPECT_THAT(left, testing::ElementsAre("d", "f", "p"));
+  }
+}
+
+}  // namespace
