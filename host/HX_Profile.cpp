@@ -1,7 +1,6 @@
 #include "host/HX_Profile.h"
 
 #include <fstream>
-#include <nlohmann/json.hpp>
 
 #include "Trace/HxCTransformationTracer.h"
 #include "host/HX_Version.h"
@@ -52,23 +51,21 @@ void HX_Profile::finish() {
   HX_StopWatch::endStopWatches();
   HxCTransformationTracer::shutdown();
 
-  nlohmann::ordered_json events = nlohmann::ordered_json::array();
-  for (const Event& event : m_Events)
-    events.push_back({{"name", event.name},
-                      {"ph", "X"},
-                      {"ts", event.begin - m_Events.front().begin},
-                      {"dur", event.duration},
-                      {"pid", 1},
-                      {"tid", 1}});
   std::ofstream("HX_Trace.json", std::ios::binary)
-      << nlohmann::ordered_json{{"traceEvents", events}}.dump(1) << '\n';
+      << nlohmann::ordered_json{{"traceEvents", m_Events}}.dump(1) << '\n';
 }
 
 void HX_Profile::runEnded(const char* name, std::int64_t begin,
                           std::int64_t duration) {
   // A phase is both a run time and, around it, a stop watch: shown once.
-  if (!m_Events.empty() && m_Events.back().name == name) m_Events.pop_back();
-  m_Events.push_back({name, begin, duration});
+  if (!m_Events.empty() && m_Events.back()["name"] == name)
+    m_Events.erase(m_Events.size() - 1);
+  m_Events.push_back({{"name", name},
+                      {"ph", "X"},
+                      {"ts", begin},
+                      {"dur", duration},
+                      {"pid", 1},
+                      {"tid", 1}});
 }
 
 HX_Profile::Phase::Phase(HX_Profile& profile, const char* name)

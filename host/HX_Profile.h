@@ -13,8 +13,8 @@
 #include <cstdint>
 #include <filesystem>
 #include <list>
+#include <nlohmann/json.hpp>
 #include <string>
-#include <vector>
 
 #include "Diagnostics/HX_StopWatch.h"
 #include "Diagnostics/HX_TimingListener.h"
@@ -57,19 +57,13 @@ class HX_Profile : private HX_TimingListener {
   };
 
  private:
-  struct Event {
-    std::string name;
-    std::int64_t begin;     // microseconds
-    std::int64_t duration;  // microseconds
-  };
-
   void runEnded(const char* name, std::int64_t begin,
                 std::int64_t duration) override;
 
   bool m_IsOn;
   HxCDebugServer m_Server;
   std::list<HX_StopWatch> m_Watches;  // stay registered until the report
-  std::vector<Event> m_Events;
+  nlohmann::ordered_json m_Events = nlohmann::ordered_json::array();
 };
 
 #endif  // HOST_HX_PROFILE_H
