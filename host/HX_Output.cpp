@@ -41,7 +41,8 @@ HX_Output::~HX_Output() {
   std::error_code error;
   for (const std::string& name : m_Moved) {
     fs::rename(m_Old / name, m_Folder / name, error);
-    if (error) fs::remove(m_Folder / name, error);  // there was no old one
+    if (!error || fs::exists(m_New / name, error)) continue;
+    fs::remove(m_Folder / name, error);  // there was no old one
   }
   m_Files.clear();
   fs::remove_all(m_Temporary, error);
@@ -86,12 +87,12 @@ void HX_Output::commit() {
     const fs::path path = m_Folder / name;
     if (fs::exists(path, error)) {
       fs::create_hard_link(path, m_Old / name, error);
-      if (error) fs::copy_file(path, m_Old / name, error);
+      if (error) fs::rename(path, m_Old / name, error);  // no links here
       if (error) fail(path, error);
     }
+    m_Moved.push_back(name);
     fs::rename(m_New / name, path, error);
     if (error) fail(path, error);
-    m_Moved.push_back(name);
   }
   m_Moved.clear();
 }
