@@ -93,7 +93,7 @@ std::string indented(const std::string& json, const std::string& indent) {
   return text;
 }
 
-// An object field by field: as a whole it takes four times as long.
+// Field by field: to build the object first takes half as long again.
 void writeJson(std::ostream& out, const HX_Name& name) {
   ordered_json sources = ordered_json::array();
   name.sources.forEach(
@@ -125,15 +125,12 @@ std::string csvField(const std::string& text) {
   return quoted + '"';
 }
 
-std::vector<std::string> typeNames(const HX_RunResult& result) {
+template <class Item>
+std::vector<std::string> namesOf(const std::vector<const Item*>& items,
+                                 std::string Item::*name) {
   std::vector<std::string> names;
-  for (const HX_TypeItem* type : result.types) names.push_back(type->name);
-  return names;
-}
-
-std::vector<std::string> variableNames(const HX_RunResult& result) {
-  std::vector<std::string> names;
-  for (const HX_Name* name : result.variables) names.push_back(name->actual);
+  names.reserve(items.size());
+  for (const Item* item : items) names.push_back(item->*name);
   return names;
 }
 
@@ -174,8 +171,8 @@ void HX_WriteTable(std::ostream& out, const HX_RunResult& result) {
     for (const HX_Finding& finding : name.findings)
       out << "    " << lineOf(finding, name.sourcePath) << '\n';
   }
-  writeOrder(out, "Types", typeNames(result));
-  writeOrder(out, "Variables", variableNames(result));
+  writeOrder(out, "Types", namesOf(result.types, &HX_TypeItem::name));
+  writeOrder(out, "Variables", namesOf(result.variables, &HX_Name::actual));
   for (const HX_Finding& finding : result.findings)
     out << '\n' << lineOf(finding, "") << '\n';
 }
@@ -188,9 +185,10 @@ void HX_WriteJson(std::ostream& out, const HX_RunResult& result) {
     writeJson(out, *name);
     separator = ",\n";
   }
-  const ordered_json rest{{"types", typeNames(result)},
-                          {"variables", variableNames(result)},
-                          {"messages", asJson(result.findings)}};
+  const ordered_json rest{
+      {"types", namesOf(result.types, &HX_TypeItem::name)},
+      {"variables", namesOf(result.variables, &HX_Name::actual)},
+      {"messages", asJson(result.findings)}};
   out << (result.names.empty() ? "]," : "\n  ],") << rest.dump(2).substr(1)
       << '\n';  // its brace is there already
 }
