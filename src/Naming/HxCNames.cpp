@@ -26,6 +26,7 @@ namespace {
 constexpr char kErrorCode[] = __FILE__ "_";
 
 constexpr int kLongForm = 40;
+constexpr unsigned int kNone = 0;  // of the macros is retained
 
 enum class Follows { eNo, eAsIs, eChangeable };
 
@@ -37,8 +38,7 @@ Follows followsFormal(const KyCXString& actual, const KyCXString& formal) {
   if (actual.startsWith(formal) && actual[length] == '$' &&
       actual[length + 1] == 'R')
     return Follows::eChangeable;
-  if (actual[0] == '$' && actual[1] == 'R' &&
-      actual.sub(2, length + 1) == formal)
+  if (actual.startsWith("$R") && actual.sub(2, length + 1) == formal)
     return Follows::eChangeable;
   return Follows::eNo;
 }
@@ -304,16 +304,17 @@ int HxCNames::expandDollarD(Scan& scan) {
                                      context.ddName);
   } else if (context.sfObject != nullptr) {
     scan.result += "DD_";
-    evaluateSFObjectIDMacro(scan.result, 0, 0, context.sfObject,
+    evaluateSFObjectIDMacro(scan.result, kNone, kNone, context.sfObject,
                             context.systemId, context.changeable);
     scan.result += "_";
-    evaluateSFObjectNameMacro(scan.result, 0, 0, context.sfObject);
+    evaluateSFObjectNameMacro(scan.result, kNone, kNone, context.sfObject);
   } else if (context.block != nullptr) {
     scan.result += "DD_";
-    evaluateSystemNumberMacro(scan.result, 0, 0, context.block,
+    evaluateSystemNumberMacro(scan.result, kNone, kNone, context.block,
                               context.systemId, context.changeable);
     scan.result += "_";
-    evaluateBlockNameMacro(scan.result, 0, 0, context.block, context.ivBlock);
+    evaluateBlockNameMacro(scan.result, kNone, kNone, context.block,
+                           context.ivBlock);
   } else {
     scan.result += "_D";
   }

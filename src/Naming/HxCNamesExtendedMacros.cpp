@@ -159,7 +159,7 @@ int HxCNames::evaluateExtendedNameMacro(
     HxCCIdentifier& id, HX_DataType* type, const HxCSrcRef*,
     const HxCSrcRef* reportRef, bool suppressMessages) {
   constexpr int kFrame = 3;  // '$' and both parentheses
-  const int close = form.find(')', pos + 2);
+  const int close = form.find(')', pos);
   if (close < 0) {
     result.appendSub(form, pos, form.length() - 1);
     return form.length();

@@ -120,11 +120,9 @@ bool HxCNames::isFileNameValid(HxCCIdentifier& identifier) {
 
 void HxCNames::appendSuffix(KyCXString& name, int index) {
   const KyCXString code = letterCode(index < 0 ? 0 : index);
-  const int maximum = HxCSymbol::sm_MaxNameLength;
   int kept = name.length();
-  if (HxCGlobal::getOptions()->getLimitVariableNameLength() &&
-      kept + 1 + code.length() >= maximum)
-    kept = maximum - code.length() - 1;
+  if (HxCGlobal::getOptions()->getLimitVariableNameLength())
+    kept = std::min(kept, HxCSymbol::sm_MaxNameLength - code.length() - 1);
   name = name.head(kept);
   name += '_';
   name += code;

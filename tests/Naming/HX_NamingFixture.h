@@ -3,7 +3,10 @@
 #ifndef NAMING_HX_NAMINGFIXTURE_H
 #define NAMING_HX_NAMINGFIXTURE_H
 
+#include <iterator>
+#include <sstream>
 #include <string>
+#include <vector>
 
 #include "Naming/HxCNames.h"
 #include "SourceRef/HxCDdSrcRef.h"
@@ -23,9 +26,8 @@
 class HxCNamesTestAccess {
  public:
   static int ddObjectName(HxCNames& names, KyCXString& result,
-                          unsigned int retained, unsigned int provisional) {
-    return names.evaluateDdObjectNameMacro(result, retained, provisional,
-                                           "Gain");
+                          unsigned int retained) {
+    return names.evaluateDdObjectNameMacro(result, retained, 0x200, "Gain");
   }
   static int dollarELength(const char* text, int start) {
     return HxCNames::findDollarELength(text, start);
@@ -42,6 +44,8 @@ class HxCNamesTestAccess {
 /// and the chart object "go#" (number 7) with the hierarchy "Top_Run".
 class HX_NamingFixture : public HX_TestFixture {
  protected:
+  using Id = HxCCIdentifier;
+
   HX_NamingFixture() {
     GLB_SetModelName("plant v2");
     GLB_SetSubsystemName("Ctrl");
@@ -64,8 +68,8 @@ class HX_NamingFixture : public HX_TestFixture {
   }
 
   /// An identifier with the template \p form for \p srcRef.
-  static HxCCIdentifier identifier(const char* form, const HxCSrcRef* srcRef) {
-    HxCCIdentifier id(form);
+  static Id identifier(const char* form, const HxCSrcRef* srcRef) {
+    Id id(form);
     id.setSourceRef(srcRef);
     return id;
   }
@@ -74,17 +78,27 @@ class HX_NamingFixture : public HX_TestFixture {
   std::string expand(const char* form, const HxCSrcRef* srcRef,
                      HX_DataType* type = nullptr, unsigned int retained = 0,
                      unsigned int provisional = 0) {
-    HxCCIdentifier id = identifier(form, srcRef);
+    Id id = identifier(form, srcRef);
+    return expand(id, type, retained, provisional);
+  }
+  std::string expand(Id& id, HX_DataType* type = nullptr,
+                     unsigned int retained = 0, unsigned int provisional = 0) {
     complete = names.createNameFromForm(id, type, retained, provisional, false);
-    changeable = id.getIdentifierChangeable(HxCCIdentifier::eFormalName);
-    return id.getCookedName(HxCCIdentifier::eFormalName).cstring();
+    changeable = id.getIdentifierChangeable(Id::eFormalName);
+    return formal(id);
   }
 
-  static std::string formal(const HxCCIdentifier& id) {
-    return id.getCookedName(HxCCIdentifier::eFormalName).cstring();
+  static std::string formal(const Id& id) {
+    return id.getCookedName(Id::eFormalName).cstring();
   }
-  static std::string actual(const HxCCIdentifier& id) {
-    return id.getCookedName(HxCCIdentifier::eActualName).cstring();
+  static std::string actual(const Id& id) {
+    return id.getCookedName(Id::eActualName).cstring();
+  }
+
+  /// What stands between the blanks of \p text.
+  static std::vector<std::string> words(const std::string& text) {
+    std::istringstream stream(text);
+    return {std::istream_iterator<std::string>(stream), {}};
   }
 
   HX_OptionsExt options;

@@ -1,82 +1,71 @@
 #include "Naming/HxCCIdentifier.h"
 
+#include <tuple>
+
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
 
-constexpr auto kActive = HxCCIdentifier::eActiveName;
-constexpr auto kActual = HxCCIdentifier::eActualName;
-constexpr auto kFormal = HxCCIdentifier::eFormalName;
-
-struct SetNameCase {
-  const char* why;
-  const char* name;
-  const char* formal;
-  const char* actual;
-  bool twoPartsAtMost;
-};
-
-const SetNameCase kSetNameCases[] = {
-    {"one part may be changed", "Var", "Var", "Var$R", true},
-    {"two parts", "In:Out", "In", "Out", true},
-    {"a third part is refused and ignored", "a:b:c", "a", "b", false},
-    {"empty name", "", "", "$R", true},
-    {"empty parts", ":", "", "", true},
-    {"empty formal part", ":b", "", "b", true},
-};
+using Id = HxCCIdentifier;
+constexpr auto kActive = Id::eActiveName;
+constexpr auto kActual = Id::eActualName;
+constexpr auto kFormal = Id::eFormalName;
 
 TEST(CIdentifierTest, SetNameSplitsFormalAndActual) {
-  for (const SetNameCase& row : kSetNameCases) {
-    SCOPED_TRACE(row.why);
-    HxCCIdentifier id("old:one");
-    id.setCookLevel(HxCCIdentifier::eCookLevelFull);
+  const std::tuple<const char*, const char*, const char*, bool> rows[] = {
+      {"Var", "Var", "Var$R", true}, {"In:Out", "In", "Out", true},
+      {"a:b:c", "a", "b", false},    {"", "", "$R", true},
+      {":", "", "", true},           {":b", "", "b", true},
+      {"::", "", "", false}};
+  for (const auto& [name, formal, actual, twoPartsAtMost] : rows) {
+    SCOPED_TRACE(name);
+    Id id("old:one");
+    id.setCookLevel(Id::eCookLevelFull);
     id.setDollarXValue("x");
     id.setSignalLabel("label");
     id.setIdentifierChangeable(true, kActual);
     id.activateActualName();
-    EXPECT_EQ(id.setName(row.name), row.twoPartsAtMost);
-    EXPECT_STREQ(id.getRawName(kFormal).cstring(), row.formal);
-    EXPECT_STREQ(id.getRawName(kActual).cstring(), row.actual);
-    EXPECT_EQ(id.getCookedName(kActive), id.getRawName(kFormal));
-    EXPECT_EQ(id.getCookedName(kActual), id.getRawName(kActual));
+    EXPECT_EQ(id.setName(name), twoPartsAtMost);
+    EXPECT_EQ(id.getRawName(kFormal), formal);
+    EXPECT_EQ(id.getRawName(kActual), actual);
+    EXPECT_EQ(id.getCookedName(kActive), formal);
+    EXPECT_EQ(id.getCookedName(kActual), actual);
     KyCXString x;
     id.getDollarXValue(x);
     EXPECT_TRUE(x.isEmpty() && id.getSignalLabel().isEmpty());
-    EXPECT_EQ(id.getCookLevel(), HxCCIdentifier::eCookLevelRaw);
+    EXPECT_EQ(id.getCookLevel(), Id::eCookLevelRaw);
     EXPECT_FALSE(id.getIdentifierChangeable(kActual));
   }
 }
 
 TEST(CIdentifierTest, NamesMayBeGivenByThemselves) {
-  HxCCIdentifier id("a_rather_long_name_that_needs_memory_of_its_own:b");
+  Id id("a_rather_long_name_that_needs_memory_of_its_own:b");
   id = id.getRawName(kFormal);
-  EXPECT_STREQ(id.getRawName(kActual).cstring(),
-               "a_rather_long_name_that_needs_memory_of_its_own$R");
+  EXPECT_EQ(id.getRawName(kActual),
+            "a_rather_long_name_that_needs_memory_of_its_own$R");
   id.addPrefix(id.getRawName(kFormal));
   EXPECT_EQ(id.getRawName(kFormal).length(), 94);
-  HxCCIdentifier suffix("ab");
+  Id suffix("ab");
   suffix += suffix.getRawName(kActual);
-  EXPECT_STREQ(suffix.getCookedName(kFormal).cstring(), "abab$R");
-  EXPECT_STREQ(suffix.getRawName(kActual).cstring(), "ab$Rab$R");
+  EXPECT_EQ(suffix.getCookedName(kFormal), "abab$R");
+  EXPECT_EQ(suffix.getRawName(kActual), "ab$Rab$R");
 }
 
 TEST(CIdentifierTest, UsedFlagsCountFromTheirLevel) {
   struct Row {
     const char* form;
-    bool (HxCCIdentifier::*get)(HxCCIdentifier::HxENameTypeTag) const;
-    void (HxCCIdentifier::*set)(bool, HxCCIdentifier::HxENameTypeTag);
+    bool (Id::*get)(Id::HxENameTypeTag) const;
+    void (Id::*set)(bool, Id::HxENameTypeTag);
     int threshold;
   };
-  using Id = HxCCIdentifier;
   const Row rows[] = {{"x_$L", &Id::getDollarLUsed, &Id::setDollarLUsed, 2},
                       {"x_$E", &Id::getDollarEUsed, &Id::setDollarEUsed, 1},
                       {"x_$N", &Id::getDollarNUsed, &Id::setDollarNUsed, 2}};
   for (const Row& row : rows) {
     for (int level = 0; level <= 3; ++level) {
-      SCOPED_TRACE(std::string(row.form) + " at level " +
-                   std::to_string(level));
+      SCOPED_TRACE(testing::Message() << row.form << " at level " << level);
       Id with(row.form);
       Id without("x");
       for (Id* id : {&with, &without})
@@ -91,46 +80,41 @@ TEST(CIdentifierTest, UsedFlagsCountFromTheirLevel) {
 }
 
 TEST(CIdentifierTest, ChangesTouchTheNamesTheySay) {
-  HxCCIdentifier id("f-1:a-1");
+  Id id("f-1:a-1");
   id.makeCIdentifier();
   id.addPrefix("p-");
   id.addPostfix("-s");
-  EXPECT_STREQ(id.getRawName(kFormal).cstring(), "p-f-1-s");
-  EXPECT_STREQ(id.getCookedName(kFormal).cstring(), "p-f_1-s");
-  EXPECT_STREQ(id.getRawName(kActual).cstring(), "p-a-1-s");
+  EXPECT_EQ(id.getRawName(kFormal), "p-f-1-s");
+  EXPECT_EQ(id.getCookedName(kFormal), "p-f_1-s");
+  EXPECT_EQ(id.getCookedName(kActual), "p-a_1-s");
   id.setCookedName("new", kActual);
-  EXPECT_STREQ(id.getCookedName(kActual).cstring(), "new");
-  EXPECT_STREQ(id.getRawName(kActual).cstring(), "p-a-1-s");
+  EXPECT_EQ(id.getCookedName(kActual), "new");
+  EXPECT_EQ(id.getRawName(kActual), "p-a-1-s");
 }
 
 TEST(CIdentifierTest, EqualityIsThatOfTheRawActiveNames) {
-  HxCCIdentifier a("x:y");
-  HxCCIdentifier b("x:z");
+  Id a("x:y");
+  Id b("x:z");
   b.setCookedName("cooked", kFormal);
   b.setDollarLUsed(true, kFormal);
   EXPECT_TRUE(a == b);
   b.activateActualName();
   EXPECT_FALSE(a == b);
-  const HxCCIdentifier copy(b);
-  EXPECT_FALSE(copy.isFormalNameActive());
+  EXPECT_FALSE(Id(b).isFormalNameActive());
 }
 
 TEST(CIdentifierTest, AdaptSizeNeedsTheFlagAndTheOption) {
   const KyCXString longName("abcdefghijklmnopqrstuvwxyz_0123456789");
   HX_OptionsExt options;
   HxCGlobal::setOptions(&options);
-  for (bool changeable : {false, true}) {
-    for (bool limited : {false, true}) {
-      options.setLimitVariableNameLength(limited);
-      HxCCIdentifier id(longName);
-      id.setIdentifierChangeable(changeable, kFormal);
-      id.adaptSize();
-      const bool cut = changeable && limited;
-      EXPECT_STREQ(
-          id.getCookedName(kFormal).cstring(),
-          cut ? "abcdefghijklmno__xyz_0123456789" : longName.cstring());
-      EXPECT_EQ(id.getCookedName(kActual).length(), cut ? 31 : 39);
-    }
+  for (int bits = 0; bits < 4; ++bits) {
+    options.setLimitVariableNameLength((bits & 1) != 0);
+    Id id(longName);
+    id.setIdentifierChangeable((bits & 2) != 0, kFormal);
+    id.adaptSize();
+    EXPECT_EQ(id.getCookedName(kFormal),
+              bits == 3 ? "abcdefghijklmno__xyz_0123456789" : longName);
+    EXPECT_EQ(id.getCookedName(kActual).length(), bits == 3 ? 31 : 39);
   }
   HxCGlobal::setOptions(nullptr);
 }

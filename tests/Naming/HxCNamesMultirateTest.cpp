@@ -1,8 +1,9 @@
 #include <cmath>
 #include <limits>
 #include <random>
+#include <tuple>
+#include <utility>
 
-#include "Math/FPS_FloatingPointSupport.h"
 #include "Naming/HX_NamingFixture.h"
 
 namespace {
@@ -14,7 +15,7 @@ class MultirateTest : public HX_NamingFixture {
  protected:
   std::string time(const std::string& form, double period, double offset,
                    bool cyclic = true) {
-    HxCCIdentifier id((form + ":" + form).c_str());
+    Id id((form + ":" + form).c_str());
     id.setSourceRef(gain.getSrcRef());
     names.replaceMultirateTimeName(id, period, offset, cyclic);
     names.createNameFromForm(id, nullptr, 0, 0, true);
@@ -22,25 +23,19 @@ class MultirateTest : public HX_NamingFixture {
   }
 };
 
-struct TimeCase {
-  const char* form;
-  double period;
-  double offset;
-  const char* result;
-};
-
 TEST_F(MultirateTest, ExactTimesGiveNoMessage) {
-  const TimeCase rows[] = {{"$(Offset1ms)", 0.01, 0, "0"},
-                           {"$(Time1ms)_$(Time10ms)", 0.01, 0.02, "10_20_1_2"},
-                           {"$(Time)", 0.01, 0.005, "10ms_5ms"},
-                           {"$(Period)$(Offset)", 0.01, -0.005, "10ms5ms"},
-                           {"$(Time)", 90, 0, "90s"},
-                           {"$(Time)", 0.00000101, 3599.99999, "1us_60m"},
-                           {"$(Time1us)", 100.0000003, 0, "100000000"},
-                           {"$(time1ms)", 0.01, 0, "__time1ms_"}};
-  for (const TimeCase& row : rows) {
-    EXPECT_EQ(time(row.form, row.period, row.offset), row.result) << row.form;
-    EXPECT_THAT(messages(), IsEmpty()) << row.form;
+  const std::tuple<const char*, double, double, const char*> rows[] = {
+      {"$(Offset1ms)", 0.01, 0, "0"},
+      {"$(Time1ms)_$(Time10ms)", 0.01, 0.02, "10_20_1_2"},
+      {"$(Time)", 0.01, 0.005, "10ms_5ms"},
+      {"$(Period)$(Offset)", 0.01, -0.005, "10ms5ms"},
+      {"$(Time)", 90, 0, "90s"},
+      {"$(Time)", 0.00000101, 3599.99999, "1us_60m"},
+      {"$(Time1us)", 100.0000003, 0, "100000000"},
+      {"$(time1ms)", 0.01, 0, "__time1ms_"}};
+  for (const auto& [form, period, offset, result] : rows) {
+    EXPECT_EQ(time(form, period, offset), result);
+    EXPECT_THAT(messages(), IsEmpty()) << form;
   }
 }
 
@@ -70,15 +65,17 @@ TEST_F(MultirateTest, ImpreciseTimesAreReportedWhereTheyAreUsed) {
 // value back, and the message must be there exactly when it does not.
 TEST_F(MultirateTest, TimesAgreeWithExactArithmetic) {
   struct Unit {
-    const char* text;
+    std::string text;
     std::int64_t microseconds;
   };
-  const Unit bases[] = {
-      {"1us", 1},         {"10us", 10},       {"100us", 100},  {"1ms", 1000},
-      {"10ms", 10000},    {"100ms", 100000},  {"1s", 1000000}, {"1m", 60000000},
-      {"1h", 3600000000}, {"1d", 86400000000}};
   const Unit units[] = {{"d", 86400000000}, {"h", 3600000000}, {"m", 60000000},
                         {"s", 1000000},     {"ms", 1000},      {"us", 1}};
+  std::vector<Unit> bases;
+  for (const Unit& unit : units)
+    for (int factor : {100, 10, 1})
+      if (factor == 1 || unit.microseconds <= 1000)
+        bases.push_back(
+            {std::to_string(factor) + unit.text, factor * unit.microseconds});
   constexpr unsigned kSeed = 20;
   SCOPED_TRACE(kSeed);
   std::mt19937 random(kSeed);
@@ -91,7 +88,7 @@ TEST_F(MultirateTest, TimesAgreeWithExactArithmetic) {
     SCOPED_TRACE(seconds);
     for (const Unit& base : bases) {
       clearMessages();
-      const std::string form = std::string("$(Period") + base.text + ")";
+      const std::string form = "$(Period" + base.text + ")";
       const std::int64_t count =
           (value + base.microseconds / 2) / base.microseconds;
       const bool isTie = value % base.microseconds * 2 == base.microseconds;
@@ -147,17 +144,17 @@ TEST_F(MultirateTest, NoncyclicTasksHaveNoTime) {
 }
 
 TEST_F(MultirateTest, TasksAndIsrsStandInForEachOther) {
-  const HxCCIdentifier task("fast task:fast task");
-  const HxCCIdentifier isr("irq-1:irq-1");
-  const auto replace = [&](const HxCCIdentifier& used, bool isTaskName) {
-    HxCCIdentifier id = identifier("$(Task)/$(ISR):x", gain.getSrcRef());
+  const Id task("fast task:fast task");
+  const Id isr("irq-1:irq-1");
+  const auto replace = [&](const Id& used, bool isTaskName) {
+    Id id = identifier("$(Task)/$(ISR):x", gain.getSrcRef());
     names.replaceMultirateTaskISRName(id, used, isr, isTaskName);
     return formal(id);
   };
   EXPECT_EQ(replace(task, false), "fast_task/irq_1");
-  EXPECT_EQ(replace(HxCCIdentifier(), false), "irq_1/irq_1");
+  EXPECT_EQ(replace(Id(), false), "irq_1/irq_1");
   EXPECT_THAT(messages(), IsEmpty());
-  HxCCIdentifier own("$(Task)/$(ISR):x");
+  Id own("$(Task)/$(ISR):x");
   names.replaceMultirateTaskISRName(own, task, own, false);
   EXPECT_EQ(formal(own), "fast_task/__Task____ISR_");
   EXPECT_EQ(replace(task, true), "__Task_/irq_1");
@@ -168,39 +165,37 @@ TEST_F(MultirateTest, TasksAndIsrsStandInForEachOther) {
 }
 
 TEST_F(MultirateTest, ObjectsAreMadeCIdentifiers) {
-  const HxCCIdentifier value("a b:a b");
-  HxCCIdentifier id("$(PObj)$(Event)$(ISR)$(Msg)$(Ctr)$(MsgVar):x");
+  const Id value("a b:a b");
+  Id id("$(PObj)$(Event)$(ISR)$(Msg)$(Ctr)$(MsgVar):x");
   names.replaceMultirateObjName(id, value);
   names.replaceMultirateEventName(id, value);
   names.replaceMultirateISRName(id, value);
   names.replaceMultirateMsgName(id, value);
   names.replaceMultirateCtrName(id, value);
   EXPECT_EQ(formal(id), "a_ba_ba_ba_ba_b$(MsgVar)");
-  const TimeCase rows[] = {{"abc", 0, 0, "1"},      {"msg#7;", 0, 0, "7"},
-                           {"a#b#12x", 0, 0, "12"}, {"a#", 0, 0, ""},
-                           {"#a b;", 0, 0, "a b"},  {"", 0, 0, "1"}};
-  for (const TimeCase& row : rows) {
-    HxCCIdentifier message("<$(MsgVar)>:x");
-    names.replaceMultirateMsgVarName(message, row.form);
-    EXPECT_EQ(formal(message), std::string("<") + row.result + ">");
+  const std::pair<const char*, const char*> rows[] = {
+      {"abc", "<1>"}, {"msg#7;", "<7>"},  {"a#b#12x", "<12>"},
+      {"a#", "<>"},   {"#a b;", "<a b>"}, {"", "<1>"}};
+  for (const auto& [message, result] : rows) {
+    Id variable("<$(MsgVar)>:x");
+    names.replaceMultirateMsgVarName(variable, message);
+    EXPECT_EQ(formal(variable), result) << message;
   }
-  HxCCIdentifier unused("none");
+  Id unused("none");
   names.replaceMultirateMsgVarName(unused, "a#$N;");
-  unused.setCookLevel(HxCCIdentifier::eCookLevelFull);
-  EXPECT_TRUE(unused.getDollarNUsed(HxCCIdentifier::eFormalName));
+  unused.setCookLevel(Id::eCookLevelFull);
+  EXPECT_TRUE(unused.getDollarNUsed(Id::eFormalName));
 }
 
 TEST_F(MultirateTest, BaseTimeUnitChangesAtAThousandAndAMillion) {
-  const TimeCase rows[] = {{"us", 999, 1, ""},
-                           {"ms", 1000, 4, ""},
-                           {"ms", 999999, 4, ""},
-                           {"?", 1000000, 0, ""}};
-  for (const TimeCase& row : rows) {
+  const std::tuple<double, int, const char*> rows[] = {
+      {999, 1, "us"}, {1000, 4, "ms"}, {999999, 4, "ms"}, {1000000, 0, "?"}};
+  for (const auto& [value, expected, name] : rows) {
     auto base = static_cast<HxCNames::tagHxEOsekTimeBase>(0);
     KyCXString unit("?");
-    HxCNamesTestAccess::osekBaseTime(row.period, base, unit);
-    EXPECT_EQ(base, row.offset);
-    EXPECT_STREQ(unit.cstring(), row.form);
+    HxCNamesTestAccess::osekBaseTime(value, base, unit);
+    EXPECT_EQ(base, expected);
+    EXPECT_EQ(unit, name);
   }
 }
 
