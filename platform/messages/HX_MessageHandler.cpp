@@ -1,5 +1,7 @@
 #include "platform/messages/HX_MessageHandler.h"
 
+#include <locale.h>
+
 #include <algorithm>
 #include <csignal>
 #include <cstdio>
@@ -12,7 +14,24 @@
 
 namespace {
 
+// While it lives, this thread writes numbers with a decimal point, whatever the
+// locale of the process.
+class PlainNumbers {
+ public:
+  PlainNumbers() {
+    static const locale_t s_plain = newlocale(LC_ALL_MASK, "C", nullptr);
+    m_Old = uselocale(s_plain);
+  }
+  PlainNumbers(const PlainNumbers&) = delete;
+  PlainNumbers& operator=(const PlainNumbers&) = delete;
+  ~PlainNumbers() { uselocale(m_Old); }
+
+ private:
+  locale_t m_Old;
+};
+
 std::string format(const char* text, std::va_list arguments) {
+  const PlainNumbers plain;
   std::va_list again;
   va_copy(again, arguments);
   const int length = std::vsnprintf(nullptr, 0, text, arguments);

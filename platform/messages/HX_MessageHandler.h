@@ -59,7 +59,8 @@ class HX_PLATFORM_API HX_MessageHandler {
   void setDebugReport(DebugReport report) { m_DebugReport = std::move(report); }
   int debugReport(const char* file, int line, const char* expression);
 
-  /// Formats and records one message; see ERR_EmitErrorMessage().
+  /// Formats and records one message; see ERR_EmitErrorMessage(). Numbers have
+  /// a decimal point in every locale.
   void emit(int severity, const HxCSrcRef* srcRef, int row,
             std::va_list arguments);
 

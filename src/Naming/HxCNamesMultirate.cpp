@@ -1,8 +1,10 @@
 // Names of tasks and operating-system objects, and times in names.
 
+#include <charconv>
 #include <cmath>
 #include <cstdint>
 #include <cstdio>
+#include <iterator>
 
 #include "Control/ERR_Messages.h"
 #include "Math/FPS_FloatingPointSupport.h"
@@ -68,7 +70,11 @@ bool contains(const HxCCIdentifier& id, const KyCXString& text) {
 void reportImprecise(const HxCCIdentifier& id, const char* kind,
                      double seconds) {
   char value[400];  // the largest double has 309 digits before the point
-  std::snprintf(value, sizeof value, "%12.10f", seconds);
+  // Not printf(), which would write the decimal point of the locale.
+  char digits[sizeof value] = "";
+  std::to_chars(digits, std::end(digits) - 1, seconds, std::chars_format::fixed,
+                10);
+  std::snprintf(value, sizeof value, "%12s", digits);
   ERR_Msg1207(messageRef(id), kind, value);
 }
 

@@ -1,3 +1,4 @@
+#include <clocale>
 #include <cmath>
 #include <limits>
 #include <random>
@@ -40,11 +41,14 @@ TEST_F(MultirateTest, ExactTimesGiveNoMessage) {
 }
 
 TEST_F(MultirateTest, ImpreciseTimesAreReportedWhereTheyAreUsed) {
+  // Its decimal comma must not show; nothing happens where it is not installed.
+  std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
   EXPECT_EQ(time("$(Period10ms)_$(Offset10ms)", 0.01, 0.005), "1_1");
   EXPECT_EQ(time("$(Time10ms)", 0.01, -0.005), "1_1");
   EXPECT_EQ(time("$(Time)", 0.0000005, 0), "1us");
   EXPECT_EQ(time("$(Offset)", 0.0000005, 0), "0us");
   EXPECT_EQ(time("$(Offset)x$(Time)", 1, 0.0000025), "3usx1s_3us");
+  std::setlocale(LC_NUMERIC, "C");
   const auto fixed = [](const char* kind) {
     return std::string("1206/1 A time name macro '") + kind +
            "' with the time base 10ms is used. The period time 0.010000 or "
