@@ -41,16 +41,18 @@ TEST(CIdentifierTest, SetNameSplitsFormalAndActual) {
 }
 
 TEST(CIdentifierTest, NamesMayBeGivenByThemselves) {
-  Id id("a_rather_long_name_that_needs_memory_of_its_own:b");
+  Id id;
+  id = "a_rather_long_name_that_needs_memory_of_its_own:b";
   id = id.getRawName(kFormal);
   EXPECT_EQ(id.getRawName(kActual),
             "a_rather_long_name_that_needs_memory_of_its_own$R");
   id.addPrefix(id.getRawName(kFormal));
   EXPECT_EQ(id.getRawName(kFormal).length(), 94);
-  Id suffix("ab");
+  Id suffix("a");
+  suffix += "b";
   suffix += suffix.getRawName(kActual);
-  EXPECT_EQ(suffix.getCookedName(kFormal), "abab$R");
-  EXPECT_EQ(suffix.getRawName(kActual), "ab$Rab$R");
+  EXPECT_EQ(suffix.getCookedName(kFormal), "aba$Rb");
+  EXPECT_EQ(suffix.getRawName(kActual), "a$Rba$Rb");
 }
 
 TEST(CIdentifierTest, UsedFlagsCountFromTheirLevel) {

@@ -49,9 +49,10 @@ TEST_F(KeywordsTest, TheLastEntryOfAWordCounts) {
   clearMessages();
   HxCNames::boot();
   EXPECT_TRUE(names.isStringValidCVariableName("UInt8"));
-  names.addToKeywordDict("odd", static_cast<HxCNames::tagHxEDictEntryType>(3));
+  const KyCXString odd(std::string(64, 'w').c_str());  // longer than noted
+  names.addToKeywordDict(odd, static_cast<HxCNames::tagHxEDictEntryType>(3));
   const auto& reports = recordDebugReports();
-  EXPECT_FALSE(names.isStringValidCVariableName("odd"));
+  EXPECT_FALSE(names.isStringValidCVariableName(odd));
   EXPECT_THAT(reports, ElementsAre("0"));
   EXPECT_THAT(messages(), IsEmpty());
 }
