@@ -70,9 +70,10 @@ class Reader {
     root.erase("blocks");
     HX_ReadTypes(HX_FieldOf(root, "types"), m_Model, m_Types);
     for (Json scope : HX_FieldOf(root, "scopes")) readScope(scope, nullptr);
-    if (m_Model.fileScope == nullptr)
-      m_Model.fileScope =
-          &m_Model.scopes.emplace_back(HX_ScopeItem{"file", "file"});
+    if (m_Model.fileScope == nullptr) {
+      m_Model.fileScope = &m_Model.scopes.emplace_back();
+      m_Model.fileScope->id = m_Model.fileScope->kind = "file";
+    }
     readNames(root["names"]);
     std::size_t index = 0;
     for (Json scope : HX_FieldOf(root, "scopes")) completeScope(scope, index);
@@ -109,8 +110,10 @@ class Reader {
         {"flat", "the document"},
         {"function", "file"},
         {"block", "function"}};
-    HX_ScopeItem& scope = m_Model.scopes.emplace_back(
-        HX_ScopeItem{node["id"], node["kind"], parent});
+    HX_ScopeItem& scope = m_Model.scopes.emplace_back();
+    scope.id = node["id"];
+    scope.kind = node["kind"];
+    scope.parent = parent;
     m_Scopes.enter(node, &scope);
     const std::string around =
         parent != nullptr ? parent->kind : "the document";

@@ -61,7 +61,7 @@ struct HX_ScopeItem {
   std::string id;
   std::string kind;
   HX_ScopeItem* parent = nullptr;
-  std::map<std::string, const HX_ScopeItem*> blocks = {};  // in it, by id
+  std::map<std::string, const HX_ScopeItem*> blocks;  // in it, by id
 };
 
 /// A message of the library, or a remark of the host itself.

@@ -56,7 +56,7 @@ void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
 std::string HX_NameSpaces::define(HX_Name& name, KyCXString& text,
                                   bool changeable) {
   Space& space = m_Spaces.at(name.scope);
-  const std::string conflict = conflictOf(space, text);
+  std::string conflict = conflictOf(space, text);
   name.isDefined = conflict.empty() || changeable;
   if (!name.isDefined) return conflict;
 
