@@ -76,6 +76,14 @@ TEST_F(SubstitutionTest, ReferencesFlagsAndLevelsAreTakenOver) {
   names.substAllDollarZByValue(full, "e", value, HxCNames::eMacroKindExact);
   EXPECT_EQ(full.getCookLevel(), Id::eCookLevelDollarE);
 
+  Id used("$e$L:b");
+  for (const char* macro : {"e", "L"})
+    names.substAllDollarZByValue(used, macro, Id("x"),
+                                 HxCNames::eMacroKindExact);
+  EXPECT_TRUE(used.getDollarEUsed(Id::eFormalName));
+  used.setCookLevel(Id::eCookLevelFull);
+  EXPECT_TRUE(used.getDollarLUsed(Id::eFormalName));
+
   Id itself("v:$xL$");  // becomes "$xL$L$"
   itself.activateActualName();
   names.substAllDollarZByValue(itself, "x", itself, HxCNames::eMacroKindExact);
