@@ -135,28 +135,28 @@ const std::map<std::string, void (*)(Type& type, Type* base)> kWords = {
 // Type -> its short, its long and its base's name.
 const std::pair<const char*, const char*> kTypes[] = {
     {"struct derived", "||"},
-    {"enum", "|My_Type|"},
-    {"derived", "i-16|My_Type|Int_16"},
-    {"base derived", "i-16|My_Type|Int_16"},
-    {"orphan", "|My_Type|_UnknownHXBaseType_"},
-    {"base", "b|My_Type|My_Type"},
-    {"base long", "b|My_Type|My_Type"},
-    {"array", "i-16|Int_16|Int_16"},
-    {"long signed", "I64|My_Type|_UnknownHXBaseType_"},
-    {"long unsigned", "U64|My_Type|_UnknownHXBaseType_"},
-    {"signed own", "n|My_Type|Int_16"},
-    {"signed over", "i-16|My_Type|_UnknownHXBaseType_"},
-    {"signed", "|My_Type|_UnknownHXBaseType_"},
-    {"derived bits", "i-16|My_Type|Bits"},
+    {"enum", "|My__Type|"},
+    {"derived", "i-16|My__Type|Int__16"},
+    {"base derived", "i-16|My__Type|Int__16"},
+    {"orphan", "|My__Type|_UnknownHXBaseType_"},
+    {"base", "b|My__Type|My__Type"},
+    {"base long", "b|My__Type|My__Type"},
+    {"array", "i-16|Int__16|Int__16"},
+    {"long signed", "I64|My__Type|_UnknownHXBaseType_"},
+    {"long unsigned", "U64|My__Type|_UnknownHXBaseType_"},
+    {"signed own", "n|My__Type|Int__16"},
+    {"signed over", "i-16|My__Type|_UnknownHXBaseType_"},
+    {"signed", "|My__Type|_UnknownHXBaseType_"},
+    {"derived bits", "i-16|My__Type|Bits"},
     {"", "||"}};
 
 TEST_F(MacrosTest, TypesAreAskedWhatTheyAre) {
-  Type base("Int 16"), bits("Bits"), nameless("");
+  Type base("Int  16"), bits("Bits"), nameless("");
   base.setCut("i-16").setBase();
   auto* server = types.getBaseServer();
   server->setBitfieldBaseType(&bits);
   const auto expandType = [&](const char* text) {
-    Type type("My-Type");
+    Type type("My- Type");
     for (const auto& word : words(text)) kWords.at(word)(type, &base);
     return expand("$T|$(Type)|$(BaseType)", nullptr, &type);
   };
@@ -167,7 +167,7 @@ TEST_F(MacrosTest, TypesAreAskedWhatTheyAre) {
   EXPECT_THAT(messages(), AllOf(SizeIs(3), Each(StartsWith("7/3 "))));
   for (HX_DataType* noBase : {static_cast<HX_DataType*>(nullptr), &nameless}) {
     server->setBitfieldBaseType(noBase);
-    EXPECT_EQ(expandType("derived bits"), "i-16|My_Type|_UnknownHXBaseType_");
+    EXPECT_EQ(expandType("derived bits"), "i-16|My__Type|_UnknownHXBaseType_");
   }
 }
 
