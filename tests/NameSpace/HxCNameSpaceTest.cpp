@@ -89,13 +89,15 @@ TEST_F(NameSpaceTest, BreachedPreconditionsAssertAndGiveNothing) {
   Scope* const root = scoped.newEnv();
   serverless.setScope(root);
   HxCSymbol* found = symbol(0);
+  HxCSmbScopeData old(found);
   HxCSmbScopeData* data = nullptr;
   const auto isUseless = [&](HxCNameSpace& names) {
+    data = &old;
     return !names.defineString("a") && !names.defineString("a", found) &&
            !names.stringInScope("a") && !names.stringInScope("a", found) &&
            !names.stringInEnv("a") && !names.stringInEnv("a", data) &&
            !names.stringInEnv("a", found) && !names.remove("a") &&
-           found == symbol(0);
+           data == nullptr && found == symbol(0);
   };
   EXPECT_TRUE(isUseless(empty) && isUseless(serverless));
   EXPECT_FALSE(empty.keyInScope(1) || empty.keyInEnv(1) || empty.defineIdn(1) ||
