@@ -32,7 +32,7 @@ class HX_Bytes {
   }
   int below(int limit) { return number() % limit; }
   bool flag() { return number() % 2 != 0; }
-  std::string line() { return upTo('\n'); }
+  std::string line() { return partUntil('\n'); }
   /// A line; its bytes from 0xF8 on stand for the units from 0xFFF8 on.
   KyCXString text() {
     KyCXString text;
@@ -43,10 +43,10 @@ class HX_Bytes {
     }
     return text;
   }
-  std::string rest() { return upTo(-1); }
+  std::string rest() { return partUntil(-1); }
 
  private:
-  std::string upTo(int end) {
+  std::string partUntil(int end) {
     const std::size_t start = std::min(m_At, m_Bytes.size());
     m_At = end < 0 ? std::string::npos
                    : m_Bytes.find(static_cast<char>(end), start);
