@@ -5,7 +5,6 @@
 
 namespace {
 
-using testing::ElementsAre;
 using testing::StartsWith;
 
 enum : unsigned int { kA = 1, kB = 2, kC = 4, kD = 8 };
@@ -30,13 +29,12 @@ TEST_F(FLAGTest, FieldsAreWordsOfTheController) {
   FLAG_ClearAll(field);
   EXPECT_EQ(FLAG_CompareFlagfields(field, copy), 0);
   EXPECT_EQ(*field, 0U);
-  EXPECT_EQ(m_Controller.liveBlocks(), 2);
-  m_Controller.freeMemBlock(field);
-  m_Controller.freeMemBlock(copy);
+  for (unsigned int* block : {field, copy}) m_Controller.freeMemBlock(block);
+  EXPECT_EQ(m_Controller.allocated(), 2);
   m_Controller.fail();
   unsigned int word = kA;
   EXPECT_EQ(FLAG_DupFlagField(&word), nullptr);
-  EXPECT_THAT(messages(), ElementsAre(StartsWith("7/3 ")));
+  EXPECT_THAT(messages(), testing::ElementsAre(StartsWith("7/3 ")));
 }
 
 // Against the plain walk over the 32 masks.
@@ -66,25 +64,22 @@ TEST_F(FLAGTest, NullFieldsAreReportedAndLeftAlone) {
   EXPECT_FALSE(FLAG_GetFlag(nullptr, kA));
   EXPECT_FALSE(FLAG_GetFlags(nullptr, 0));
   EXPECT_EQ(FLAG_GetAllFlagsFromFlagField(nullptr), 0U);
-  EXPECT_THAT(messages(),
-              testing::AllOf(testing::SizeIs(6),
-                             testing::Each(StartsWith(
-                                 "7/3 Internal error. Error code: FLAG.h_"))));
+  for (const std::string& message : messages())
+    EXPECT_THAT(message, StartsWith("7/3 Internal error. Error code: FLAG.h_"));
+  EXPECT_EQ(messages().size(), 6U);
 }
 
 TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
   constexpr unsigned int kNoRow = 16;  // one bit above the table
   const struct {
     const char* why;
-    unsigned int held;
-    unsigned int flag;
-    unsigned int conflicts;  // what CheckFlag and SaveSetFlag return
-    unsigned int saved;      // the field after SaveSetFlag
-    unsigned int forced;     // the field after ForceSetFlag
+    unsigned int held, flag;
+    unsigned int conflicts;      // what CheckFlag and SaveSetFlag return
+    unsigned int saved, forced;  // the field after SaveSetFlag, ForceSetFlag
     bool asserts;
-    const char* reported;  // null for no report
+    std::string reported;  // empty for no report
   } rows[] = {
-      {"no conflict", kC, kB, 0, kB | kC, kB | kC, false, nullptr},
+      {"no conflict", kC, kB, 0, kB | kC, kB | kC, false, ""},
       {"one", kA, kB, kA, kA, kA, false, "B excludes flag(s): A "},
       {"set before: force clears it", kA | kB, kB, kA, kA | kB, kA, false,
        "B excludes flag(s): A "},
@@ -94,28 +89,26 @@ TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
       {"mask: its highest bit's row; a conflict without row", kNoRow, kB | kD,
        kNoRow, kNoRow, kNoRow, true, "<unknown flag name> excludes flag(s): "},
       {"flag 0 has row 0", kB, 0, kB, kB, kB, false, "A excludes flag(s): B "},
-      {"no row", kA, kNoRow, 0, kA, kA | kNoRow, true, nullptr}};
+      {"no row", kA, kNoRow, 0, kA, kA | kNoRow, true, ""}};
   for (const auto& row : rows) {
     SCOPED_TRACE(row.why);
-    const auto expectMessages = [&row](const std::string& suffix) {
-      std::vector<testing::Matcher<std::string>> expected;
+    std::vector<testing::Matcher<std::string>> expected;
+    for (const char* end :
+         {"", ". Didn't set flag.", ". Clearing bad flag(s)."}) {
       if (row.asserts)
         expected.push_back(
             StartsWith("7/3 Internal error. Error code: FLAG.cpp_"));
-      if (row.reported != nullptr)
+      if (!row.reported.empty())
         expected.push_back("1292/5 INTERNAL: Flag conflict found ! Flag " +
-                           (row.reported + suffix));
-      EXPECT_THAT(messages(), testing::ElementsAreArray(expected));
-      clearMessages();
-    };
-    const int conflicts = static_cast<int>(row.conflicts);
+                           row.reported + end);
+    }
     unsigned int field = row.held;
-    EXPECT_EQ(FLAG_CheckFlag(&field, row.flag, 4, kRows), conflicts);
-    EXPECT_EQ(field, row.held);
-    expectMessages("");
-    EXPECT_EQ(FLAG_SaveSetFlag(&field, row.flag, 4, kRows), conflicts);
+    for (auto* operation : {FLAG_CheckFlag, FLAG_SaveSetFlag}) {
+      EXPECT_EQ(field, row.held);
+      EXPECT_EQ(operation(&field, row.flag, 4, kRows),
+                static_cast<int>(row.conflicts));
+    }
     EXPECT_EQ(field, row.saved);
-    expectMessages(". Didn't set flag.");
     field = row.held;
     unsigned int seen = row.forced;  // by who receives the report
     HX_MessageHandler::instance().setSink(
@@ -124,7 +117,8 @@ TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
     HX_MessageHandler::instance().setSink({});
     EXPECT_EQ(field, row.forced);
     EXPECT_EQ(seen, row.forced);
-    expectMessages(". Clearing bad flag(s).");
+    EXPECT_THAT(messages(), testing::ElementsAreArray(expected));
+    clearMessages();
   }
 }
 

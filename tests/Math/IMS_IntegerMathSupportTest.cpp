@@ -4,13 +4,13 @@
 
 #include <boost/multiprecision/cpp_int.hpp>
 #include <cmath>
-#include <iterator>
 #include <limits>
 #include <numeric>
 #include <random>
 #include <utility>
 #include <vector>
 
+#include "Math/IMS_Log2.h"
 #include "platform/datatypes/HX_NumericalType.h"
 
 namespace {
@@ -61,30 +61,25 @@ TEST(IntegerMathSupportTest, WordsAndRangesOfBoundaryValues) {
 }
 
 TEST(IntegerMathSupportTest, DoublesAreRoundedHalfAwayFromZero) {
-  const double xs[] = {2.5,    -2.5,    std::nextafter(2.5, 0),
-                       -0.4,   -0.0,    0x1.fffffffffffffp62,
-                       0x1p63, -0x1p63, kInf,
-                       -kInf,  kNaN};
-  const long long rounded[] = {3,    -3,   2,    0,    0,   9223372036854774784,
-                               kMax, kMin, kMax, kMin, kMax};
-  for (std::size_t i = 0; i < std::size(xs); ++i) {
-    EXPECT_EQ(IMS_RoundDouble(xs[i]), rounded[i]) << xs[i];
-    EXPECT_EQ(IMS_RoundDoubleToULong(xs[i]),
-              static_cast<std::uint32_t>(rounded[i]))
-        << xs[i];
+  const std::pair<double, long long> rows[] = {
+      {2.5, 3},
+      {-2.5, -3},
+      {std::nextafter(2.5, 0), 2},
+      {-0.4, 0},
+      {-0.0, 0},
+      {0x1.fffffffffffffp62, 9223372036854774784},
+      {0x1p63, kMax},
+      {-0x1p63, kMin},
+      {kInf, kMax},
+      {-kInf, kMin},
+      {kNaN, kMax}};
+  for (const auto& [x, rounded] : rows) {
+    EXPECT_EQ(IMS_RoundDouble(x), rounded) << x;
+    EXPECT_EQ(IMS_RoundDoubleToULong(x), static_cast<std::uint32_t>(rounded));
   }
 }
 
-// The plain form; the remainder of the big integers truncates as well.
-Integer plainGcd(Integer a, Integer b) {
-  while (b != 0) {
-    const Integer rest = a % b;
-    a = b;
-    b = rest;
-  }
-  return a;
-}
-
+// Against the plain form; the remainder of the big integers truncates as well.
 TEST(IntegerMathSupportTest, DivisorsMatchThePlainRemainders) {
   const std::vector<long long> boundary = boundaryValues();
   std::mt19937_64 random(4711);
@@ -97,46 +92,43 @@ TEST(IntegerMathSupportTest, DivisorsMatchThePlainRemainders) {
   std::vector<std::pair<long long, long long>> pairs = {
       {kMin, -1}, {kMin, 1}, {1, kMin}, {kMin, kMin}};
   while (pairs.size() < 4000) pairs.emplace_back(draw(), draw());
-  for (const auto& [a, b] : pairs) {
-    const long long values[] = {a, b};
-    EXPECT_EQ(Integer(IMS_FindGreatestCommonDivisor(values)), plainGcd(a, b))
-        << a << ", " << b;
+  for (const auto& [first, second] : pairs) {
+    const long long values[] = {first, second};
+    Integer a(first), b(second);
+    while (b != 0) a = std::exchange(b, a % b);
+    EXPECT_EQ(Integer(IMS_FindGreatestCommonDivisor(values)), a)
+        << first << ", " << second;
   }
 }
 
-struct MultipleRow {
-  std::vector<long long> values;
-  double limit;
-  long long expected;
-};
-
-const MultipleRow kMultipleRows[] = {
-    {{4, 6}, 12, 12},
-    {{4, 6}, std::nextafter(12, 0), 0},
-    {{4, 6}, kNaN, 12},
-    {{2, 3, 4}, 100, 12},
-    {{2, 3, 6}, 100, 6},
-    {{2, 6, 3}, 100, 0},
-    {{2, 3, 5}, 10, 0},
-    {{0, 5}, 100, 0},
-    {{5, 0}, 100, 0},
-    {{2, 3, 0}, 100, 0},
-    {{-4, 6}, 1, -12},   // the divisor is 2
-    {{4, -6}, 100, 12},  // the divisor is -2
-    {{-1, kMin}, kInf, 0},
-    {{kMax, 1}, kInf, 0},  // 2^63 in double
-    {{kMin, 1}, kInf, 0},
-    {{4611686018427387904, 1}, kInf, 0},
-    {{1, 4611686018427387904, 3}, kInf, -4611686018427387904},  // wraps
-    {{1, 4611686018427387904, 2}, kInf, 0},
-};
-
 TEST(IntegerMathSupportTest, MultiplesWithinTheirBounds) {
-  for (const MultipleRow& row : kMultipleRows) {
-    EXPECT_EQ(IMS_FindLeastCommonMultiple(static_cast<int>(row.values.size()),
-                                          row.values.data(), row.limit),
-              row.expected)
-        << testing::PrintToString(row.values) << ", " << row.limit;
+  constexpr long long kTwo62 = 4611686018427387904;
+  const struct {
+    std::vector<long long> values;
+    double limit;
+    long long expected;
+  } rows[] = {{{4, 6}, 12, 12},
+              {{4, 6}, std::nextafter(12, 0), 0},
+              {{4, 6}, kNaN, 12},
+              {{2, 3, 4}, 100, 12},
+              {{2, 6, 3}, 100, 0},
+              {{2, 3, 5}, 10, 0},
+              {{0, 5}, 100, 0},
+              {{5, 0}, 100, 0},
+              {{2, 3, 0}, 100, 0},
+              {{-4, 6}, 1, -12},   // the divisor is 2
+              {{4, -6}, 100, 12},  // the divisor is -2
+              {{-1, kMin}, kInf, 0},
+              {{kMax, 1}, kInf, 0},  // 2^63 in double
+              {{kMin, 1}, kInf, 0},
+              {{kTwo62, 1}, kInf, 0},
+              {{1, kTwo62, 3}, kInf, -kTwo62},  // wraps
+              {{1, kTwo62, 2}, kInf, 0}};
+  for (const auto& [values, limit, expected] : rows) {
+    EXPECT_EQ(IMS_FindLeastCommonMultiple(static_cast<int>(values.size()),
+                                          values.data(), limit),
+              expected)
+        << testing::PrintToString(values) << ", " << limit;
   }
   for (long long a = 1; a < 60; ++a) {
     for (long long b = 1; b < 60; ++b) {
@@ -150,77 +142,96 @@ TEST(IntegerMathSupportTest, MultiplesWithinTheirBounds) {
   }
 }
 
-TEST(IntegerMathSupportTest, WrapsAsTheTypeDoes) {
-  for (int width : {8, 16}) {
+TEST(IntegerMathSupportTest, WrapsAndMatchesAsTheTypeDoes) {
+  for (int kind = 0; kind < 4; ++kind) {
+    const int width = 8 << kind / 2;
+    const bool isSigned = kind % 2 != 0;
     const long long size = 1LL << width;
-    for (bool isSigned : {false, true}) {
-      const long long low = isSigned ? -size / 2 : 0;
-      const long long high = low + size - 1;
-      const HX_NumericalType type(static_cast<double>(low),
-                                  static_cast<double>(high), width, isSigned);
-      for (long long v = -2 * size; v <= 2 * size; ++v) {
-        const long long wrapped = ((v - low) % size + size) % size + low;
-        ASSERT_EQ(IMS_ShrinkValueToBaseType(v, &type), wrapped)
-            << v << " to " << width << " bits, signed " << isSigned;
-        for (double x :
-             {static_cast<double>(v), static_cast<double>(v) + 0.5}) {
-          ASSERT_EQ(IMS_ValueMatchesSignednessAndWidth(x, isSigned, width),
-                    x <= static_cast<double>(high) &&
-                        (!isSigned || x >= static_cast<double>(low)))
-              << x << " in " << width << " bits, signed " << isSigned;
-        }
+    const long long low = isSigned ? -size / 2 : 0, high = low + size - 1;
+    const HX_NumericalType type(static_cast<double>(low),
+                                static_cast<double>(high), width, isSigned);
+    for (long long v = -2 * size; v <= 2 * size; ++v) {
+      const long long wrapped = ((v - low) % size + size) % size + low;
+      ASSERT_EQ(IMS_ShrinkValueToBaseType(v, &type), wrapped)
+          << v << " to " << width << " bits, signed " << isSigned;
+      for (double half : {0.0, 0.5}) {
+        const double x = static_cast<double>(v) + half;
+        ASSERT_EQ(IMS_ValueMatchesSignednessAndWidth(x, isSigned, width),
+                  x <= static_cast<double>(high) &&
+                      (!isSigned || x >= static_cast<double>(low)))
+            << x << " in " << width << " bits, signed " << isSigned;
       }
     }
   }
 }
 
 TEST(IntegerMathSupportTest, WrapOfUnusualTypes) {
-  struct Row {
+  const HX_NumericalType int4(-8, 7, 4, true);
+  const HX_NumericalType int32(-2147483648.0, 2147483647, 32, true);
+  const struct {
     const char* why;
     HX_NumericalType type;
     long long v, wrapped;
-  };
-  const HX_NumericalType int32(-2147483648.0, 2147483647, 32, true);
-  const Row rows[] = {
-      {"beyond 32 bits", {-10, 10, 33, true}, kMax, kMax},
-      {"32 bits, signed", int32, kMin, 0},
-      {"32 bits, signed", int32, 0x80000000, -2147483648LL},
-      {"32 bits, unsigned", {0, 4294967295, 32, false}, -1, 4294967295},
-      {"no extension below 128", {-8, 7, 4, true}, 12, 12},
-      {"extension from 128 on", {-8, 7, 4, true}, 140, -4},
-      {"negative values count as high", {-8, 7, 4, true}, -9, 7},
-      {"no bits", {0, 0, 0, true}, 5, 0},
-      {"less than no bits", {0, 0, -3, true}, 5, 0},
-  };
-  for (const Row& row : rows) {
+  } rows[] = {{"beyond 32 bits", {-10, 10, 33, true}, kMax, kMax},
+              {"32 bits, signed", int32, kMin, 0},
+              {"32 bits, signed", int32, 0x80000000, -2147483648LL},
+              {"32 bits, unsigned", {0, 4294967295, 32, false}, -1, 4294967295},
+              {"no extension below 128", int4, 124, 12},
+              {"extension from 128 on", int4, 140, -4},
+              {"negative values count as high", int4, -9, 7},
+              {"no bits", {0, 0, 0, true}, 5, 0},
+              {"less than no bits", {0, 0, -3, true}, 5, 0}};
+  for (const auto& row : rows) {
     EXPECT_EQ(IMS_ShrinkValueToBaseType(row.v, &row.type), row.wrapped)
         << row.why << ": " << row.v;
   }
 }
 
 TEST(IntegerMathSupportTest, RangesOfUnusualWidths) {
-  const double above64 = std::nextafter(0x1p64, kInf);
-  const double below63 = std::nextafter(-0x1p63, -kInf);
-  struct Row {
+  const struct {
+    double x;
     bool isSigned;
     int width;
-    std::vector<double> matching, others;
-  };
-  // No lower bound without sign; the upper one is rounded up.
-  const Row rows[] = {{false, 8, {-1e300, kNaN}, {}},
-                      {false, 64, {0x1p64}, {above64}},
-                      {true, 64, {0x1p63, -0x1p63}, {below63}},
-                      {true, 8, {kNaN}, {}},
-                      {true, 2147483647, {kInf}, {}},
-                      {true, 1, {0.0, -1.0}, {0.5}},
-                      {true, -2147483647 - 1, {}, {0.0}}};
-  for (const auto& [isSigned, width, matching, others] : rows) {
-    SCOPED_TRACE(testing::Message() << isSigned << ", " << width);
-    for (double x : matching)
-      EXPECT_TRUE(IMS_ValueMatchesSignednessAndWidth(x, isSigned, width)) << x;
-    for (double x : others)
-      EXPECT_FALSE(IMS_ValueMatchesSignednessAndWidth(x, isSigned, width)) << x;
+    bool matches;
+  } rows[] = {{-1e300, false, 8, true},  // no lower bound without sign
+              {kNaN, false, 8, true},
+              {kNaN, true, 8, true},
+              {0x1p64, false, 64, true},  // the upper one is rounded up
+              {std::nextafter(0x1p64, kInf), false, 64, false},
+              {0x1p63, true, 64, true},
+              {-0x1p63, true, 64, true},
+              {std::nextafter(-0x1p63, -kInf), true, 64, false},
+              {kInf, true, 2147483647, true},
+              {0.0, true, 1, true},
+              {-1.0, true, 1, true},
+              {0.5, true, 1, false},
+              {0.0, true, -2147483647 - 1, false}};
+  for (const auto& [x, isSigned, width, matches] : rows) {
+    EXPECT_EQ(IMS_ValueMatchesSignednessAndWidth(x, isSigned, width), matches)
+        << x << " in " << width << " bits";
   }
+}
+
+// Both sides of every power of two that the type holds.
+TEST(Log2Test, IsTheIndexOfTheHighestBit) {
+  const auto check = [](auto zero) {
+    using T = decltype(zero);
+    EXPECT_EQ(IMS_Log2(zero), 0);
+    for (int bit = 1; bit < std::numeric_limits<T>::digits; ++bit) {
+      const T power = T{1} << bit;
+      EXPECT_EQ(IMS_Log2(power - 1), bit - 1);
+      EXPECT_EQ(IMS_Log2(power), bit);
+      EXPECT_EQ(IMS_Log2(power + (power - 1)), bit);
+    }
+    if (std::numeric_limits<T>::is_signed) {
+      EXPECT_EQ(IMS_Log2(std::numeric_limits<T>::min()), -1);
+      EXPECT_EQ(IMS_Log2(zero - 1), -1);
+    }
+  };
+  check(0U);
+  check(0);
+  check(0L);
+  check(0LL);
 }
 
 }  // namespace

@@ -1,33 +1,32 @@
 #include "Strings/HX_StringParser.h"
 
+#include <algorithm>
+
 #include "support/HX_TestFixture.h"
 
 namespace {
 
 TEST(StringParserTest, RemoveCharsTrimsTheChosenEnds) {
   const struct {
-    const char* text;
-    const char* chars;
+    const char *text, *chars;
     const char* trimmed[4];  // leading, trailing, both, unknown modes
   } rows[] = {{"  ab  ", " ", {"ab  ", "  ab", "ab", "  ab  "}},
               {"xxx", "x", {"", "", "", "xxx"}},
               {"", "x", {"", "", "", ""}},
               {"xyaxyx", "yx", {"axyx", "xya", "a", "xyaxyx"}},
               {"aba", "", {"aba", "aba", "aba", "aba"}}};
-  for (const auto& row : rows)
-    for (int mode : {0, 1, 2, 3, 4, -1})
-      EXPECT_EQ(HX_StringParser().removeChars(
-                    row.text, row.chars,
-                    static_cast<HX_StringParser::remove_etp>(mode)),
-                row.trimmed[mode < 0 || mode > 3 ? 3 : mode])
-          << row.text << " in mode " << mode;
+  for (const auto& [text, chars, trimmed] : rows)
+    for (int mode : {0, 1, 2, 3, 4, -1}) {
+      const auto ends = static_cast<HX_StringParser::remove_etp>(mode);
+      EXPECT_EQ(HX_StringParser().removeChars(text, chars, ends),
+                trimmed[mode < 0 ? 3 : std::min(mode, 3)])
+          << text << " in mode " << mode;
+    }
 }
 
 TEST(StringParserTest, PairsFillTheSlotsOfTheirKeys) {
   const struct {
-    const char* text;
-    const char* keyValueSep;
-    const char* pairSep;
+    const char *text, *keyValueSep, *pairSep;
     const char* keys;    // divided by ','
     const char* values;  // each ended by ','; every slot held "-" before
     const char* unrecognised;
@@ -62,11 +61,7 @@ TEST(StringParserTest, PairsFillTheSlotsOfTheirKeys) {
 
 TEST(StringParserTest, KeywordsDivideTheText) {
   const struct {
-    const char* text;
-    const char* start;
-    const char* stop;
-    const char* embedded;
-    const char* outside;
+    const char *text, *start, *stop, *embedded, *outside;
   } rows[] = {{"x[[abc]]y", "[[", "]]", "abc", "xy"},
               {"x[[abc", "[[", "]]", "abc", "x"},
               {"[[a]]B[[c]]", "[[", "]]", "ac", "B"},
