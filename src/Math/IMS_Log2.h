@@ -18,13 +18,14 @@ constexpr int IMS_Log2(unsigned int value) {
 
 /// \copydoc IMS_Log2(unsigned int)
 constexpr int IMS_Log2(long long value) {
-  if (value < 0) return -1;
+  if (value <= 0) [[unlikely]] {
+    return value == 0 ? 0 : -1;
+  }
   return static_cast<int>(
-             std::bit_width(static_cast<unsigned long long>(value) | 1U)) -
+             std::bit_width(static_cast<unsigned long long>(value))) -
          1;
 }
 
-/// \copydoc IMS_Log2(unsigned int)
 constexpr int IMS_Log2(int value) {
   return IMS_Log2(static_cast<long long>(value));
 }
