@@ -180,7 +180,10 @@ class PlainWatches {
     std::erase_if(m_Registry, [&](const auto& e) { return e.second == &w; });
   }
   void start(PlainWatch& w) {
-    w.start == 0 ? w.start = m_Clock.ticks : ++misuses;
+    if (w.start == 0)
+      w.start = m_Clock.ticks;
+    else
+      ++misuses;
   }
   void stop(PlainWatch& w) {
     if (w.start == 0) {
