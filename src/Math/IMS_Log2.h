@@ -26,6 +26,7 @@ constexpr int IMS_Log2(long long value) {
          1;
 }
 
+/// \copydoc IMS_Log2(unsigned int)
 constexpr int IMS_Log2(int value) {
   return IMS_Log2(static_cast<long long>(value));
 }
