@@ -15,12 +15,12 @@
 #define NAMESPACE_HXCXSTRINGIDSERVER_H
 
 #include <cstddef>
-#include <cstdint>
 
 #include "Control/HX_Allocated.h"
 #include "HX_Export.h"
 #include "NameSpace/HX_KeyTable.h"
 #include "NameSpace/HX_PlainArray.h"
+#include "NameSpace/HX_TextArena.h"
 
 class KyCXString;
 
@@ -72,14 +72,6 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
  private:
   static constexpr unsigned kBucketCount = 1024;
 
-  // Followed in the same block by the text and its terminating zero.
-  struct Entry {
-    std::int32_t length;  // without the zero
-    std::int32_t id;
-
-    char* text() { return reinterpret_cast<char*>(this + 1); }
-  };
-
   struct Bucket {
     unsigned arrivals = 0;
     unsigned firstFar = 0;  // the arrival that farTexts starts with
@@ -87,8 +79,8 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
   };
 
   struct Table : HX_Allocated {
-    HX_KeyTable<Entry*> index;      // by the hash of the text
-    HX_PlainArray<Entry*> entries;  // in the order of arrival; owned
+    HX_KeyTable<int> index;  // the ids, by the hash of the text
+    HX_TextArena texts;
     Bucket buckets[kBucketCount];
     // The text of each id below nearSize, null for ids not handed out. Where
     // the buckets fill evenly, nearly all ids are near.
@@ -98,8 +90,7 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
   };
 
   static unsigned bucketOf(const char* text, std::size_t length);
-  static Entry* newEntry(unsigned id, const char* text, std::size_t length);
-  Entry* add(int hash, const char* text, std::size_t length);
+  bool add(int hash, const char* text, std::size_t length, int& id);
   bool keepText(unsigned id, const char* text);
   void growNear();
   void fillNear(const Bucket& bucket, unsigned number);
