@@ -109,13 +109,13 @@ def lex(source):
         token = Token(kind, match.group(), match.start(), match.end())
         if kind in ("comment", "directive"):
             continue
+        if skip_to == "\n" and token.start > line_end:
+            skip_to = None
         if skip_to is None and token.text in ("static_assert", "using", "typedef"):
             skip_to = ";"
         elif skip_to is None and token.text == "template":
             skip_to = "\n"
             line_end = source.find("\n", token.end)
-        if skip_to == "\n" and token.start > line_end:
-            skip_to = None
         if skip_to is None:
             tokens.append(token)
         elif skip_to == token.text:
