@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <limits>
+#include <optional>
 
 #include "NameSpace/implNameSpace/HX_IndexRuns.h"
 #include "NameSpace/implNameSpace/HX_TextHash.h"
@@ -17,19 +18,20 @@ constexpr int kLongestCode = 7;
 
 // A name read as "<head>_<letter code>".
 struct Variant {
-  int headLength = -1;        // negative: the name does not read so
-  int index = 0;              // of the letter code
-  int firstOfNextLength = 0;  // the first index with a longer code
+  int headLength;
+  int index;              // of the letter code
+  int firstOfNextLength;  // the first index with a longer code
 };
 
-// A letter code is a bijective numeral of base 26, lowest letter first.
-Variant readVariant(const KyCXString& name) {
+// Nothing if the name does not read so. A letter code is a bijective numeral of
+// base 26, lowest letter first.
+std::optional<Variant> readVariant(const KyCXString& name) {
   const int last = name.length() - 1;
   int from = last;
   while (from >= 0 && last - from < kLongestCode && name[from] >= 'a' &&
          name[from] <= 'z')
     --from;
-  if (from < 0 || from == last || name[from] != '_') return {};
+  if (from < 0 || from == last || name[from] != '_') return std::nullopt;
   std::int64_t value = 0;
   std::int64_t smallestLonger = 1;
   for (int at = last; at > from; --at) {
@@ -37,9 +39,9 @@ Variant readVariant(const KyCXString& name) {
     smallestLonger = smallestLonger * kLetters + 1;
   }
   constexpr std::int64_t kMaximum = std::numeric_limits<int>::max();
-  if (value > kMaximum) return {};
-  return {from, static_cast<int>(value - 1),
-          static_cast<int>(std::min(smallestLonger - 1, kMaximum))};
+  if (value > kMaximum) return std::nullopt;
+  return Variant{from, static_cast<int>(value - 1),
+                 static_cast<int>(std::min(smallestLonger - 1, kMaximum))};
 }
 
 int hashOf(const KyCXString& text) {
@@ -92,12 +94,12 @@ void HX_LimitedNameSpace::remove(const KyCXString& s) {
   if (name == nullptr) return;
   name->isDefined = false;
   name->counter = 0;
-  const Variant variant = readVariant(s);
-  Name* const head =
-      variant.headLength < 0 ? nullptr : find(s.head(variant.headLength));
-  if (head != nullptr) {
-    head->taken.remove(variant.index);
-    dropIfUnused(head);
+  if (const auto variant = readVariant(s)) {
+    Name* const head = find(s.head(variant->headLength));
+    if (head != nullptr) {
+      head->taken.remove(variant->index);
+      dropIfUnused(head);
+    }
   }
   dropIfUnused(name);
 }
@@ -171,12 +173,12 @@ int HX_LimitedNameSpace::searchVariant(const Name& base, const KyCXString& in,
 //         the letter codes have one length, its variants have one head, and
 //         those known to be taken are passed over
 int HX_LimitedNameSpace::noteTaken(const KyCXString& name, int index) {
-  const Variant variant = readVariant(name);
-  if (variant.headLength < 0 || variant.index != index) return index + 1;
-  Name* const head = findOrMake(name.head(variant.headLength));
+  const auto variant = readVariant(name);
+  if (!variant || variant->index != index) return index + 1;
+  Name* const head = findOrMake(name.head(variant->headLength));
   if (head == nullptr) return index + 1;
   head->taken.add(index);
-  return std::min(head->taken.firstMissing(index), variant.firstOfNextLength);
+  return std::min(head->taken.firstMissing(index), variant->firstOfNextLength);
 }
 
 void HX_LimitedNameSpace::adaptStringLength(KyCXString& s) {

@@ -94,6 +94,7 @@ TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
           s = std::next(plain.counters.begin(),
                         static_cast<long>(random() % plain.counters.size()))
                   ->first;
+        if (random() % 8 == 0) PlainNames::shorten(s);
         if (random() % 1000 < row.switching)
           m_Options.setLimitVariableNameLength(random() % 2 == 0);
         if (random() % 500 == 0) {
@@ -131,9 +132,28 @@ TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
         ASSERT_EQ(derived, isDerived && (operation == 1 || operation == 3))
             << i;
       }
+      for (const auto& [text, counter] : plain.counters) names.remove(text);
+      EXPECT_EQ(memory.liveBlocks(), 1) << "the table of no names";
       names = HX_LimitedNameSpace();
       EXPECT_EQ(memory.liveBlocks(), 0);
     }
+  }
+}
+
+// Without a memory of what is taken this looks at 10^9 names.
+TEST_F(LimitedNameSpaceTest, ManyNamesCompeteForTheVariantsOfOneHead) {
+  constexpr int kCount = 40000;
+  m_Options.setLimitVariableNameLength(true);
+  HxCNames naming;
+  HX_LimitedNameSpace names;
+  for (int i = 0; i < kCount; ++i) {
+    KyCXString name = KyCXString("the_same_thirty_characters_and_") +
+                      KyCXString(i, false, true);
+    KyCXString expected = name;
+    naming.appendSuffix(expected, i);
+    names.add(name);
+    names.addUnique(name);
+    ASSERT_EQ(name, expected);
   }
 }
 

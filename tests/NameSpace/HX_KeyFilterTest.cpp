@@ -1,0 +1,34 @@
+#include "NameSpace/HX_KeyFilter.h"
+
+#include <gtest/gtest.h>
+
+#include <random>
+#include <unordered_set>
+
+namespace {
+
+TEST(KeyFilterTest, PassesEveryKeyOfTheTableAndFewOthers) {
+  HX_KeyTable<int> table;
+  HX_KeyFilter filter;
+  std::unordered_set<int> keys;
+  std::mt19937 random(1);
+  const auto draw = [&] { return static_cast<int>(random()); };
+  EXPECT_TRUE(filter.mayHold(draw())) << "it has no bits yet";
+  while (keys.size() < 9000) {
+    const int key = draw();
+    if (!keys.insert(key).second) continue;
+    table.add(key, 0);
+    filter.noteAdded(key, table);
+    if (keys.size() % 1000 != 0) continue;
+    for (int held : keys) ASSERT_TRUE(filter.mayHold(held));
+    if (keys.size() == 1000) continue;
+    int passed = 0;
+    constexpr int kTries = 16000;
+    for (int i = 0; i < kTries; ++i) passed += filter.mayHold(draw()) ? 1 : 0;
+    // One in 16 and five standard deviations, besides the keys themselves.
+    EXPECT_LT(passed, kTries / 16 + 150) << keys.size();
+    EXPECT_GT(passed, kTries / 64) << "more bits than needed";
+  }
+}
+
+}  // namespace
