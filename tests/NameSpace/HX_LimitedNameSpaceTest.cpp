@@ -140,9 +140,9 @@ TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
   }
 }
 
-// Without a memory of what is taken this looks at 10^9 names.
+// Without a memory of what is taken this looks at 200 million names.
 TEST_F(LimitedNameSpaceTest, ManyNamesCompeteForTheVariantsOfOneHead) {
-  constexpr int kCount = 40000;
+  constexpr int kCount = 20000;
   m_Options.setLimitVariableNameLength(true);
   HxCNames naming;
   HX_LimitedNameSpace names;
