@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <map>
 #include <memory>
 #include <random>
 
@@ -22,12 +23,7 @@ namespace {
 using SrcRefs = std::vector<const HxCSrcRef*>;
 using IteratorPtr = std::unique_ptr<HX_Iterator<const HxCSrcRef*>>;
 
-int thrownBy(const HX_Iterator<const HxCSrcRef*>& it) try {
-  it.currentItem();
-  return 0;
-} catch (int thrown) {
-  return thrown;
-}
+using SrcRefSetTest = HX_TestFixture;
 
 // Compares all that a set tells with the plain form.
 void expectHolds(const HxCSrcRefSet& set, const SrcRefs& expected) {
@@ -43,16 +39,12 @@ void expectHolds(const HxCSrcRefSet& set, const SrcRefs& expected) {
     EXPECT_EQ(walked, expected);
     it->next();
     EXPECT_TRUE(it->isDone());
-    EXPECT_EQ(thrownBy(*it), -1);
+    EXPECT_THAT([&] { it->currentItem(); }, testing::Throws<int>(-1));
     it->first();
   }
 }
 
-class SrcRefSetTest : public HX_TestFixture {
- protected:
-  ~SrcRefSetTest() override { HX_DdTree::instance().clear(); }
-};
-
+// A set of one reference at most needs no memory.
 TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
   const unsigned seed = std::random_device()();
   SCOPED_TRACE(seed);
@@ -64,160 +56,120 @@ TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
     const std::size_t to = random() % sets.size();
     const std::size_t from = random() % sets.size();
     const std::size_t ref = random() % (refs.size() + 1);
-    const HxCSrcRef* srcRef = ref < refs.size() ? &refs[ref] : nullptr;
-    const unsigned action = random() % 8;
-    SrcRefs added{srcRef};
-    if (action == 0) {
+    const HxCSrcRef* const srcRef = ref < refs.size() ? &refs[ref] : nullptr;
+    const std::size_t action = random() % 7;
+    SrcRefs added;
+    if (action > 0) added = action < 3 ? plains[from] : SrcRefs{srcRef};
+
+    const int heapBlocks = HX_HeapBlocks();
+    if (action == 0)
       sets[to].clear();
-      added.clear();
-    } else if (action == 1) {
-      sets[to] = srcRef;
-    } else if (action == 2) {
+    else if (action == 1)
       sets[to] = sets[from];
-      added = plains[from];
-    } else if (action == 3) {
+    else if (action == 2)
       sets[to].addSrcRef(sets[from]);
-      added = plains[from];
-    } else {
+    else
       sets[to].addSrcRef(srcRef);
-    }
+    const bool askedForMemory = HX_HeapBlocks() != heapBlocks;
+
     SrcRefs& plain = plains[to];
-    if (action < 3) plain.clear();
+    if (action < 2) plain.clear();
     for (const HxCSrcRef* r : added)
       if (r != nullptr && std::count(plain.begin(), plain.end(), r) == 0)
         plain.push_back(r);
+    EXPECT_TRUE(plain.size() > 1 || !askedForMemory);
     expectHolds(sets[to], plain);
     expectHolds(HxCSrcRefSet(sets[from]), plains[from]);
     ASSERT_FALSE(HasFailure()) << "step " << step;
   }
 }
 
-TEST_F(SrcRefSetTest, OneReferenceNeedsNoMemoryTheSecondDoes) {
-  const HxCSrcRef a;
-  const HxCSrcRef b;
-  HX_CountingController controller;
-  const int before = HX_HeapBlocks();
-  HxCSrcRefSet set;
-  for (const HxCSrcRef* ref : {static_cast<const HxCSrcRef*>(nullptr), &a, &a})
-    set.addSrcRef(ref);
-  HxCSrcRefSet copy(set);
-  copy.addSrcRef(set);
-  copy = set;
-  copy = HxCSrcRefSet();
-  copy.addSrcRef(set);
-  int visits = 0;
-  copy.forEach([&](const HxCSrcRef*) { ++visits; });
-  EXPECT_EQ(visits, 1);
-  EXPECT_EQ(HX_HeapBlocks(), before);
-  EXPECT_EQ(controller.allocated(), 0);
-  copy.addSrcRef(&b);
-  EXPECT_GT(HX_HeapBlocks(), before);
-  delete copy.createIterator();
-  EXPECT_EQ(controller.allocated(), 1);  // an iterator is the library's own
-  EXPECT_EQ(controller.liveBlocks(), 0);
-  controller.fail();
-  EXPECT_EQ(copy.createIterator(), nullptr);
-}
-
-TEST_F(SrcRefSetTest, ServerOwnsEachReferenceItHandsOut) {
-  HX_CountingController controller;
-  {
-    HxCSrcRefServer server;
-    EXPECT_TRUE(server.boot());
-    for (int count = 0; count < 3; ++count) {
-      HxCInternalSrcRef* ref = server.getSrcRef();
-      ref->setLocation("a file name that needs memory of its own.cpp", 1);
-    }
-    EXPECT_TRUE(server.shutdown());
-    EXPECT_EQ(controller.liveBlocks(), 3);
-  }
-  EXPECT_EQ(controller.liveBlocks(), 0);
+TEST_F(SrcRefSetTest, WhatIsHandedOutIsOwnedOrNullWithoutMemory) {
   HX_WithoutEachBlock("collect references", [] {
     const HX_Block block("b");
-    HxCSrcRefServer references;
+    HxCSrcRefServer server;
     HxCSrcRefSet set(block.getSrcRef());
-    for (int i = 0; i < 3; ++i) set.addSrcRef(references.getSrcRef());
+    for (int i = 0; i < 3; ++i) set.addSrcRef(server.getSrcRef());
     const std::unique_ptr<HxCSrcRef> clone(HxCDdSrcRef(1).clone());
-    return set.getSrcRefCnt() == 4 && clone;
+    const IteratorPtr it(set.createIterator());
+    return server.boot() && server.shutdown() && set.getSrcRefCnt() == 4 &&
+           clone && it;
   });
 }
 
-TEST_F(SrcRefSetTest, ServerSortsTheReferencesOfASet) {
-  const HX_Block block("b");
-  const HxCSrcRef* const b = block.getSrcRef();
-  HX_BlockDataBase blocks;
-  const HX_InputBlockId id(blocks, 1);
-  const HxCInputBlockSrcRef input(id);
-  const HxCDdSrcRef dd1(1);
-  const HxCDdSrcRef dd2(2);
-  const HxCInternalSrcRef internal;
-  const HxCSrcRef plain;
-  const struct {
-    SrcRefs refs;
-    std::array<const HxCSrcRef*, 3> found;  // block, dd, other
-  } rows[] = {
-      {{}, {nullptr, nullptr, nullptr}},
-      {{b, &dd1, &internal}, {b, &dd1, &internal}},
-      {{&dd1, &dd2, &internal, &plain}, {nullptr, &dd2, &plain}},
-      {{b, &input}, {&input, nullptr, nullptr}},
-      {{&input, &dd2, b, &dd1}, {b, &dd1, nullptr}},
-  };
-  for (const auto& row : rows) {
+// References of all kinds, by letter.
+class SrcRefKindsTest : public HX_TestFixture {
+ protected:
+  ~SrcRefKindsTest() override { m_Tree.clear(); }
+
+  HX_DdTree& m_Tree = HX_DdTree::instance();
+  const HxCDdSrcRef m_X{m_Tree.add("//DD0/Pool/CGTmpData/x")};
+  const HxCDdSrcRef m_Y{m_Tree.add("//DD0/Pool/CGTmpData/y")};
+  const HxCDdSrcRef m_V{m_Tree.add("//DD0/Pool/cgtmpdata/v")};
+  const HxCDdSrcRef m_W{m_Tree.add("//DD0/Pool/w")};
+  const HxCDdSrcRef m_SameAsW{m_W.getDdHandle()};
+  const HX_Block m_Block{"b"};
+  HX_BlockDataBase m_Blocks;
+  const HX_InputBlockId m_Id{m_Blocks, 1};
+  const HxCInputBlockSrcRef m_InputBlock{m_Id};
+  const HxCInternalSrcRef m_Internal;
+  const HxCSrcRef m_Plain;
+  const std::map<char, const HxCSrcRef*> m_Refs{
+      {'x', &m_X},          {'y', &m_Y},        {'v', &m_V},
+      {'w', &m_W},          {'W', &m_SameAsW},  {'b', m_Block.getSrcRef()},
+      {'n', &m_InputBlock}, {'i', &m_Internal}, {'p', &m_Plain},
+      {'0', nullptr}};
+};
+
+TEST_F(SrcRefKindsTest, ServerSortsTheReferencesOfASet) {
+  // The references of a set; of them a block, one of the data dictionary and
+  // another.
+  const std::string rows[][2] = {{"", "000"},
+                                 {"bxi", "bxi"},
+                                 {"xwip", "0wp"},
+                                 {"bn", "n00"},
+                                 {"nwbx", "bx0"}};
+  for (const auto& [refs, sorted] : rows) {
     HxCSrcRefSet set;
-    for (const HxCSrcRef* ref : row.refs) set.addSrcRef(ref);
-    const HxCSrcRefSet* const given = row.refs.empty() ? nullptr : &set;
+    for (const char ref : refs) set.addSrcRef(m_Refs.at(ref));
     for (unsigned wanted = 0; wanted < 8; ++wanted) {
-      std::array<const HxCSrcRef*, 3> found{&plain, &plain, &plain};
-      std::array<const HxCSrcRef*, 3> expected = found;
-      const auto place = [&](unsigned i) -> const HxCSrcRef** {
-        if ((wanted >> i & 1) == 0) return nullptr;
-        expected[i] = row.found[i];
-        return &found[i];
+      SCOPED_TRACE(testing::Message() << refs << " wanted " << wanted);
+      const HxCSrcRef untouched;
+      SrcRefs found(3, &untouched);
+      const auto place = [&](unsigned i) {
+        return (wanted >> i & 1) != 0 ? &found[i] : nullptr;
       };
-      EXPECT_EQ(HxCSrcRefServer::getSpecificSrcRefFromSet(given, place(0),
-                                                          place(1), place(2)),
-                0);
-      EXPECT_EQ(found, expected);
+      EXPECT_EQ(
+          HxCSrcRefServer::getSpecificSrcRefFromSet(
+              refs.empty() ? nullptr : &set, place(0), place(1), place(2)),
+          0);
+      for (unsigned i = 0; i < 3; ++i)
+        EXPECT_EQ(found[i],
+                  place(i) != nullptr ? m_Refs.at(sorted[i]) : &untouched);
     }
   }
 }
 
-// The references of the comparison table, by letter.
-TEST_F(SrcRefSetTest, ComparisonsOfAllPairs) {
-  HX_DdTree& tree = HX_DdTree::instance();
-  const HxCDdSrcRef x(tree.add("//DD0/Pool/CGTmpData/x"));
-  const HxCDdSrcRef y(tree.add("//DD0/Pool/CGTmpData/y"));
-  const HxCDdSrcRef v(tree.add("//DD0/Pool/cgtmpdata/v"));
-  const HxCDdSrcRef w(tree.add("//DD0/Pool/w"));
-  const HxCDdSrcRef sameAsW(w.getDdHandle());
-  const HxCSrcRef plain;
-  const struct {
-    const HxCSrcRef* a;
-    const HxCSrcRef* b;
-    const char* holds;  // d both, D different, u user script, n not from one
-    int which;          // 7: not written
-  } rows[] = {
-      {&x, &y, "dDu", 7},        {&x, &x, "du", 7},
-      {&x, &w, "dD", 7},         {&w, &x, "dD", 7},
-      {&v, &w, "dDn", 7},        {&w, &sameAsW, "d", 7},
-      {&w, nullptr, "", 0},      {nullptr, &w, "", 1},
-      {&x, &plain, "", 0},       {&plain, &x, "", 1},
-      {&plain, &plain, "", -1},  {nullptr, nullptr, "", -1},
-      {nullptr, &plain, "", -1},
-  };
+TEST_F(SrcRefKindsTest, PairsAreCompared) {
+  // d both from the data dictionary, D different, u both from user scripts, n
+  // neither; o only one, followed by which: 7 where it is not written.
+  const std::string rows[][2] = {{"xy", "dDu7"}, {"xx", "du7"},  {"xw", "dD7"},
+                                 {"wx", "dD7"},  {"vw", "dDn7"}, {"wW", "d7"},
+                                 {"w0", "o0"},   {"0w", "o1"},   {"wp", "o0"},
+                                 {"pw", "o1"},   {"pp", "-1"},   {"00", "-1"},
+                                 {"0p", "-1"}};
   const HxCSrcRefCompare compare;
-  for (const auto& row : rows) {
-    SCOPED_TRACE(&row - rows);
+  for (const auto& [pair, expected] : rows) {
+    const HxCSrcRef* const a = m_Refs.at(pair[0]);
+    const HxCSrcRef* const b = m_Refs.at(pair[1]);
     std::string holds;
-    if (compare.bothFromDD(row.a, row.b)) holds += 'd';
-    if (compare.bothFromDDButDifferent(row.a, row.b)) holds += 'D';
-    if (compare.bothFromUserScript(row.a, row.b)) holds += 'u';
-    if (compare.differentDdSrcRefNotFromUserScript(row.a, row.b)) holds += 'n';
-    EXPECT_EQ(holds, row.holds);
+    if (compare.bothFromDD(a, b)) holds += 'd';
+    if (compare.bothFromDDButDifferent(a, b)) holds += 'D';
+    if (compare.bothFromUserScript(a, b)) holds += 'u';
+    if (compare.differentDdSrcRefNotFromUserScript(a, b)) holds += 'n';
     int which = 7;
-    EXPECT_EQ(compare.onlyOneFromDD(row.a, row.b, which),
-              row.which == 0 || row.which == 1);
-    EXPECT_EQ(which, row.which);
+    if (compare.onlyOneFromDD(a, b, which)) holds += 'o';
+    EXPECT_EQ(holds + std::to_string(which), expected) << pair;
   }
 }
 
