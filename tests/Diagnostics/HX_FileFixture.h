@@ -31,11 +31,6 @@ class HX_FileFixture : public HX_TestFixture {
     return std::string(std::istreambuf_iterator<char>(file), {});
   }
 
-  /// Makes it impossible to open \p name, even for a privileged user.
-  static void obstruct(const char* name) {
-    std::filesystem::create_directory(name);
-  }
-
  private:
   std::filesystem::path m_Previous = std::filesystem::current_path();
 };

@@ -9,7 +9,6 @@
 
 namespace {
 
-using testing::EndsWith;
 using testing::HasSubstr;
 using testing::StartsWith;
 
@@ -22,6 +21,7 @@ class DebugServerTest : public HX_FileFixture {
  protected:
   DebugServerTest() {
     HX_SetCommandWindow([this](const char* text) { m_Window += text; });
+    m_Clock.frequency = 2'000'000;
     m_Clock.ticks = 1;
     m_Server.boot();
   }
@@ -33,94 +33,112 @@ class DebugServerTest : public HX_FileFixture {
   HX_ManualClock m_Clock;
   HxCDebugServer m_Server;
   std::string m_Window;
+  char m_Entry[5] = "* %s";
 };
 
-// A START or END line: the text filled up to 40 columns, then the time.
-std::string line(std::string text, const std::string& time) {
+// A START or END line: the text filled up or cut to 40 columns, then the time.
+std::string line(std::string text, const std::string& time = "") {
   text.resize(40, '.');
-  return text + time + "\n";
-}
-std::string startLine(const std::string& text) {
-  return line(text, "              ");
-}
-
-TEST_F(DebugServerTest, NestedRunTimesAreLoggedAndPrinted) {
-  m_Server.runTimeStart("A");
-  m_Clock.ticks += 1000;
-  m_Server.runTimeStart("100%s%n");
-  m_Clock.ticks += 234;
-  m_Server.runTimeEnd("100%s%n");
-  EXPECT_EQ(log(), startLine("START A") + startLine("  START 100%s%n") +
-                       line("  END   100%s%n", "        234\xB5s "));
-  std::filesystem::rename(kLog, "moved.txt");
-  m_Clock.ticks += 98'765'432'109;
-  m_Server.runTimeEnd("A");
-  EXPECT_EQ(content(kLog), line("END   A", " 98765433343\xB5s "))
-      << "a moved log starts anew";
-  EXPECT_EQ(m_Window,
-            content("moved.txt").substr(kHeader.size()) + content(kLog));
+  text += time.empty() ? std::string(14, ' ')
+                       : std::string(11 - time.size(), ' ') + time + "\xB5s ";
+  return text + "\n";
 }
 
-TEST_F(DebugServerTest, EndsThatDoNotMatchAreReportedAndNotHeard) {
-  const HX_RunRecorder listener;
-  m_Clock.ticks = 10;
-  for (const char* name : {"A", "B", "C"}) m_Server.runTimeStart(name);
-  m_Clock.ticks += 7;
+TEST_F(DebugServerTest, RunTimesAreLoggedAndPrintedAsTheyNest) {
+  const std::string missing = "Missing END runtimes\n";
   const std::string invalid =
       "Invalid END runtime - no active START found with that name\n";
-  const std::string rows[][2] = {
-      {"X", invalid},
-      {"B", "Missing END runtimes\n" + line("  END   B", "          7\xB5s ")},
-      {"C", invalid},
-      {"A", line("END   A", "          7\xB5s ")}};
-  for (const auto& [name, written] : rows) {
-    m_Window.clear();
-    m_Server.runTimeEnd(name.c_str());
-    EXPECT_EQ(m_Window, written) << name;
-    EXPECT_THAT(log(), EndsWith(written));
+  const std::string name63(63, 'n');
+  struct Step {
+    std::string step;  // + and a name starts, - and a name ends a run time
+    std::string written;
+  };
+  std::vector<Step> steps = {
+      {"+A", line("START A")},
+      {"+100%s%n", line("  START 100%s%n")},
+      {"-100%s%n", line("  END   100%s%n", "7")},
+      {"-X", invalid},
+      {"+B", line("  START B")},
+      {"+C", line("    START C")},
+      {"-B", missing + line("  END   B", "14")},
+      {"-C", invalid},
+      {"+" + name63 + "1234567", line("  START " + name63)},
+      {"-" + name63.substr(1), invalid},
+      {"-" + name63 + "7654321", line("  END   " + name63, "14")},
+      {"-A", line("END   A", "77")},
+  };
+  for (std::size_t depth = 0; depth < 20; depth += 2)
+    steps.push_back({"+deep", line(std::string(depth, ' ') + "START deep")});
+  steps.push_back({"+eleventh", ""});
+  steps.push_back({"-eleventh", invalid});
+  steps.push_back({"-deep", line(std::string(18, ' ') + "END   deep", "21")});
+
+  const HX_RunRecorder listener;
+  std::string allWritten;
+  for (const auto& [step, written] : steps) {
+    const auto call = step[0] == '+' ? &HxCDebugServer::runTimeStart
+                                     : &HxCDebugServer::runTimeEnd;
+    (m_Server.*call)(step.c_str() + 1);
+    m_Clock.ticks += 14;
+    allWritten += written;
   }
-  EXPECT_EQ(listener.runs, "B 10+7 A 10+7 ");
+  EXPECT_EQ(log(), allWritten);
+  EXPECT_EQ(m_Window, allWritten);
+  EXPECT_EQ(listener.runs,
+            "100%s%n 7+7 B 28+14 " + name63 + " 56+14 A 0+77 deep 147+21 ");
 }
 
-TEST_F(DebugServerTest, LongNamesAndDeepNestingAreCut) {
-  const std::string name63(63, 'n'), other(62, 'n');
-  m_Server.runTimeStart((name63 + "1234567").c_str());
+TEST_F(DebugServerTest, WhatCannotBeWrittenIsLostWithoutAReport) {
+  std::filesystem::remove(kLog);
+  for (const char* file : {kLog, kProtocol})
+    std::filesystem::create_directory(file);
+  m_Server.shutdown();
+  EXPECT_TRUE(m_Server.boot());
   m_Server.runTimeStart(nullptr);
-  m_Server.runTimeEnd("");
-  m_Window.clear();
-  m_Server.runTimeEnd(other.c_str());
-  EXPECT_THAT(m_Window, StartsWith("Invalid END"));
-  m_Server.runTimeEnd((name63 + "7654321").c_str());
-  EXPECT_THAT(m_Window, EndsWith("END   " + std::string(34, 'n') +
-                                 "          0\xB5s \n"));
-
-  for (int i = 0; i < 10; ++i) m_Server.runTimeStart("deep");
-  m_Window.clear();
-  m_Server.runTimeStart("eleventh");
-  EXPECT_EQ(m_Window, "");
-  m_Server.runTimeEnd("eleventh");
-  EXPECT_THAT(m_Window, StartsWith("Invalid END"));
-  m_Server.runTimeEnd("deep");
-  EXPECT_THAT(m_Window, HasSubstr("\n" + std::string(18, ' ') + "END   deep."));
+  m_Server.protocolEntry(m_Entry, "lost");
+  for (const char* file : {kLog, kProtocol}) std::filesystem::remove(file);
+  m_Clock.ticks += 19'753'086'420;
+  m_Server.runTimeEnd(nullptr);
+  m_Server.protocolEntry(m_Entry, "100%s");
+  const std::string tooLong(1024, 'x');
+  m_Server.protocolEntry(m_Entry, tooLong.c_str());
+  EXPECT_EQ(content(kLog), line("END   ", "9876543210"));
+  EXPECT_EQ(content(kProtocol),
+            "000000002 * 100%s\n000000003 * " + tooLong.substr(3) + "\n");
+  EXPECT_THAT(messages(), testing::IsEmpty());
 }
 
 TEST_F(DebugServerTest, ResultsAreWrittenByteForByte) {
   // A locale with a decimal comma must not show; skipped where none is there.
   std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
-  for (int i = 0; i < 12; ++i) m_Server.count(eCounterCommon2);
-  m_Server.count(eCounterEvalMlExpr);
-  const auto interval = [&](ScEDebugClock clock, std::int64_t ticks) {
+  const auto interval = [&](ScEDebugClock clock, int microseconds) {
     m_Server.clockStart(clock);
-    m_Clock.ticks += ticks;
+    m_Clock.ticks += 2 * microseconds;
     m_Server.clockStop(clock);
   };
-  for (const int ticks : {700, 1300, 2}) interval(eClockCommon3, ticks);
+  for (int i = 0; i < 12; ++i) m_Server.count(eCounterCommon2);
+  m_Server.count(eCounterEvalMlExpr);
+  for (const int microseconds : {700, 1300, 2})
+    interval(eClockCommon3, microseconds);
   m_Server.clockStop(eClockCommon3);
   m_Server.clockStart(eClockEvalMlExpr);
-  m_Clock.ticks += 5;
-  interval(eClockEvalMlExpr, 5);
+  m_Clock.ticks += 10;
+  interval(eClockEvalMlExpr, 5);  // starts but once
   interval(eClockCommon20, 1);
   m_Server.clockReset(eClockCommon20);
+  // Values outside the enumerations are ignored.
+  for (int value : {-1, kDebugCounters, kDebugClocks, 1 << 30,
+                    std::numeric_limits<int>::min()}) {
+    const auto counter = static_cast<ScEDebugCounter>(value);
+    m_Server.count(counter);
+    EXPECT_EQ(m_Server.getCounter(counter), 0);
+    EXPECT_STREQ(HxCDebugElements::getCounterComment(counter), "");
+    if (value == kDebugCounters) continue;
+    const auto clock = static_cast<ScEDebugClock>(value);
+    interval(clock, 1);
+    m_Server.clockReset(clock);
+    EXPECT_STREQ(HxCDebugElements::getClockComment(clock), "");
+  }
   m_Server.printCurrentResults("50% done");
   std::setlocale(LC_NUMERIC, "C");
 
@@ -150,107 +168,55 @@ TEST_F(DebugServerTest, ResultsAreWrittenByteForByte) {
   EXPECT_EQ(log(), expected);
 }
 
-TEST_F(DebugServerTest, BootClearsCountersAndLogOnlyWhenNotBooted) {
-  char entry[] = "value %d %s";
+TEST_F(DebugServerTest, BootStartsAnewOnlyWhenNotBooted) {
   m_Server.count(eCounterCommon1);
   m_Server.clockStart(eClockCommon1);
   m_Server.runTimeStart("kept");
-  m_Server.protocolEntry(entry, 1, "a%d");
-  EXPECT_TRUE(m_Server.boot());
-  EXPECT_EQ(m_Server.getCounter(eCounterCommon1), 1);
-  EXPECT_NE(log(), "");
-  m_Server.protocolEntry(entry, 2, "b");
-  EXPECT_EQ(HxCDebugServer::getCurrentProtocolIndex(), 2);
-
-  EXPECT_TRUE(m_Server.shutdown());
-  m_Clock.frequency = 0;  // from now on milliseconds
+  m_Server.protocolEntry(m_Entry, "");
+  m_Clock.frequency = 0;  // the next clock counts milliseconds
   m_Clock.milliseconds = 3;
-  EXPECT_TRUE(m_Server.boot());
-  EXPECT_EQ(content(kLog), kHeader);
-  EXPECT_EQ(m_Server.getCounter(eCounterCommon1), 0);
-  EXPECT_EQ(HxCDebugServer::getCurrentProtocolIndex(), 0);
+  for (const bool isBooted : {true, false}) {
+    EXPECT_TRUE(isBooted || m_Server.shutdown());
+    EXPECT_TRUE(m_Server.boot());
+    EXPECT_EQ(content(kLog), isBooted ? kHeader + line("START kept") : kHeader);
+    EXPECT_EQ(m_Server.getCounter(eCounterCommon1), isBooted);
+    EXPECT_EQ(HxCDebugServer::getCurrentProtocolIndex(), isBooted);
+  }
   m_Server.clockStop(eClockCommon1);
   m_Server.runTimeEnd("kept");
   m_Server.printCurrentResults(nullptr);
-  EXPECT_THAT(content(kLog), HasSubstr("END   kept......"));
-  EXPECT_THAT(content(kLog), HasSubstr("\n  0         1       2000\xB5s"));
-
-  const std::string longText(1024, 'x');
-  char format[] = "%s";
-  m_Server.protocolEntry(format, longText.c_str());
-  EXPECT_EQ(content(kProtocol),
-            "000000001 value 1 a%d\n000000002 value 2 b\n"
-            "000000001 " +
-                longText.substr(1) + "\n");
-}
-
-TEST_F(DebugServerTest, ValuesOutsideTheEnumerationsAreIgnored) {
-  for (int value : {-1, kDebugCounters, kDebugClocks, 1 << 30,
-                    std::numeric_limits<int>::min()}) {
-    const auto counter = static_cast<ScEDebugCounter>(value);
-    const auto clock = static_cast<ScEDebugClock>(value);
-    m_Server.count(counter);
-    EXPECT_EQ(m_Server.getCounter(counter), 0);
-    EXPECT_STREQ(HxCDebugElements::getCounterComment(counter), "");
-    if (value == kDebugCounters) continue;
-    m_Server.clockStart(clock);
-    m_Server.clockStop(clock);
-    m_Server.clockReset(clock);
-    EXPECT_STREQ(HxCDebugElements::getClockComment(clock), "");
-  }
-  m_Server.printCurrentResults("");
-  EXPECT_THAT(log(), testing::Not(HasSubstr("000000001")));
+  EXPECT_THAT(log(), StartsWith(line("END   kept", "2000")));
+  EXPECT_THAT(log(), HasSubstr("\n  0         1       2000\xB5s"));
 }
 
 TEST_F(DebugServerTest, ModelInformationIsCutToItsFields) {
-  const std::string text(300, 't'), rule(52, '=');
-  std::string model(300, 'm');
-  HX_BuildNumber undefined, build;
-  const auto expectLogged = [&](HX_BuildNumber& given, char* name,
-                                const std::string& shownName,
-                                std::size_t version, std::size_t time) {
-    m_Server.setModelInfo(&given, name);
-    m_Server.logModelInfo();
-    EXPECT_THAT(
-        log(),
-        EndsWith("\n\n" + rule + "\nModel name: " + shownName +
-                 "\nVersion:    " + (version > 0 ? "1.2\t from " : "") +
-                 text.substr(0, version) +
-                 "\nBuildTime:  " + text.substr(0, time) +
-                 "\nBuildDate:  " + text.substr(0, time) + "\n" + rule + "\n"));
-  };
-  build.definedBuildNumber(1, 2, 0, 0, "", false, true, 0, "", "", text.c_str(),
-                           (text + "u").c_str());
-  expectLogged(build, model.data(), model.substr(41), 89, 49);
-  expectLogged(undefined, nullptr, "", 0, 0);
-}
-
-TEST_F(DebugServerTest, UnopenableFilesAreNotReported) {
-  std::filesystem::remove(kLog);
-  obstruct(kLog);
-  obstruct(kProtocol);
-  m_Server.shutdown();
-  EXPECT_TRUE(m_Server.boot());
-  m_Server.runTimeStart("A");
-  m_Server.runTimeEnd("A");
-  m_Server.printCurrentResults("x");
+  const std::string date(50, 'd'), time(50, 't'), rule(52, '=');
+  std::string model(260, 'm');
+  HX_BuildNumber build;
+  build.definedBuildNumber(1, 2, 0, 0, "", false, true, 0, "", "", date.c_str(),
+                           time.c_str());
+  m_Server.setModelInfo(&build, model.data());
   m_Server.logModelInfo();
-  char entry[] = "%d";
-  m_Server.protocolEntry(entry, 1);
-  EXPECT_EQ(HxCDebugServer::getCurrentProtocolIndex(), 1);
-  EXPECT_THAT(m_Window, HasSubstr("END   A"));
-  EXPECT_THAT(messages(), testing::IsEmpty());
+  m_Server.setModelInfo(nullptr, nullptr);
+  m_Server.logModelInfo();
+  EXPECT_EQ(log(), "\n\n" + rule + "\nModel name: " + model.substr(1) +
+                       "\nVersion:    1.2\t from " + date + " " +
+                       time.substr(12) + "\nBuildTime:  " + time.substr(1) +
+                       "\nBuildDate:  " + date.substr(1) + "\n" + rule +
+                       "\n\n\n" + rule +
+                       "\nModel name: \nVersion:    \nBuildTime:  \n"
+                       "BuildDate:  \n" +
+                       rule + "\n");
 }
 
 TEST_F(DebugServerTest, LatestInstanceIsRegistered) {
   EXPECT_EQ(HxCDebugServer::getDebugServer(), &m_Server);
   {
-    HxCDebugServer second;
+    const HxCDebugServer second;
     EXPECT_EQ(HxCDebugServer::getDebugServer(), &second);
   }
   EXPECT_EQ(HxCDebugServer::getDebugServer(), nullptr);
-  char entry[] = "%d";
-  m_Server.protocolEntry(entry, 1);
+  m_Server.protocolEntry(m_Entry, "");
   EXPECT_EQ(HxCDebugServer::getCurrentProtocolIndex(), 0);
 }
 
