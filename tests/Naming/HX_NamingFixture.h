@@ -6,6 +6,7 @@
 #include <iterator>
 #include <sstream>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "Naming/HxCNames.h"
@@ -13,6 +14,7 @@
 #include "SourceRef/HxCStateflowSrcRef.h"
 #include "platform/datadictionary/HX_DdTree.h"
 #include "platform/datatypes/HX_DataTypeServer.h"
+#include "platform/messages/HX_MessageHandler.h"
 #include "platform/model/HX_BdBlock.h"
 #include "platform/model/HX_IvData.h"
 #include "platform/model/HX_Options.h"
@@ -29,12 +31,12 @@ class HxCNamesTestAccess {
                           unsigned int retained) {
     return names.evaluateDdObjectNameMacro(result, retained, 0x200, "Gain");
   }
-  static int dollarELength(const char* text, int start) {
-    return HxCNames::findDollarELength(text, start);
-  }
-  static void osekBaseTime(double value, HxCNames::tagHxEOsekTimeBase& base,
-                           KyCXString& unit) {
+  /// The number of the base and its unit, at first "0?".
+  static std::string osekBaseTime(double value) {
+    auto base = static_cast<HxCNames::tagHxEOsekTimeBase>(0);
+    KyCXString unit("?");
     HxCNames::determineOsekBaseTime(value, base, unit);
+    return std::to_string(base) + unit.cstring();
   }
 };
 
@@ -47,6 +49,9 @@ class HX_NamingFixture : public HX_TestFixture {
   using Id = HxCCIdentifier;
 
   HX_NamingFixture() {
+    HX_MessageHandler::instance().setSink([this](const HX_Message& message) {
+      m_Numbers += " " + std::to_string(message.row);
+    });
     GLB_SetModelName("plant v2");
     GLB_SetSubsystemName("Ctrl");
     HxCGlobal::setOptions(&options);
@@ -68,31 +73,50 @@ class HX_NamingFixture : public HX_TestFixture {
   }
 
   /// An identifier with the template \p form for \p srcRef.
-  static Id identifier(const char* form, const HxCSrcRef* srcRef) {
-    Id id(form);
+  static Id identifier(const std::string& form, const HxCSrcRef* srcRef) {
+    Id id(form.c_str());
     id.setSourceRef(srcRef);
     return id;
   }
-
-  /// The formal name that \p form gives for \p srcRef.
-  std::string expand(const char* form, const HxCSrcRef* srcRef,
-                     HX_DataType* type = nullptr, unsigned int retained = 0,
-                     unsigned int provisional = 0) {
-    Id id = identifier(form, srcRef);
-    return expand(id, type, retained, provisional);
+  Id identifier(const std::string& form) {
+    return identifier(form, gain.getSrcRef());
   }
-  std::string expand(Id& id, HX_DataType* type = nullptr,
+
+  /// What \p form becomes for \p srcRef, or else for the block gain.
+  std::string expand(const std::string& form, const HxCSrcRef* srcRef,
                      unsigned int retained = 0, unsigned int provisional = 0) {
-    complete = names.createNameFromForm(id, type, retained, provisional, false);
-    changeable = id.getIdentifierChangeable(Id::eFormalName);
-    return formal(id);
+    return expandId(identifier(form, srcRef), retained, provisional);
+  }
+  std::string expand(const std::string& form) {
+    return expandId(identifier(form));
+  }
+  std::string expandId(Id id, unsigned int retained = 0,
+                       unsigned int provisional = 0) {
+    complete = names.createNameFromForm(id, type, retained, provisional, quiet);
+    noted = notedOf(id);
+    return shown(id);
   }
 
-  static std::string formal(const Id& id) {
-    return id.getCookedName(Id::eFormalName).cstring();
+  /// Both names, as "formal:actual" where they differ, and the numbers of the
+  /// messages since the last call: "x_$Q 1203".
+  std::string shown(const Id& id) {
+    const std::string formal = id.getCookedName(Id::eFormalName).cstring();
+    const std::string actual = id.getCookedName(Id::eActualName).cstring();
+    return formal + (actual == formal ? "" : ":" + actual) +
+           std::exchange(m_Numbers, "");
   }
-  static std::string actual(const Id& id) {
-    return id.getCookedName(Id::eActualName).cstring();
+
+  /// What is noted of both names: R if it may change, L, E and N if it uses
+  /// that macro. "RL:" is a formal name with two notes and an actual one
+  /// without any.
+  static std::string notedOf(const Id& id) {
+    const auto notes = [&id](Id::HxENameTypeTag name) {
+      return std::string(id.getIdentifierChangeable(name) ? "R" : "") +
+             (id.getDollarLUsed(name) ? "L" : "") +
+             (id.getDollarEUsed(name) ? "E" : "") +
+             (id.getDollarNUsed(name) ? "N" : "");
+    };
+    return notes(Id::eFormalName) + ":" + notes(Id::eActualName);
   }
 
   /// What stands between the blanks of \p text.
@@ -111,8 +135,14 @@ class HX_NamingFixture : public HX_TestFixture {
   SC_State chartState{1, 4, "Mode chart", &chart};
   SC_Model event{2, 7, "go#"};
   HxCNames names;
+  // For the next expansions, and told of the last one.
+  HX_DataType* type = nullptr;
+  bool quiet = false;
   bool complete = false;
-  bool changeable = false;
+  std::string noted;
+
+ private:
+  std::string m_Numbers;
 };
 
 #endif  // NAMING_HX_NAMINGFIXTURE_H

@@ -2,123 +2,106 @@
 
 #include <tuple>
 
-#include "platform/model/HX_Options.h"
-#include "platform/model/HxCGlobal.h"
-#include "support/HX_TestFixture.h"
+#include "Naming/HX_NamingFixture.h"
 
 namespace {
 
-using Id = HxCCIdentifier;
-constexpr auto kActive = Id::eActiveName;
-constexpr auto kActual = Id::eActualName;
-constexpr auto kFormal = Id::eFormalName;
+class CIdentifierTest : public HX_NamingFixture {
+ protected:
+  static constexpr auto kActual = Id::eActualName;
+  static constexpr auto kFormal = Id::eFormalName;
 
-TEST(CIdentifierTest, SetNameSplitsFormalAndActual) {
-  const std::tuple<const char*, const char*, const char*, bool> rows[] = {
-      {"Var", "Var", "Var$R", true}, {"In:Out", "In", "Out", true},
-      {"a:b:c", "a", "b", false},    {"", "", "$R", true},
-      {":", "", "", true},           {":b", "", "b", true},
-      {"::", "", "", false}};
-  for (const auto& [name, formal, actual, twoPartsAtMost] : rows) {
-    SCOPED_TRACE(name);
-    Id id("old:one");
+  /// The raw names, the cooked ones, what is noted and the level.
+  std::string all(const Id& id) {
+    const KyCXString raw =
+        id.getRawName(kFormal) + ":" + id.getRawName(kActual);
+    return raw.cstring() + (" " + shown(id)) + " " + notedOf(id) + " " +
+           std::to_string(id.getCookLevel());
+  }
+};
+
+TEST_F(CIdentifierTest, SetNameSplitsFormalAndActual) {
+  const std::tuple<const char*, const char*, bool> rows[] = {
+      {"Var", "Var:Var$R Var:Var$R : 0", true},
+      {"In:Out", "In:Out In:Out : 0", true},
+      {"a:b:c", "a:b a:b : 0", false},  // more than two parts
+      {"", ":$R :$R : 0", true},
+      {":", ":  : 0", true},
+      {":b", ":b :b : 0", true},
+      {"::", ":  : 0", false}};
+  Id id("old:one");
+  for (const auto& [name, result, twoPartsAtMost] : rows) {
     id.setCookLevel(Id::eCookLevelFull);
     id.setDollarXValue("x");
     id.setSignalLabel("label");
     id.setIdentifierChangeable(true, kActual);
     id.activateActualName();
-    EXPECT_EQ(id.setName(name), twoPartsAtMost);
-    EXPECT_EQ(id.getRawName(kFormal), formal);
-    EXPECT_EQ(id.getRawName(kActual), actual);
-    EXPECT_EQ(id.getCookedName(kActive), formal);
-    EXPECT_EQ(id.getCookedName(kActual), actual);
-    KyCXString x;
-    id.getDollarXValue(x);
-    EXPECT_TRUE(x.isEmpty() && id.getSignalLabel().isEmpty());
-    EXPECT_EQ(id.getCookLevel(), Id::eCookLevelRaw);
-    EXPECT_FALSE(id.getIdentifierChangeable(kActual));
+    EXPECT_EQ(id.setName(name), twoPartsAtMost) << name;
+    EXPECT_EQ(all(id), result);
+    KyCXString rest;
+    id.getDollarXValue(rest);
+    EXPECT_EQ(rest + id.getSignalLabel(), "");
+    EXPECT_TRUE(id.isFormalNameActive());
   }
 }
 
-TEST(CIdentifierTest, NamesMayBeGivenByThemselves) {
+TEST_F(CIdentifierTest, NamesMayBeGivenByThemselves) {
   Id id;
   id = "a_rather_long_name_that_needs_memory_of_its_own:b";
   id = id.getRawName(kFormal);
-  EXPECT_EQ(id.getRawName(kActual),
-            "a_rather_long_name_that_needs_memory_of_its_own$R");
   id.addPrefix(id.getRawName(kFormal));
-  EXPECT_EQ(id.getRawName(kFormal).length(), 94);
+  const std::string name = "a_rather_long_name_that_needs_memory_of_its_own";
+  const std::string both = name + name + ":" + name + name + "$R";
+  EXPECT_EQ(all(id), both + " " + both + " : 0");
   Id suffix("a");
   suffix += "b";
   suffix += suffix.getRawName(kActual);
-  EXPECT_EQ(suffix.getCookedName(kFormal), "aba$Rb");
-  EXPECT_EQ(suffix.getRawName(kActual), "a$Rba$Rb");
+  EXPECT_EQ(all(suffix), "aba$Rb:a$Rba$Rb aba$Rb:a$Rba$Rb : 0");
 }
 
-TEST(CIdentifierTest, UsedFlagsCountFromTheirLevel) {
-  struct Row {
-    const char* form;
-    bool (Id::*get)(Id::HxENameTypeTag) const;
-    void (Id::*set)(bool, Id::HxENameTypeTag);
-    int threshold;
-  };
-  const Row rows[] = {{"x_$L", &Id::getDollarLUsed, &Id::setDollarLUsed, 2},
-                      {"x_$E", &Id::getDollarEUsed, &Id::setDollarEUsed, 1},
-                      {"x_$N", &Id::getDollarNUsed, &Id::setDollarNUsed, 2}};
-  for (const Row& row : rows) {
-    for (int level = 0; level <= 3; ++level) {
-      SCOPED_TRACE(testing::Message() << row.form << " at level " << level);
-      Id with(row.form);
-      Id without("x");
-      for (Id* id : {&with, &without})
-        id->setCookLevel(static_cast<Id::HxECookLevelTag>(level));
-      (without.*row.set)(true, kFormal);
-      const bool stored = level >= row.threshold;
-      EXPECT_EQ((with.*row.get)(kActive), !stored);
-      EXPECT_EQ((without.*row.get)(kActive), stored);
-      EXPECT_FALSE((without.*row.get)(kActual));
-    }
+TEST_F(CIdentifierTest, UsedFlagsCountFromTheirLevel) {
+  const char* const ofTexts[] = {"LEN:", "LN:", ":", ":"};
+  const char* const stored[] = {":", "E:E", "LE:EN", "LE:EN"};
+  for (int level = 0; level <= 3; ++level) {
+    Id with("x_$L$E$N:");
+    Id without("LEN:$");
+    without.setDollarLUsed(true, kFormal);
+    without.setDollarEUsed(true, kFormal);
+    without.setDollarEUsed(true, kActual);
+    without.setDollarNUsed(true, kActual);
+    for (Id* id : {&with, &without})
+      id->setCookLevel(static_cast<Id::HxECookLevelTag>(level));
+    EXPECT_EQ(notedOf(with), ofTexts[level]) << level;
+    EXPECT_EQ(notedOf(without), stored[level]) << level;
   }
 }
 
-TEST(CIdentifierTest, ChangesTouchTheNamesTheySay) {
+TEST_F(CIdentifierTest, ChangesTouchTheNamesTheySay) {
   Id id("f-1:a-1");
   id.makeCIdentifier();
   id.addPrefix("p-");
   id.addPostfix("-s");
-  EXPECT_EQ(id.getRawName(kFormal), "p-f-1-s");
-  EXPECT_EQ(id.getCookedName(kFormal), "p-f_1-s");
-  EXPECT_EQ(id.getCookedName(kActual), "p-a_1-s");
-  id.setCookedName("new", kActual);
-  EXPECT_EQ(id.getCookedName(kActual), "new");
-  EXPECT_EQ(id.getRawName(kActual), "p-a-1-s");
+  EXPECT_EQ(all(id), "p-f-1-s:p-a-1-s p-f_1-s:p-a_1-s : 0");
+  id.setCookedName("new", kFormal);
+  EXPECT_EQ(all(id), "p-f-1-s:p-a-1-s new:p-a_1-s : 0");
+  // Equal are those whose raw active names are.
+  EXPECT_TRUE(id == Id("p-f-1-s:b"));
+  id.activateActualName();
+  EXPECT_FALSE(id == Id("p-f-1-s:b"));
+  EXPECT_TRUE(Id(id) == Id("p-a-1-s"));
 }
 
-TEST(CIdentifierTest, EqualityIsThatOfTheRawActiveNames) {
-  Id a("x:y");
-  Id b("x:z");
-  b.setCookedName("cooked", kFormal);
-  b.setDollarLUsed(true, kFormal);
-  EXPECT_TRUE(a == b);
-  b.activateActualName();
-  EXPECT_FALSE(a == b);
-  EXPECT_FALSE(Id(b).isFormalNameActive());
-}
-
-TEST(CIdentifierTest, AdaptSizeNeedsTheFlagAndTheOption) {
-  const KyCXString longName("abcdefghijklmnopqrstuvwxyz_0123456789");
-  HX_OptionsExt options;
-  HxCGlobal::setOptions(&options);
+TEST_F(CIdentifierTest, AdaptSizeNeedsTheFlagAndTheOption) {
+  const std::string name = "abcdefghijklmnopqrstuvwxyz_0123456789";
   for (int bits = 0; bits < 4; ++bits) {
     options.setLimitVariableNameLength((bits & 1) != 0);
-    Id id(longName);
+    Id id = identifier(name, nullptr);
     id.setIdentifierChangeable((bits & 2) != 0, kFormal);
     id.adaptSize();
-    EXPECT_EQ(id.getCookedName(kFormal),
-              bits == 3 ? "abcdefghijklmno__xyz_0123456789" : longName);
-    EXPECT_EQ(id.getCookedName(kActual).length(), bits == 3 ? 31 : 39);
+    EXPECT_EQ(shown(id), bits == 3 ? "abcdefghijklmno__xyz_0123456789:"
+                                     "abcdefghijklmno__z_0123456789$R"
+                                   : name + ":" + name + "$R");
   }
-  HxCGlobal::setOptions(nullptr);
 }
 
 }  // namespace

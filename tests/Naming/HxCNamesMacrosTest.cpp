@@ -1,108 +1,91 @@
-#include <map>
+#include <tuple>
 #include <utility>
 
 #include "Naming/HX_NamingFixture.h"
+#include "platform/datadictionary/kyddapi.h"
 #include "platform/datatypes/HX_NumericalType.h"
 
 namespace {
 
-using testing::AllOf;
-using testing::Each;
-using testing::IsEmpty;
-using testing::SizeIs;
-using testing::StartsWith;
+using testing::ElementsAre;
+using testing::HasSubstr;
 
 class MacrosTest : public HX_NamingFixture {};
 
 TEST_F(MacrosTest, EverySingleLetterMacroObeysItsBits) {
-  struct Row {
-    const char* macro;
-    unsigned int bit;
-    const char *value, *placeholder;  // for "Speed Gain" and for no object
-    bool changes = false;
-  };
-  const Row rows[] = {{"$L", 0x1, "Speed_Gain", ""},
-                      {"$B", 0x2, "Speed_Gain", "_B"},
-                      {"$S", 0x4, "Sa3", "_S", true},
-                      {"$I", 0x8, "a", ""},
-                      {"$M", 0x10, "plant v2", "plant v2"},
-                      {"$N", 0x20, "Ctrl", "Ctrl"},
-                      {"$H", 0x40, "_H", "_H"},
-                      {"$O", 0x80, "_O", "_O"},
-                      {"$C", 0x100, "_C", "_C"},
-                      {"$T", 0x400, "_T", "_T"},
-                      {"$X", 0x800, "_X", "_X"},
-                      {"$R", 0x1000, "", "", true},
-                      {"$(Type)", 0x80000, "__Type_", "__Type_"},
-                      {"$(BaseType)", 0x80000, "__BaseType_", "__BaseType_"}};
+  // Macro, its bit, the values for "Speed Gain" and for no object, and what is
+  // noted of the first.
+  const std::tuple<const char*, unsigned, const char*, const char*, const char*>
+      rows[] = {{"$L", 0x1, "Speed_Gain", "", "L:R"},
+                {"$B", 0x2, "Speed_Gain", "_B", ":R"},
+                {"$S", 0x4, "Sa3", "_S", "R:R"},
+                {"$I", 0x8, "a", "", ":R"},
+                {"$M", 0x10, "plant v2", "plant v2", ":R"},
+                {"$N", 0x20, "Ctrl", "Ctrl", "N:R"},
+                {"$H", 0x40, "_H", "_H", ":R"},
+                {"$O", 0x80, "_O", "_O", ":R"},
+                {"$C", 0x100, "_C", "_C", ":R"},
+                {"$T", 0x400, "_T", "_T", ":R"},
+                {"$X", 0x800, "_X", "_X", ":R"},
+                {"$R", 0x1000, "", "", "R:R"},
+                {"$(Type)", 0x80000, "__Type_", "__Type_", ":R"},
+                {"$(BaseType)", 0x80000, "__BaseType_", "__BaseType_", ":R"}};
   const HxCSrcRef* block = gain.getSrcRef();
-  for (const Row& row : rows) {
-    SCOPED_TRACE(row.macro);
-    EXPECT_EQ(expand(row.macro, nullptr), row.placeholder);
-    EXPECT_EQ(expand(row.macro, block, nullptr, ~row.bit, ~row.bit), row.value);
+  for (const auto& [macro, bit, value, placeholder, notes] : rows) {
+    SCOPED_TRACE(macro);
+    EXPECT_EQ(expand(macro, nullptr), placeholder);
+    EXPECT_EQ(expand(macro, block, ~bit, ~bit), value);
     EXPECT_TRUE(complete);
-    EXPECT_EQ(changeable, row.changes);
-    EXPECT_EQ(expand(row.macro, block, nullptr, row.bit), row.macro);
-    EXPECT_FALSE(complete || changeable);
-    EXPECT_EQ(expand(row.macro, block, nullptr, 0, row.bit), row.value);
+    EXPECT_EQ(noted, notes);
+    EXPECT_EQ(expand(macro, block, bit), macro);
+    EXPECT_FALSE(complete || noted[0] == 'R');
+    EXPECT_EQ(expand(macro, block, 0, bit), value);
     EXPECT_FALSE(complete);
   }
-  EXPECT_THAT(messages(), IsEmpty());
 }
 
-TEST_F(MacrosTest, LabelsLoseBlanksAndOneEnclosingPairOfBrackets) {
+TEST_F(MacrosTest, IdentifiersOwnTextsAreLabelAndX) {
+  // Label -> $L; blanks and one enclosing pair of brackets do not count.
   const std::pair<const char*, const char*> rows[] = {
       {"  <speed> ", "speed"}, {"< a b >", "a_b"}, {"", "Speed_Gain"},
-      {" <> ", "Speed_Gain"},  {"a<b", "a_b"},     {"9", "_9"}};
+      {" <> ", "Speed_Gain"},  {"a<-b", "a__b"},   {"9", "_9"}};
   for (const auto& [label, result] : rows) {
-    Id id = identifier("$L", gain.getSrcRef());
+    Id id = identifier("$L_$X");
     id.setSignalLabel(label);
-    EXPECT_EQ(expand(id), result) << label;
+    id.setDollarXValue("x-y");
+    EXPECT_EQ(expandId(id), result + std::string("_x-y"));
   }
-}
-
-TEST_F(MacrosTest, SystemNumbersReadAsSigned) {
-  car.setSubsystem("r", 0x80000000U);
-  EXPECT_EQ(expand("$S", car.getSrcRef()), "Sr0");
-  car.setSubsystem("", 0x7FFFFFFFU);
-  EXPECT_EQ(expand("$S", car.getSrcRef()), "S2147483647");
-}
-
-TEST_F(MacrosTest, ModelValuesKeepTheirCharactersWhereTheyAreNames) {
-  event.setHierarchy("a.b");
-  Id id = identifier("$H$O$X", event.getStateflowSrcRef());
-  id.setDollarXValue("x-y");
-  EXPECT_EQ(expand(id), "a.bgo_x-y");
 }
 
 TEST_F(MacrosTest, DataDictionaryNamesFallBackToWhatIdentifiesTheObject) {
   const HxCDdSrcRef known(HX_DdTree::instance().add("//DD0/Pool/K p"));
   const HxCDdSrcRef lost(4711);
   const HxCSrcRef* sf = event.getStateflowSrcRef();
+  const HxCSrcRef* block = gain.getSrcRef();
   struct Row {
     const HxCSrcRef *srcRef, *ddRef;
-    const char* result;
+    const char *result, *notes;
     unsigned int retained = 0, provisional = 0;
   };
   const Row rows[] = {
-      {sf, &known, "K p"},
-      {sf, &lost, "_D"},
-      {nullptr, sf, "_D"},  // no data dictionary reference
-      {nullptr, nullptr, "_D"},
-      {sf, nullptr, "DD_Cc7_go_"},
+      {sf, &known, "K p", ":R"},
+      {sf, &lost, "_D", ":R"},
+      {nullptr, sf, "_D", ":R"},  // no data dictionary reference
+      {nullptr, nullptr, "_D", ":R"},
+      {sf, nullptr, "DD_Cc7_go_", "R:R"},
       // Retained macros count only for $D itself.
-      {sf, nullptr, "DD_Cc7_go_", 0x1FD},
-      {gain.getSrcRef(), nullptr, "DD_Sa3_Speed_Gain", 0x6, 0x6},
-      {sf, &known, "$D", 0x200},
-      {sf, &known, "_D", 0x200, 0x200},
+      {sf, nullptr, "DD_Cc7_go_", "R:R", 0x1FD},
+      {block, nullptr, "DD_Sa3_Speed_Gain", "R:R", 0x6, 0x6},
+      {sf, &known, "$D", ":R", 0x200},
+      {sf, &known, "_D", ":R", 0x200, 0x200},
   };
-  for (const Row& row : rows) {
-    Id id = identifier("$D", row.srcRef);
-    id.setDdSourceRef(row.ddRef);
-    EXPECT_EQ(expand(id, nullptr, row.retained, row.provisional), row.result)
-        << "row " << &row - rows;
-    EXPECT_EQ(changeable, formal(id).size() > 3);
-    EXPECT_EQ(complete, ((row.retained | row.provisional) & 0x200) == 0);
+  for (const auto& [srcRef, ddRef, result, notes, retained, provisional] :
+       rows) {
+    Id id = identifier("$D", srcRef);
+    id.setDdSourceRef(ddRef);
+    EXPECT_EQ(expandId(id, retained, provisional), result);
+    EXPECT_EQ(noted, notes) << result;
+    EXPECT_EQ(complete, ((retained | provisional) & 0x200) == 0) << result;
   }
   for (unsigned int retained : {0U, 0x200U}) {
     KyCXString result("x");
@@ -111,64 +94,102 @@ TEST_F(MacrosTest, DataDictionaryNamesFallBackToWhatIdentifiesTheObject) {
   }
 }
 
-using Type = HX_DataType;
-
-HX_NumericalType isSigned{-9e18, 9e18, 64, true};
-HX_NumericalType isUnsigned{0, 9e18, 64, false};
-
-// What a word in a row below makes of a type.
-const std::map<std::string, void (*)(Type& type, Type* base)> kWords = {
-    {"struct",
-     [](Type& t, Type*) { t.setUnnamed(Type::eUnnamedStruct, false); }},
-    {"enum", [](Type& t, Type*) { t.setUnnamed(Type::eUnnamedEnum, true); }},
-    {"derived", [](Type& t, Type* b) { t.setDerivedFrom(b); }},
-    {"orphan", [](Type& t, Type*) { t.setDerivedFrom(nullptr); }},
-    {"base", [](Type& t, Type*) { t.setCut("b").setBase(); }},
-    {"array", [](Type& t, Type* b) { t.setElement(b); }},
-    {"long", [](Type& t, Type*) { t.set64BitInteger(); }},
-    {"signed", [](Type& t, Type*) { t.setNumerical(&isSigned); }},
-    {"unsigned", [](Type& t, Type*) { t.setNumerical(&isUnsigned); }},
-    {"own", [](Type& t, Type* b) { t.setCut("n").setOrigin(b); }},
-    {"over", [](Type& t, Type* b) { t.setUnderlyingType(b); }},
-    {"bits", [](Type& t, Type*) { t.setBitfield(); }}};
-
-// Type -> its short, its long and its base's name.
-const std::pair<const char*, const char*> kTypes[] = {
-    {"struct derived", "||"},
-    {"enum", "|My__Type|"},
-    {"derived", "i-16|My__Type|Int__16"},
-    {"base derived", "i-16|My__Type|Int__16"},
-    {"orphan", "|My__Type|_UnknownHXBaseType_"},
-    {"base", "b|My__Type|My__Type"},
-    {"base long", "b|My__Type|My__Type"},
-    {"array", "i-16|Int__16|Int__16"},
-    {"long signed", "I64|My__Type|_UnknownHXBaseType_"},
-    {"long unsigned", "U64|My__Type|_UnknownHXBaseType_"},
-    {"signed own", "n|My__Type|Int__16"},
-    {"signed over", "i-16|My__Type|_UnknownHXBaseType_"},
-    {"signed", "|My__Type|_UnknownHXBaseType_"},
-    {"derived bits", "i-16|My__Type|Bits"},
-    {"", "||"}};
+struct My : HX_DataType {
+  My() : HX_DataType("My- Type") {}
+};
 
 TEST_F(MacrosTest, TypesAreAskedWhatTheyAre) {
-  Type base("Int  16"), bits("Bits"), nameless("");
+  HX_DataType base("Int  16"), bits("Bits"), nameless("");
   base.setCut("i-16").setBase();
-  auto* server = types.getBaseServer();
-  server->setBitfieldBaseType(&bits);
-  const auto expandType = [&](const char* text) {
-    Type type("My- Type");
-    for (const auto& word : words(text)) kWords.at(word)(type, &base);
-    return expand("$T|$(Type)|$(BaseType)", nullptr, &type);
+  HX_NumericalType isSigned(-9e18, 9e18, 64, true), plain(0, 9e18, 64, false);
+  const auto namesOf = [&](HX_DataType& asked, HX_DataType* bitfieldBase) {
+    types.getBaseServer()->setBitfieldBaseType(bitfieldBase);
+    type = &asked;
+    return expand("$T|$(Type)|$(BaseType)");
   };
-  for (const auto& [text, result] : kTypes) {
-    EXPECT_THAT(messages(), IsEmpty());
-    EXPECT_EQ(expandType(text), result) << text;
+  const auto of = [&](HX_DataType& asked) { return namesOf(asked, &bits); };
+  // Its short, its long and its base's name.
+  const std::string unknown = "|My__Type|_UnknownHXBaseType_";
+  const std::pair<std::string, std::string> rows[] = {
+      {of(My().setUnnamed(My::eUnnamedStruct, false).setDerivedFrom(&base)),
+       "||"},
+      {of(My().setUnnamed(My::eUnnamedEnum, true)), "|My__Type|"},
+      {of(My().setDerivedFrom(&base)), "i-16|My__Type|Int__16"},
+      {of(My().setCut("b").setBase().setDerivedFrom(&base)),
+       "i-16|My__Type|Int__16"},
+      {of(My().setDerivedFrom(nullptr)), unknown},
+      {of(My().setCut("b").setBase().set64BitInteger()), "b|My__Type|My__Type"},
+      {of(My().setElement(&base)), "i-16|Int__16|Int__16"},
+      {of(My().set64BitInteger().setNumerical(&isSigned)), "I64" + unknown},
+      {of(My().set64BitInteger().setNumerical(&plain)), "U64" + unknown},
+      {of(My().setNumerical(&plain).setCut("n").setOrigin(&base)),
+       "n|My__Type|Int__16"},
+      {of(My().setNumerical(&plain).setUnderlyingType(&base)),
+       "i-16" + unknown},
+      {of(My().setNumerical(&plain)), unknown},
+      {of(My().setOrigin(&base)), "|| 7 7 7"},
+      {of(My().setDerivedFrom(&base).setBitfield()), "i-16|My__Type|Bits"},
+      {namesOf(My().setDerivedFrom(&base).setBitfield(), nullptr),
+       "i-16" + unknown},
+      {namesOf(My().setDerivedFrom(&base).setBitfield(), &nameless),
+       "i-16" + unknown}};
+  for (const auto& [found, expected] : rows) EXPECT_EQ(found, expected);
+}
+
+class ComponentTest : public HX_NamingFixture {
+ protected:
+  ~ComponentTest() override { EXPECT_EQ(DDAPIHeapBalance(), 0); }
+
+  /// What $(Component) gives for the variable at \p path, which is the data
+  /// dictionary reference or else the source reference.
+  std::string component(const char* path, bool isSource = false) {
+    const HxCDdSrcRef ref(HX_DdTree::instance().add(path));
+    Id id("$(Component)");
+    isSource ? id.setSourceRef(&ref) : id.setDdSourceRef(&ref);
+    return expandId(id);
   }
-  EXPECT_THAT(messages(), AllOf(SizeIs(3), Each(StartsWith("7/3 "))));
-  for (HX_DataType* noBase : {static_cast<HX_DataType*>(nullptr), &nameless}) {
-    server->setBitfieldBaseType(noBase);
-    EXPECT_EQ(expandType("derived bits"), "i-16|My__Type|_UnknownHXBaseType_");
+  static void addComponent(const char* name, const char* property,
+                           const char* variable) {
+    HX_DdTree& tree = HX_DdTree::instance();
+    const std::string path =
+        std::string("/Pool/Autosar/SoftwareComponents/") + name;
+    tree.add(path, HX_DdTree::kSoftwareComponent);
+    tree.addReference(tree.add(path + "/RelatedVariables"), property, variable);
   }
+
+  static constexpr const char* kVariable = "//DD0/Pool/Variables/Ctrl/speed";
+};
+
+TEST_F(ComponentTest, ComponentIsTheFirstThatRefersToTheVariable) {
+  EXPECT_EQ(component(kVariable), " 1209");
+  addComponent("Brake", "P0", "Variables/Brake");
+  addComponent("Engine", "P1", "Variables/Ctrl");
+  addComponent("Engine", "P2", "Variables/Ctrl/speed");
+  for (const bool isSource : {false, true})
+    EXPECT_EQ(component(kVariable, isSource), "Engine");
+  EXPECT_EQ(component("//DD0/Pool/Variables/Brake"), "Brake");
+  EXPECT_EQ(component("//DD0/Pool/Types/Ctrl"), "");
+  addComponent("Gear", "P3", "Variables/Ctrl");
+  addComponent("Gear", "P4", "Variables/Other");
+  addComponent("Gear", "P5", "Variables/Ctrl/speed");
+  EXPECT_EQ(component(kVariable), "Engine 1210 1210");
+  EXPECT_EQ(component("//DD0/Pool/Variables/Lost"), " 1209");
+  EXPECT_EQ(expand("x$(Component)"), "x 1209");
+  EXPECT_EQ(expand("x$(Component)", nullptr), "x 1209");
+
+  const std::string missing =
+      "1209/1 The $(Component) name macro could not substitute";
+  const std::string speed = " [//DD0/Pool/Variables/Ctrl/speed]";
+  EXPECT_THAT(
+      messages(),
+      ElementsAre(missing + speed,
+                  "1210/2 The variable was referenced first through "
+                  "the RelatedVariables property P1 of software "
+                  "component Engine and second by the RelatedVariables "
+                  "property P3 of software component Gear." +
+                      speed,
+                  HasSubstr("property P5 of software component Gear"),
+                  missing + " [//DD0/Pool/Variables/Lost]", missing, missing));
 }
 
 }  // namespace

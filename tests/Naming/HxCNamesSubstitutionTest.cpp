@@ -6,89 +6,78 @@
 
 namespace {
 
-class SubstitutionTest : public HX_NamingFixture {
- protected:
-  std::string substitute(const std::string& form, const char* macro,
-                         const char* value, HxCNames::tagMacroKindEnum kind) {
-    Id id((form + ":" + form).c_str());
-    const Id by((std::string(value) + ":" + value).c_str());
-    replaced = names.substAllDollarZByValue(id, macro, by, kind);
-    return formal(id);
-  }
-
-  bool replaced = false;
-};
+class SubstitutionTest : public HX_NamingFixture {};
 
 TEST_F(SubstitutionTest, EveryShortTemplateIsSubstitutedAsPlainly) {
-  std::vector<std::string> forms{"$"};
-  for (std::size_t i = 0; i < forms.size() && forms[i].size() < 6; ++i)
-    for (char c : {'$', 'n', 'N', '(', 'E', ')'}) forms.push_back(forms[i] + c);
+  std::vector<std::string> forms = HX_TextsUpTo(6, "$nN(E)");
+  std::erase_if(forms, [](const std::string& form) { return form[0] != '$'; });
+  for (const std::string& group : HX_TextsUpTo(6, "()'"))
+    forms.push_back("$E" + group + "$n");
+  const Id value("aZ$n:aZ$n");
   for (const char* macro : {"n", "N", "nN", "(N)"}) {
     for (int kind = 0; kind <= 3; ++kind) {
+      SCOPED_TRACE(testing::Message() << macro << " in kind " << kind);
       for (const std::string& form : forms) {
         const std::string plain =
             HX_PlainSubstitution(form, macro, "aZ$n", kind % 3);
-        const auto how = static_cast<HxCNames::tagMacroKindEnum>(kind);
-        ASSERT_EQ(substitute(form, macro, "aZ$n", how), plain)
-            << form << " by " << macro << " kind " << kind;
+        Id id((form + ":" + form).c_str());
+        const bool replaced = names.substAllDollarZByValue(
+            id, macro, value, static_cast<HxCNames::tagMacroKindEnum>(kind));
+        ASSERT_EQ(shown(id), plain) << form;
         ASSERT_EQ(replaced, plain != form);
       }
     }
   }
 }
 
-TEST_F(SubstitutionTest, DollarEGroupsAreMeasured) {
-  const std::tuple<const char*, int, int> rows[] = {
-      {"(a(b)c)x", 0, 7}, {"('(')", 0, 5},   {"x", 0, 0},
-      {"(a", 0, 2},       {"()", 2, 0},      {"()", -1, 0},
-      {"(')')", 0, 5},    {"a(b)(c)", 1, 3}, {"('", 0, 2}};
-  for (const auto& [text, start, length] : rows)
-    EXPECT_EQ(HxCNamesTestAccess::dollarELength(text, start), length) << text;
+TEST_F(SubstitutionTest, FlagsAndLevelsAreTakenOver) {
+  // Template and level, macro, value and level -> names, what is noted, level.
+  const char* const rows[][4] = {
+      {"a:$b 0", "m", "v:$N 0", "a:$b : 0"},  // the value's active name counts
+      {"a:b 0", "m", "$L$E$N: 0", "a:b LEN: 0"},
+      {"a:b 0", "m", "v:w 1", "a:b : 1"},  // only level 1 raises, only level 0
+      {"a:b 2", "m", "v:w 1", "a:b : 2"},
+      {"a:b 0", "m", "v:w 2", "a:b : 0"},
+      {"a:b 3", "E", "v:w 0", "a:b : 1"},  // E sets level 1 in any case
+      {"$e:b 2", "e", "v:w 0", "v:b E: 1"},
+      {"$L:$Lb 2", "L", "v:w 0", "v:wb L:L 2"},
+      {"$l:b 2", "l", "v:w 0", "v:b L: 2"},
+      {"a:$N 2", "N", "v:w 0", "a:w :N 2"},
+      {"$n:b 2", "n", "v:w 1", "v:b N: 2"}};
+  const auto at = [](const std::string& text) {
+    Id id(text.substr(0, text.size() - 2).c_str());
+    id.setCookLevel(static_cast<Id::HxECookLevelTag>(text.back() - '0'));
+    return id;
+  };
+  for (const auto& [form, macro, value, result] : rows) {
+    Id id = at(form);
+    names.substAllDollarZByValue(id, macro, at(value),
+                                 HxCNames::eMacroKindExact);
+    const std::string level = " " + std::to_string(id.getCookLevel());
+    id.setCookLevel(Id::eCookLevelFull);
+    EXPECT_EQ(shown(id) + " " + notedOf(id) + level, result) << form << macro;
+  }
 }
 
-TEST_F(SubstitutionTest, ReferencesFlagsAndLevelsAreTakenOver) {
+TEST_F(SubstitutionTest, ReferencesAreTakenOver) {
   const HxCDdSrcRef ddRef(1);
-  Id value("v:w");
-  value.setSourceRef(gain.getSrcRef());
+  Id value = identifier("v:w"), id("none");
   value.setDdSourceRef(&ddRef);
   value.setIdentifierChangeable(true, Id::eFormalName);
-  value.setCookLevel(Id::eCookLevelDollarE);
-  value.setDollarEUsed(true, Id::eFormalName);
-
-  Id id("none");
-  EXPECT_FALSE(
-      names.substAllDollarZByValue(id, "m", value, HxCNames::eMacroKindExact));
+  for (const Id& by : {value, Id("plain")})
+    names.substAllDollarZByValue(id, "m", by, HxCNames::eMacroKindExact);
   EXPECT_EQ(id.getSourceRef(), gain.getSrcRef());
   EXPECT_EQ(id.getDdSourceRef(), &ddRef);
-  EXPECT_TRUE(id.getIdentifierChangeable(Id::eFormalName));
-  EXPECT_FALSE(id.getIdentifierChangeable(Id::eActualName));
-  EXPECT_TRUE(id.getDollarEUsed(Id::eFormalName));
-  EXPECT_EQ(id.getCookLevel(), Id::eCookLevelDollarE);
-  names.substAllDollarZByValue(id, "m", Id("plain"), HxCNames::eMacroKindExact);
-  EXPECT_EQ(id.getSourceRef(), gain.getSrcRef());
+  EXPECT_EQ(notedOf(id), "R:");
+}
 
-  Id full("$N:b");
-  full.setCookLevel(Id::eCookLevelFull);
-  names.substAllDollarZByValue(full, "n", value, HxCNames::eMacroKindAnyCase);
-  EXPECT_TRUE(full.getDollarNUsed(Id::eFormalName));
-  EXPECT_FALSE(full.getDollarNUsed(Id::eActualName));
-  EXPECT_EQ(full.getCookLevel(), Id::eCookLevelFull);
-  names.substAllDollarZByValue(full, "e", value, HxCNames::eMacroKindExact);
-  EXPECT_EQ(full.getCookLevel(), Id::eCookLevelDollarE);
-
-  Id used("$e$L:b");
-  for (const char* macro : {"e", "L"})
-    names.substAllDollarZByValue(used, macro, Id("x"),
-                                 HxCNames::eMacroKindExact);
-  EXPECT_TRUE(used.getDollarEUsed(Id::eFormalName));
-  used.setCookLevel(Id::eCookLevelFull);
-  EXPECT_TRUE(used.getDollarLUsed(Id::eFormalName));
-
-  Id itself("v:$xL$");  // becomes "$xL$L$"
-  itself.activateActualName();
-  names.substAllDollarZByValue(itself, "x", itself, HxCNames::eMacroKindExact);
-  itself.setCookLevel(Id::eCookLevelFull);
-  EXPECT_TRUE(itself.getDollarLUsed(Id::eActualName));
+TEST_F(SubstitutionTest, ANameMayBePutIntoItself) {
+  Id id("v:$xL$");
+  id.activateActualName();
+  names.substAllDollarZByValue(id, "x", id, HxCNames::eMacroKindExact);
+  EXPECT_EQ(shown(id), "v:$xL$L$");
+  id.setCookLevel(Id::eCookLevelFull);
+  EXPECT_EQ(notedOf(id), ":L");
 }
 
 TEST_F(SubstitutionTest, FileNamesExpandWhatIsKnownWithoutAnObject) {
@@ -103,26 +92,25 @@ TEST_F(SubstitutionTest, FileNamesExpandWhatIsKnownWithoutAnObject) {
   for (const auto& [form, ofModel, hasBlock, result, isComplete] : rows) {
     Id id = identifier(form, hasBlock ? gain.getSrcRef() : nullptr);
     EXPECT_EQ(names.handleFileNameMacro(id, ofModel), isComplete) << form;
-    EXPECT_EQ(formal(id), result);
+    EXPECT_EQ(shown(id), result);
   }
 }
 
 TEST_F(SubstitutionTest, SymbolMacrosTakeTheSymbol) {
-  HX_DataType type("Int16");
-  type.setCut("i16").setBase();
-  HxCSymbol variable("Speed", HxCSymbol::eVariable, &type);
+  HX_DataType int16("Int16");
+  int16.setCut("i16").setBase();
+  HxCSymbol variable("Speed", HxCSymbol::eVariable, &int16);
   variable.setDollarX("ext");
   HxCSymbol function("step", HxCSymbol::eFunction);
-  const auto handle = [this](HxCSymbol& symbol, const char* actualForm) {
-    Id id("$x_$X_$v_$V_$t_$T_$f$F:$x:");
-    id.setCookedName(actualForm, Id::eActualName);
+  const auto handle = [this](HxCSymbol& symbol) {
+    Id id("$x_$X_$v_$V_$t_$T_$f$F:$x$v$f");
     names.handleSymbolNameMacro(id, &symbol);
     EXPECT_EQ(id.getCookLevel(), Id::eCookLevelSymbol);
-    return formal(id) + " " + actual(id);
+    return shown(id);
   };
-  EXPECT_EQ(handle(variable, "$x:$v"),
-            "ext_ext_Speed_SPEED_i16_i16_$f$F ext$R:Speed$R");
-  EXPECT_EQ(handle(function, "$x:$f"), "__$v_$V___stepSTEP $R:step$R");
+  EXPECT_EQ(handle(variable),
+            "ext_ext_Speed_SPEED_i16_i16_$f$F:ext$RSpeed$R$f");
+  EXPECT_EQ(handle(function), "__$v_$V___stepSTEP:$R$vstep$R");
 }
 
 }  // namespace

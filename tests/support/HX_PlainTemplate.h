@@ -6,6 +6,17 @@
 #include <algorithm>
 #include <cctype>
 #include <string>
+#include <vector>
+
+/// Every text of 1 to \p length characters out of \p letters.
+inline std::vector<std::string> HX_TextsUpTo(std::size_t length,
+                                             const std::string& letters) {
+  std::vector<std::string> texts{""};
+  for (std::size_t i = 0; i < texts.size() && texts[i].size() < length; ++i)
+    for (const char letter : letters) texts.push_back(texts[i] + letter);
+  texts.erase(texts.begin());
+  return texts;
+}
 
 /// The end of what starts at \p at: a character, "$" and a character, "$(" up
 /// to ")" or the end, or "$E" and its group in parentheses.
