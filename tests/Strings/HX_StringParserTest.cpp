@@ -7,30 +7,18 @@
 namespace {
 
 TEST(StringParserTest, RemoveCharsTrimsTheChosenEnds) {
-  const struct {
-    const char *text, *chars;
-    const char* trimmed[4];  // leading, trailing, both, unknown modes
-  } rows[] = {{"  ab  ", " ", {"ab  ", "  ab", "ab", "  ab  "}},
-              {"xxx", "x", {"", "", "", "xxx"}},
-              {"", "x", {"", "", "", ""}},
-              {"xyaxyx", "yx", {"axyx", "xya", "a", "xyaxyx"}},
-              {"aba", "", {"aba", "aba", "aba", "aba"}}};
-  for (const auto& [text, chars, trimmed] : rows)
-    for (int mode : {0, 1, 2, 3, 4, -1}) {
-      const auto ends = static_cast<HX_StringParser::remove_etp>(mode);
-      EXPECT_EQ(HX_StringParser().removeChars(text, chars, ends),
-                trimmed[mode < 0 ? 3 : std::min(mode, 3)])
-          << text << " in mode " << mode;
-    }
+  const char* const trimmed[] = {"ayx", "xya", "a", "xyayx", "xyayx"};
+  for (int mode : {0, 1, 2, 3, -1})
+    EXPECT_EQ(
+        HX_StringParser().removeChars(
+            "xyayx", "yx", static_cast<HX_StringParser::remove_etp>(mode)),
+        trimmed[mode < 0 ? 4 : mode]);
 }
 
 TEST(StringParserTest, PairsFillTheSlotsOfTheirKeys) {
-  const struct {
-    const char *text, *keyValueSep, *pairSep;
-    const char* keys;    // divided by ','
-    const char* values;  // each ended by ','; every slot held "-" before
-    const char* unrecognised;
-  } rows[] = {
+  // Text, separators of key and pair, keys, values (each ended by ',', and "-"
+  // before), what is not recognised.
+  const char* const rows[][6] = {
       {"Name = F oo ; SIZE=3", "=", ";", "name,Size", "F oo,3,", ""},
       {"a=1;Bogus=2;Flag", "=", ";", "a", "1,", "flag"},
       {"flag; Bogus =2", "=", ";", "a", "-,", "bogus"},
@@ -45,39 +33,39 @@ TEST(StringParserTest, PairsFillTheSlotsOfTheirKeys) {
       {"a=1;b", "", ";", "a", "-,", "b"},       // no key separator
       {"a=b", "=", "=", "a", ",", "b"},
       {"", "=", ";", "a", "-,", ""}};
-  for (const auto& row : rows) {
+  for (const auto& [text, keyValueSep, pairSep, keyList, expected, unknown] :
+       rows) {
     leda::array<KyCXString> keys;
-    KyCXString(row.keys).split(',', keys);
+    KyCXString(keyList).split(',', keys);
     leda::array<KyCXString> values(keys.size());
     for (KyCXString& value : values) value = "-";
-    EXPECT_EQ(HX_StringParser().parseKeyValuePairs(row.text, row.keyValueSep,
-                                                   row.pairSep, keys, values),
-              row.unrecognised);
+    EXPECT_EQ(HX_StringParser().parseKeyValuePairs(text, keyValueSep, pairSep,
+                                                   keys, values),
+              unknown);
     KyCXString joined;
     for (const KyCXString& value : values) joined += value + ",";
-    EXPECT_EQ(joined, row.values) << row.text;
+    EXPECT_EQ(joined, expected) << text;
   }
 }
 
 TEST(StringParserTest, KeywordsDivideTheText) {
-  const struct {
-    const char *text, *start, *stop, *embedded, *outside;
-  } rows[] = {{"x[[abc]]y", "[[", "]]", "abc", "xy"},
-              {"x[[abc", "[[", "]]", "abc", "x"},
-              {"[[a]]B[[c]]", "[[", "]]", "ac", "B"},
-              {"xBEGINaEnDy", "begin", "END", "a", "xy"},
-              {"a]]b[[", "[[", "]]", "", "a]]b"},
-              {"a|b|c|d", "|", "|", "bd", "ac"},
-              {"a[[b", "", "]]", "", "a[[b"},
-              {"a[[b]]", "[[", "", "b]]", "a"},
-              {"", "[[", "]]", "", ""}};
-  for (const auto& row : rows) {
+  // Text, start, stop -> embedded, outside.
+  const char* const rows[][5] = {{"x[[abc]]y", "[[", "]]", "abc", "xy"},
+                                 {"x[[abc", "[[", "]]", "abc", "x"},
+                                 {"[[a]]B[[c]]", "[[", "]]", "ac", "B"},
+                                 {"xBEGINaEnDy", "begin", "END", "a", "xy"},
+                                 {"a]]b[[", "[[", "]]", "", "a]]b"},
+                                 {"a|b|c|d", "|", "|", "bd", "ac"},
+                                 {"a[[b", "", "]]", "", "a[[b"},
+                                 {"a[[b]]", "[[", "", "b]]", "a"},
+                                 {"", "[[", "]]", "", ""}};
+  for (const auto& [text, start, stop, inside, around] : rows) {
     KyCXString embedded("old");
-    KyCXString outside(row.text);
-    HX_StringParser().divideKeywordEmbeddedString(outside, row.start, row.stop,
+    KyCXString outside(text);
+    HX_StringParser().divideKeywordEmbeddedString(outside, start, stop,
                                                   embedded, outside);
-    EXPECT_EQ(embedded, row.embedded) << row.text;
-    EXPECT_EQ(outside, row.outside) << row.text;
+    EXPECT_EQ(embedded, inside) << text;
+    EXPECT_EQ(outside, around) << text;
   }
 }
 
