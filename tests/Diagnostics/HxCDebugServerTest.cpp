@@ -111,7 +111,7 @@ TEST_F(DebugServerTest, WhatCannotBeWrittenIsLostWithoutAReport) {
 TEST_F(DebugServerTest, ResultsAreWrittenByteForByte) {
   // A locale with a decimal comma must not show; skipped where none is there.
   std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
-  const auto interval = [&](ScEDebugClock clock, int microseconds) {
+  const auto interval = [&](ScEDebugClock clock, std::int64_t microseconds) {
     m_Server.clockStart(clock);
     m_Clock.ticks += 2 * microseconds;
     m_Server.clockStop(clock);
