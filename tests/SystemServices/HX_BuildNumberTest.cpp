@@ -6,7 +6,17 @@
 
 namespace {
 
-using BuildNumberTest = HX_TestFixture;
+class BuildNumberTest : public HX_TestFixture {
+ protected:
+  void define(int third, int counter, bool isFirstKind, bool isRelease,
+              const char* date) {
+    EXPECT_TRUE(m_Build.definedBuildNumber(6, 0, third, counter, "4711",
+                                           isFirstKind, isRelease, 9, "6.1",
+                                           "2007-04", date, "10:23:45"));
+  }
+
+  HX_BuildNumber m_Build;
+};
 
 TEST_F(BuildNumberTest, VersionTextShowsTheBuildKindBehindAThirdNumber) {
   const struct {
@@ -19,25 +29,10 @@ TEST_F(BuildNumberTest, VersionTextShowsTheBuildKindBehindAThirdNumber) {
       {0, 5, false, false, "6.0"},      {-1, 5, true, false, "6.0"},
       {0, 0, false, true, "6.0"},       {1, -2, false, false, "6.0.1.B-2"},
   };
-  HX_BuildNumber build;
   for (const auto& c : cases) {
-    SCOPED_TRACE(c.version);
-    EXPECT_TRUE(build.definedBuildNumber(6, 0, c.third, c.counter, "4711",
-                                         c.isFirstKind, c.isRelease, 9, "6.0",
-                                         "2007-04", "Mar  4 2007", "10:23:45"));
-    EXPECT_EQ(*build.getVersionString(), c.version);
-    EXPECT_EQ(*build.getLongVersionString(),
-              KyCXString(c.version) + "\t from 2007-03-04 10:23:45");
+    define(c.third, c.counter, c.isFirstKind, c.isRelease, "");
+    EXPECT_EQ(*m_Build.getVersionString(), c.version);
   }
-  EXPECT_EQ(*build.getBuildId(), "Build Id 4711");
-  EXPECT_EQ(*build.getBuildTime(), "10:23:45");
-  EXPECT_EQ(*build.getBuildDateTime(), "2007-03-04 10:23:45");
-  EXPECT_EQ(*build.getBrennicVersion(), "6.0");
-  EXPECT_EQ(*build.getBrennicReleaseDate(), "2007-04");
-  EXPECT_EQ(build.getMajorVersion(), 6);
-  EXPECT_EQ(build.getMinorVersion(), 0);
-  EXPECT_EQ(build.getMaintenanceVersion(), -1);
-  EXPECT_FALSE(build.isBetaVersion() || build.isReleaseVersion());
 }
 
 TEST_F(BuildNumberTest, BuildDateTakesStandardForm) {
@@ -54,30 +49,35 @@ TEST_F(BuildNumberTest, BuildDateTakesStandardForm) {
       {"Mar 14 2007 ", "-03-02007"},    {" 4 2007", "2007--4"},
   };
   for (const auto& [date, standard] : cases) {
-    HX_BuildNumber build;
-    build.definedBuildNumber(1, 0, 0, 0, "", false, false, 0, "", "", date, "");
-    EXPECT_EQ(*build.getBuildDate(), standard) << date;
+    define(0, 0, false, false, date);
+    EXPECT_EQ(*m_Build.getBuildDate(), standard) << date;
   }
 }
 
-TEST_F(BuildNumberTest, CopiesOutliveTheirOriginalAndItsRedefinition) {
-  HX_BuildNumber copy;
-  EXPECT_EQ(copy.getVersionString(), nullptr);
-  {
-    HX_BuildNumber build;
-    build.definedBuildNumber(1, 2, 0, 0, "7", false, false, 0, "p", "r", "d",
-                             "t");
-    copy = build;
-    EXPECT_EQ(copy.getVersionString(), build.getVersionString());
-    // Texts of the object itself as arguments.
-    build.definedBuildNumber(3, 4, 0, 0, *build.getBuildId(), false, false, 0,
-                             *build.getBrennicReleaseDate(),
-                             *build.getBrennicVersion(), *build.getBuildTime(),
-                             *build.getBuildDate());
-    EXPECT_EQ(*build.getBrennicReleaseDate(), "p");
-    EXPECT_EQ(*build.getLongVersionString(), "3.4\t from t d");
-  }
-  EXPECT_EQ(*copy.getLongVersionString(), "1.2\t from d t");
+TEST_F(BuildNumberTest, CopiesOutliveTheirOriginalsRedefinition) {
+  EXPECT_EQ(m_Build.getVersionString(), nullptr);
+  define(1, 5, false, false, "Mar  4 2007");
+  const HX_BuildNumber copy(m_Build);
+  EXPECT_EQ(copy.getVersionString(), m_Build.getVersionString());
+  // Texts of the object itself as arguments.
+  m_Build.definedBuildNumber(3, 4, 0, 0, *m_Build.getBuildId(), false, false, 0,
+                             *m_Build.getBrennicReleaseDate(),
+                             *m_Build.getBrennicVersion(),
+                             *m_Build.getBuildTime(), *m_Build.getBuildDate());
+  EXPECT_EQ(*m_Build.getBrennicReleaseDate(), "6.1");
+  EXPECT_EQ(*m_Build.getLongVersionString(), "3.4\t from 10:23:45 2007-03-04");
+
+  EXPECT_EQ(*copy.getBuildId(), "Build Id 4711");
+  EXPECT_EQ(*copy.getBuildTime(), "10:23:45");
+  EXPECT_EQ(*copy.getBuildDateTime(), "2007-03-04 10:23:45");
+  EXPECT_EQ(*copy.getLongVersionString(),
+            "6.0.1.B5\t from 2007-03-04 10:23:45");
+  EXPECT_EQ(*copy.getBrennicVersion(), "6.1");
+  EXPECT_EQ(*copy.getBrennicReleaseDate(), "2007-04");
+  EXPECT_EQ(copy.getMajorVersion(), 6);
+  EXPECT_EQ(copy.getMinorVersion(), 0);
+  EXPECT_EQ(copy.getMaintenanceVersion(), -1);
+  EXPECT_FALSE(copy.isBetaVersion() || copy.isReleaseVersion());
 }
 
 class OfficialVersionTest : public HX_TestFixture {
@@ -89,33 +89,31 @@ class OfficialVersionTest : public HX_TestFixture {
 
   static mxArray* structure(const char* version, const char* date) {
     mxArray* result = mxCreateStructMatrix(1, 1, {"Version", "ReleaseDate"});
-    if (version != nullptr)
-      mxSetField(result, 0, "Version", mxCreateString(version));
-    if (date != nullptr)
-      mxSetField(result, 0, "ReleaseDate", mxCreateString(date));
+    for (const auto& [field, text] :
+         {std::pair{"Version", version}, std::pair{"ReleaseDate", date}})
+      if (text != nullptr) mxSetField(result, 0, field, mxCreateString(text));
     return result;
   }
 };
 
 TEST_F(OfficialVersionTest, EvaluationKeepsWhatItGot) {
-  const char *const kNoVersion = "- version -", *const kNoDate =
-                                                    "- release date -";
   const struct {
     const char* why;
     mxArray* answer;
-    bool result;
-    const char* version;
-    const char* date;
+    bool isComplete;
+    const char* shown;
     int status = 0;
   } cases[] = {
-      {"failure with an answer", structure("1", "2"), false, "", "", 1},
-      {"no answer", nullptr, false, "", ""},
-      {"complete", structure("6.1", "May 2007"), true, "6.1", "May 2007"},
-      {"failure", nullptr, false, "6.1", "May 2007", 1},
-      {"no date", structure("6.2", nullptr), false, "6.2", kNoDate},
-      {"no version", structure(nullptr, "Jun"), false, kNoVersion, kNoDate},
-      {"not a structure", mxCreateString("x"), false, kNoVersion, kNoDate},
-      {"an empty version", structure("", "Jul"), true, "", "Jul"},
+      {"failure with an answer", structure("1", "2"), false, "|", 1},
+      {"no answer", nullptr, false, "|"},
+      {"complete", structure("6.1", "May 2007"), true, "6.1|May 2007"},
+      {"failure", nullptr, false, "6.1|May 2007", 1},
+      {"no date", structure("6.2", nullptr), false, "6.2|- release date -"},
+      {"no version", structure(nullptr, "Jun"), false,
+       "- version -|- release date -"},
+      {"not a structure", mxCreateString("x"), false,
+       "- version -|- release date -"},
+      {"an empty version", structure("", "Jul"), true, "|Jul"},
   };
   HX_OfficialVersion official;
   EXPECT_FALSE(official.evalBrennicVersionAndReleaseDate()) << "no function";
@@ -123,16 +121,15 @@ TEST_F(OfficialVersionTest, EvaluationKeepsWhatItGot) {
     SCOPED_TRACE(c.why);
     HX_RegisterMatlabFunction("hx_config", [&](int outputs, mxArray** output,
                                                int inputs, mxArray** input) {
-      EXPECT_EQ(outputs, 1);
-      EXPECT_EQ(inputs, 1);
+      EXPECT_TRUE(outputs == 1 && inputs == 1);
       EXPECT_EQ(mxGetScalar(input[0]), 6.0);
       output[0] = c.answer;
       return c.status;
     });
-    EXPECT_EQ(official.evalBrennicVersionAndReleaseDate(), c.result);
+    EXPECT_EQ(official.evalBrennicVersionAndReleaseDate(), c.isComplete);
     const HX_OfficialVersion copy(official);
-    EXPECT_EQ(copy.getHXVersionString(), c.version);
-    EXPECT_EQ(copy.getHXReleaseDate(), c.date);
+    EXPECT_EQ(copy.getHXVersionString() + "|" + copy.getHXReleaseDate(),
+              c.shown);
   }
 }
 

@@ -35,26 +35,6 @@ TEST_F(SystemServicesTest, TimeIsReadInMillisecondsAndStandardForm) {
               MatchesRegex("[0-2][0-9]:[0-5][0-9]:[0-6][0-9]"));
 }
 
-TEST_F(SystemServicesTest, FirstReferenceIsReplacedWithWhatPrecedesIt) {
-  setenv("HX_TEST_A", "/h", 1);
-  setenv("HX_TEST_EMPTY", "", 1);
-  unsetenv("HX_TEST_NONE");
-  const char* const rows[][2] = {
-      {"", ""},
-      {"plain", "plain"},
-      {"%HX_TEST_A%/x", "/h/x"},
-      {"abc%HX_TEST_A%def%HX_TEST_A%", "/hdef%HX_TEST_A%"},
-      {"a%HX_TEST_EMPTY%", ""},
-      {"a%HX_TEST_NONE%b", "a%HX_TEST_NONE%b"},
-      {"a%HX_TEST_A", "a%HX_TEST_A"},
-      {"a%%b", "a%%b"}};
-  for (const auto& [before, after] : rows) {
-    KyCXString text(before);
-    EXPECT_TRUE(m_System.substituteEnvVariable(text));
-    EXPECT_EQ(text, after);
-  }
-}
-
 TEST_F(SystemServicesTest, PriorityIsThatOfTheCallingThreadAlone) {
   const int before = getpriority(PRIO_PROCESS, 0);
   std::thread([this, before] {
