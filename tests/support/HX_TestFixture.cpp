@@ -13,10 +13,9 @@ HX_TestFixture::~HX_TestFixture() { reset(); }
 std::vector<std::string> HX_TestFixture::messages() {
   std::vector<std::string> result;
   for (const HX_Message& m : HX_MessageHandler::instance().messages()) {
-    std::string line =
-        std::to_string(m.row) + "/" + std::to_string(m.severity) + " " + m.text;
-    if (m.srcRef != nullptr) line += " [" + m.source + "]";
-    result.push_back(line);
+    result.push_back(std::to_string(m.row) + "/" + std::to_string(m.severity) +
+                     " " + m.text);
+    if (m.srcRef != nullptr) result.back() += " [" + m.source + "]";
   }
   return result;
 }
@@ -46,12 +45,12 @@ void HX_TestFixture::reset() {
 void* HX_CountingController::allocMemBlock(unsigned long size) {
   const int number = m_Asked++;
   if (number >= m_FirstFailure && number <= m_LastFailure) return nullptr;
-  ++m_Allocated;
+  ++m_Live;
   return HxCMemController::allocMemBlock(size);
 }
 
 void HX_CountingController::freeMemBlock(void* block) {
-  if (block != nullptr) ++m_Freed;
+  if (block != nullptr) --m_Live;
   HxCMemController::freeMemBlock(block);
 }
 
@@ -65,7 +64,7 @@ void HX_WithoutEachBlock(const char* why, bool (*job)()) {
       memory.failAt(missing, allAfter);
       const bool done = job();
       ASSERT_EQ(memory.liveBlocks(), 0) << "leaks";
-      if (memory.asked() <= missing) {
+      if (memory.allocated() <= missing) {
         EXPECT_TRUE(done && missing > 0);
         break;
       }

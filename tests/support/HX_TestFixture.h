@@ -51,10 +51,9 @@ class HX_CountingController : public HxCMemController {
   void* allocMemBlock(unsigned long size) override;
   void freeMemBlock(void* block) override;
 
-  int liveBlocks() const { return m_Allocated - m_Freed; }
-  int allocated() const { return m_Allocated; }
+  int liveBlocks() const { return m_Live; }
   /// Allocations asked for, failed ones included.
-  int asked() const { return m_Asked; }
+  int allocated() const { return m_Asked; }
   /// From now on every allocation fails.
   void fail() { failAt(m_Asked, true); }
   /// The allocation with this number (the first is 0) fails, with \p allAfter
@@ -66,10 +65,9 @@ class HX_CountingController : public HxCMemController {
 
  private:
   int m_Asked = 0;
-  int m_Allocated = 0;
-  int m_Freed = 0;
+  int m_Live = 0;
   int m_FirstFailure = INT_MAX;
-  int m_LastFailure = -1;
+  int m_LastFailure = INT_MAX;
 };
 
 /// Runs \p job again and again: without the first block that it asks for, then
