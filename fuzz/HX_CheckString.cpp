@@ -1,186 +1,206 @@
-// The string class against std::u16string.
+// The string class against a plain one over std::wstring.
 #include <climits>
+#include <regex>
+#include <sstream>
 
 #include "fuzz/HX_Fuzz.h"
 
 namespace {
 
-using Units = std::u16string;
-
-const Units kWhite = u" \t\n\v\f\r";
-const Units kLower = u"abcdefghijklmnopqrstuvwxyz";
-const Units kUpper = u"ABCDEFGHIJKLMNOPQRSTUVWXYZ";
-const Units kDigits = u"0123456789";
-const Units kNameUnits = kLower + kUpper + kDigits + u"_";
-
-bool isOneOf(const Units& set, char16_t unit) {
-  return set.find(unit) != Units::npos;
-}
-
-Units unitsOf(const KyCXString& text) {
-  Units units;
-  for (int i = 0; i < text.length(); ++i)
-    units += static_cast<char16_t>(text[i]);
-  return units;
-}
-
-Units plainSub(const Units& units, int from, int to) {
-  Units part;
-  for (int i = std::max(from, 0); i <= to && i < static_cast<int>(units.size());
-       ++i)
-    part += units[static_cast<std::size_t>(i)];
-  return part;
-}
-
-Units plainReplace(Units units, const Units& what, const Units& by) {
-  for (std::size_t at = 0; !what.empty(); at += by.size()) {
-    at = units.find(what, at);
-    if (at == Units::npos) break;
-    units.replace(at, what.size(), by);
+// The operations of KyCXString in the plainest form. What may be a part of the
+// text itself is taken as a copy.
+struct PlainString : std::wstring {
+  PlainString() = default;
+  PlainString(std::wstring units) : std::wstring(std::move(units)) {}
+  PlainString(const KyCXString& text) {
+    for (int i = 0; i < text.length(); ++i) push_back(text[i]);
   }
-  return units;
-}
+  PlainString(const char* text) : PlainString(KyCXString(text)) {}
+  PlainString(char character) : PlainString(KyCXString(character)) {}
 
-Units plainTrim(Units units, bool leading, bool trailing) {
-  while (leading && !units.empty() && isOneOf(kWhite, units[0]))
-    units.erase(0, 1);
-  while (trailing && !units.empty() && isOneOf(kWhite, units.back()))
-    units.pop_back();
-  return units;
-}
-
-Units plainIdentifier(const Units& units, bool collapse) {
-  Units result;
-  for (std::size_t i = 0; i < units.size(); ++i) {
-    if (isOneOf(kNameUnits, units[i]))
-      result += units[i];
-    else if (!collapse || i == 0 || isOneOf(kNameUnits, units[i - 1]))
-      result += u'_';
+  int length() const { return static_cast<int>(size()); }
+  int operator[](int at) const {
+    return at < 0 || at >= length() ? 0 : data()[at];
   }
-  return isOneOf(kDigits, result[0]) ? u"_" + result : result;
-}
-
-Units plainShorten(const Units& units, int limit, int marks, int position) {
-  const int length = static_cast<int>(units.size());
-  if (length <= limit) return units;
-  const int room = limit - marks;
-  if (room <= 0) return plainSub(units, length - limit, length);
-  const int tail = position == 0 ? room : position == 1 ? room / 2 : 0;
-  return plainSub(units, 0, room - tail - 1) +
-         Units(static_cast<std::size_t>(marks), u'.') +
-         plainSub(units, length - tail, length);
-}
-
-// Two texts and their plain models; each step changes the first, with the
-// second or the first itself as argument.
-struct Walk {
-  KyCXString text[2];
-  Units plain[2];
-
-  void step(HX_Bytes& bytes) {
-    if (plain[0].size() > 500) text[0] = "", plain[0].clear();
-    const int operation = bytes.below(14);
-    const int choice = bytes.number();
-    const int from = choice % 50 - 5;
-    const int to = bytes.number() % 50 - 5;
-    const bool first = choice % 2 != 0;
-    const bool second = to % 2 != 0;
-    const KyCXString& argument = text[first];
-    const Units argumentUnits = plain[first];
-    KyCXString& t = text[0];
-    Units& p = plain[0];
-    switch (operation) {
-      case 0:
-        return t = argument, p = argumentUnits, void();
-      case 1:
-        return t += argument, p += argumentUnits, void();
-      case 2:
-        return t = t.sub(from, to), p = plainSub(p, from, to), void();
-      case 3:
-        t.appendSub(argument, from, to);
-        return p += plainSub(argumentUnits, from, to), void();
-      case 4:
-        p = plainReplace(p, argumentUnits, plain[second]);
-        return t.replace(argument, text[second]), void();
-      case 5:
-        return t.trim(first, second), p = plainTrim(p, first, second), void();
-      case 6: {
-        KyCXString moved(std::move(t));
-        HX_Require(t.isEmpty(), "a text moved from is empty");
-        t += 'x';
-        return t = std::move(moved), void();
-      }
-      case 7:
-        return std::swap(t, text[1]), std::swap(p, plain[1]);
-      case 8:  // a tail of its own memory
-        t = t.cstring() + std::min(t.length(), 3);
-        p = plainSub(p, 3, INT_MAX - 1);
-        for (char16_t& unit : p) unit = unit > 0xFF ? u'?' : unit;
-        return p = p.c_str(), void();
-      case 9:
-        t += static_cast<char>(choice);
-        return p += static_cast<char16_t>(choice), void();
-      case 10:
-        t.makeCIdentifier(first), p = plainIdentifier(p, first);
-        return HX_Require(t.isValidCIdentifier() != p.empty(), "identifier");
-      case 11: {
-        first ? t.toUpper() : t.toLower();
-        const Units& before = first ? kLower : kUpper;
-        for (char16_t& unit : p)
-          if (const std::size_t at = before.find(unit); at != Units::npos)
-            unit = (first ? kUpper : kLower)[at];
-        return;
-      }
-      case 12: {
-        const int position = (to + 5) % 3;
-        p = plainShorten(p, std::max(from, 0), choice % 4, position);
-        t.shortenString(from, choice % 4, '.',
-                        static_cast<KyCXString::ScEPosition>(position));
-        return;
-      }
-      default:
-        t = bytes.text(), p = unitsOf(t);
-    }
+  const char* cstring() const {
+    m_Narrow.clear();
+    for (const wchar_t unit : *this)
+      m_Narrow += static_cast<char>(unit > 0xFF ? '?' : unit);
+    return m_Narrow.c_str();
+  }
+  void operator+=(const PlainString& text) { append(text); }
+  int find(const PlainString& text, int from) const {
+    const auto start = static_cast<std::size_t>(std::max(from, 0));
+    return static_cast<int>(std::wstring::find(text, start));
+  }
+  bool startsWith(const PlainString& text) const { return starts_with(text); }
+  int compareWith(const PlainString& text) const { return compare(text); }
+  PlainString sub(int from, int to) const {
+    PlainString part;
+    for (int i = std::max(from, 0); i <= std::min(to, length() - 1); ++i)
+      part.push_back(data()[i]);
+    return part;
+  }
+  PlainString head(int count) const { return sub(0, std::max(count, 0) - 1); }
+  void appendSub(const PlainString& text, int from, int to) {
+    *this += text.sub(from, to);
   }
 
-  void check(HX_Bytes& bytes) {
-    const int from = bytes.below(4);
-    const auto found = [&](const Units& what) {
-      return static_cast<int>(plain[0].find(what, std::size_t(from)));
-    };
-    HX_Require(unitsOf(text[0]) == plain[0], "the units agree");
-    std::string narrow;
-    for (char16_t unit : plain[0])
-      narrow += static_cast<char>(unit > 0xFF ? u'?' : unit);
-    HX_Require(
-        std::string(text[0].cstring(), narrow.size() + 1) == narrow + '\0',
-        "the 8-bit form agrees");
-    HX_Require(text[0].find(text[1], from) == found(plain[1]) &&
-                   text[0].find('\xE4', from) == found(u"\u00E4"),
-               "find");
-    HX_Require(text[0].startsWith(text[1]) == plain[0].starts_with(plain[1]),
-               "startsWith");
-    HX_Require((text[0] == text[1]) == (plain[0] == plain[1]) &&
-                   (text[0] < text[1]) == (plain[0] < plain[1]) &&
-                   (text[0].compareWith(text[1]) > 0) == (plain[0] > plain[1]),
-               "comparison");
-    HX_Require(unitsOf(text[0] + text[1]) == plain[0] + plain[1], "sum");
-    leda::array<KyCXString> parts;
-    text[0].split('_', parts);
-    KyCXString joined(parts[0]);
-    for (int i = 1; i < parts.size(); ++i) joined += "_" + parts[i];
-    const auto separators = std::count(plain[0].begin(), plain[0].end(), u'_');
-    HX_Require(joined == text[0] && parts.size() == 1 + separators,
-               "split texts joined give the text");
+  void replace(PlainString what, PlainString by) {
+    int at = what.empty() ? -1 : find(what, 0);
+    for (; at >= 0; at = find(what, at + by.length()))
+      std::wstring::replace(static_cast<std::size_t>(at), what.size(), by);
   }
+  void trim(bool leading, bool trailing) {
+    if (leading) edit(L"^[ \t\n\v\f\r]+", L"");
+    if (trailing) edit(L"[ \t\n\v\f\r]+$", L"");
+  }
+  void replaceWhiteSpace(char by, bool collapse) {
+    edit(collapse ? L"[ \t\n\v\f\r]+" : L"[ \t\n\v\f\r]", PlainString(by));
+  }
+  void filterAngleBrackets() {
+    if (size() >= 2 && front() == L'<' && back() == L'>')
+      *this = sub(1, length() - 2);
+  }
+  void makeCIdentifier(bool collapse) {
+    edit(collapse ? L"[^A-Za-z0-9_]+" : L"[^A-Za-z0-9_]", L"_");
+    edit(L"^[0-9]", L"_$&");
+  }
+  bool isValidCIdentifier() const {
+    PlainString made(*this);
+    made.makeCIdentifier(false);
+    return !empty() && made == *this;
+  }
+  void toLower() {
+    for (wchar_t& unit : *this)
+      if (unit >= L'A' && unit <= L'Z') unit += L'a' - L'A';
+  }
+  void toUpper() {
+    for (wchar_t& unit : *this)
+      if (unit >= L'a' && unit <= L'z') unit -= L'a' - L'A';
+  }
+  void shortenString(int limit, int marks, char fill,
+                     KyCXString::ScEPosition position) {
+    limit = std::max(limit, 0);
+    marks = std::max(marks, 0);
+    if (length() <= limit) return;
+    const int room = limit - marks;
+    const int tails[] = {room, room / 2, 0};
+    const int tail = room > 0 ? tails[position] : limit;
+    if (room <= 0) marks = 0;
+    *this =
+        head(room - tail) +
+        std::wstring(static_cast<std::size_t>(marks), PlainString(fill)[0]) +
+        sub(length() - tail, length());
+  }
+
+ private:
+  void edit(const wchar_t* pattern, const std::wstring& by) {
+    assign(std::regex_replace(*this, std::wregex(pattern), by));
+  }
+
+  mutable std::string m_Narrow;
 };
+
+template <class Text>
+struct Arguments {
+  const Text &one, &two;  // each may be the changed text itself
+  Text given;
+  int from, to;
+  char character;
+  bool first, second;
+  KyCXString::ScEPosition position;
+};
+
+template <class Text>
+constexpr void (*kChanges[])(Text& t, const Arguments<Text>& a) = {
+    [](auto& t, auto& a) { t = a.given; },
+    [](auto& t, auto& a) { t = a.one; },
+    [](auto& t, auto& a) { t += a.one; },
+    [](auto& t, auto& a) { t += a.one.cstring(); },
+    [](auto& t, auto& a) { t += a.character; },
+    [](auto& t, auto&) { t = t.cstring() + std::min(t.length(), 3); },
+    [](auto& t, auto&) {
+      Text moved(std::move(t));  // leaves an empty text
+      t += moved;
+    },
+    [](auto& t, auto& a) { t = t.sub(a.from, a.to); },
+    [](auto& t, auto& a) { t = t.head(a.from); },
+    [](auto& t, auto& a) { t.appendSub(a.one, a.from, a.to); },
+    [](auto& t, auto& a) { t.replace(a.one, a.two); },
+    [](auto& t, auto& a) { t.trim(a.first, a.second); },
+    [](auto& t, auto& a) { t.replaceWhiteSpace(a.character, a.first); },
+    [](auto& t, auto&) { t.filterAngleBrackets(); },
+    [](auto& t, auto& a) { t.makeCIdentifier(a.first); },
+    [](auto& t, auto&) { t.toLower(); },
+    [](auto& t, auto&) { t.toUpper(); },
+    [](auto& t, auto& a) {
+      t.shortenString(a.from, a.to % 4, a.character, a.position);
+    },
+};
+
+// What can be asked of a text.
+template <class Text>
+std::string answers(const Text& t, const Arguments<Text>& a) {
+  std::ostringstream out;
+  for (int i = -1; i <= t.length(); ++i) out << t[i] << ' ';
+  out << t[INT_MIN] << t[INT_MAX] << ' ' << t.find(a.one, a.from) << ' '
+      << t.find(a.character, a.from) << ' ' << t.isValidCIdentifier()
+      << t.startsWith(a.one) << (t == a.one) << (t < a.one)
+      << (t.compareWith(a.one) > 0) << Text(t + a.one).cstring()
+      << std::string(t.cstring(), static_cast<std::size_t>(t.length()) + 1);
+  return out.str();
+}
+
+int position(HX_Bytes& bytes) {
+  const int number = bytes.number();
+  return number < 2 ? (number == 0 ? INT_MIN : INT_MAX) : number % 50 - 5;
+}
+
+// Changes one of two texts; gives what it then answers.
+template <class Text>
+std::string step(Text* texts, HX_Bytes& bytes) {
+  const int change = bytes.below(static_cast<int>(std::size(kChanges<Text>)));
+  const int choice = bytes.number();
+  const Arguments<Text> arguments{
+      texts[choice % 2],
+      texts[choice / 2 % 2],
+      change == 0 ? bytes.text() : KyCXString(),
+      position(bytes),
+      position(bytes),
+      static_cast<char>(bytes.number()),
+      choice / 4 % 2 != 0,
+      choice / 8 % 2 != 0,
+      static_cast<KyCXString::ScEPosition>(choice / 16 % 3)};
+  Text& text = texts[choice / 64 % 2];
+  kChanges<Text>[change](text, arguments);
+  const std::string result = answers(text, arguments);
+  if (text.length() > 500) text = "";
+  return result;
+}
+
+void checkSplit(const KyCXString& text, char separator) {
+  leda::array<KyCXString> parts;
+  text.split(separator, parts);
+  KyCXString joined;
+  for (const KyCXString& part : parts) {
+    HX_Require(part.find(separator) < 0, "no separator in a part");
+    joined += part;
+    joined += separator;
+  }
+  HX_Require(joined == text + KyCXString(separator), "parts joined");
+}
 
 }  // namespace
 
 void HX_CheckString(HX_Bytes& bytes) {
-  Walk walk;
+  KyCXString texts[2];
+  PlainString plain[2];
   while (!bytes.isEmpty()) {
-    walk.step(bytes);
-    walk.check(bytes);
+    HX_Bytes same(bytes);
+    const std::string expected = step(plain, same);
+    const std::string result = step(texts, bytes);
+    HX_Require(result == expected, result + " is " + expected);
+    checkSplit(texts[0], '_');
   }
 }
