@@ -16,22 +16,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// Catches what is written to a stream while it lives.
-class Catch {
- public:
-  explicit Catch(std::ostream& stream)
-      : m_Stream(stream), m_pOld(stream.rdbuf(m_Text.rdbuf())) {}
-  Catch(const Catch&) = delete;
-  Catch& operator=(const Catch&) = delete;
-  ~Catch() { m_Stream.rdbuf(m_pOld); }
-  std::string text() const { return m_Text.str(); }
-
- private:
-  std::ostream& m_Stream;
-  std::ostringstream m_Text;
-  std::streambuf* m_pOld;
-};
-
 // In memory, and gone with the object.
 struct Folder {
   Folder() { fs::create_directory(path); }
@@ -51,12 +35,16 @@ void HX_CheckDocument(HX_Bytes& bytes) {
       "hx_codegen",      "generate", model.c_str(), "--keywords",
       HX_KEYWORD_FOLDER, "--json",   "--out",       out.c_str()};
 
-  const Catch output(std::cout), errors(std::cerr);
+  std::ostringstream output, errors;
+  std::streambuf* const oldOutput = std::cout.rdbuf(output.rdbuf());
+  std::streambuf* const oldErrors = std::cerr.rdbuf(errors.rdbuf());
   const int code = HX_CodegenMain(std::size(arguments), arguments);
-  const std::string text = errors.text();
+  std::cout.rdbuf(oldOutput);
+  std::cerr.rdbuf(oldErrors);
+  const std::string text = errors.str();
   HX_Require(code >= 0 && code <= 2, "an exit code");
   HX_Require(fs::exists(out) == (code == 0), "files if and only if it is done");
-  HX_Require(output.text().empty() == (code != 0), "the same for the output");
+  HX_Require(output.str().empty() == (code != 0), "the same for the output");
   if (code == 2)
     HX_Require(text.starts_with("hx_codegen: " + model.string() + ": ") &&
                    text.find('\n') == text.size() - 1,

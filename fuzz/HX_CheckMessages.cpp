@@ -11,79 +11,62 @@
 
 namespace {
 
-struct Case {
-  HX_Bytes& bytes;
-  const HxCSrcRef* srcRef;
+constexpr int kRows = static_cast<int>(std::size(kErrCatalogue));
+constexpr ERR_CatalogueRow kUnknown{4711, 0, "", 0, false, ""};
+
+// A row with its severity and source; gives the text that it must have.
+struct Report {
+  ERR_CatalogueRow row;
   int severity;
-  std::string expected;
-};
+  const HxCSrcRef* srcRef;
 
-// Reads the arguments from \p position on, then reports.
-template <int row, int position, class... Read>
-void report(Case& test, Read... read) {
-  constexpr ERR_CatalogueRow kRow = kErrCatalogue[row];
-  constexpr char kKind = [] {
-    const char* text = kRow.text;
-    char kind = 0;
-    for (int i = 0; i <= position; ++i) kind = err_detail::nextConversion(text);
-    return kind;
-  }();
-  if constexpr (kKind == 0) {
+  template <class... Arguments>
+  std::string emit(Arguments... arguments) const {
     char text[10000];
-    if constexpr (sizeof...(read) != 0)
-      std::snprintf(text, sizeof text, kRow.text, read...);
-    test.expected = sizeof...(read) != 0 ? text : kRow.text;
-    ERR_EmitErrorMessage(test.severity, test.srcRef, kRow.number, read...);
-  } else {
-    const std::string line = test.bytes.line().substr(0, 1500);
-    if constexpr (kKind == 's')
-      report<row, position + 1>(test, read..., line.c_str());
-    else if constexpr (kKind == 'd')
-      report<row, position + 1>(
-          test, read...,
-          static_cast<int>(std::strtol(line.c_str(), nullptr, 10)));
-    else
-      report<row, position + 1>(test, read...,
-                                std::strtod(line.c_str(), nullptr));
+    std::snprintf(text, sizeof text, row.text, arguments...);
+    ERR_EmitErrorMessage(severity, srcRef, row.number, arguments...);
+    return text;
   }
-}
-
-template <int... row>
-void reportRow(Case& test, int wanted, std::integer_sequence<int, row...>) {
-  ((row == wanted ? report<row, 0>(test) : void()), ...);
-}
+  // With what fits the row; texts that it does not ask for do no harm.
+  std::string emitFrom(HX_Bytes& bytes) const {
+    std::string kinds, lines[4];
+    const char* rest = row.text;
+    while (const char kind = err_detail::nextConversion(rest)) kinds += kind;
+    for (std::string& line : lines) line = bytes.line().substr(0, 1500);
+    const auto text = [&](int i) { return lines[i].c_str(); };
+    const auto number = [&](int i) { return std::strtod(text(i), nullptr); };
+    if (kinds == "sd") return emit(text(0), std::atoi(text(1)));
+    if (kinds == "sf") return emit(text(0), number(1));
+    if (kinds == "ssff") return emit(text(0), text(1), number(2), number(3));
+    HX_Require(kinds.find_first_not_of('s') == kinds.npos, "known " + kinds);
+    return emit(text(0), text(1), text(2), text(3));
+  }
+};
 
 }  // namespace
 
 void HX_CheckMessages(HX_Bytes& bytes) {
-  constexpr int kRows = static_cast<int>(std::size(kErrCatalogue));
   HX_MessageHandler& handler = HX_MessageHandler::instance();
   handler.clear();
   int worst = 0;
   while (!bytes.isEmpty()) {
-    const int row = bytes.below(kRows + 1);
+    const int index = bytes.below(kRows + 1);
     const int severity = bytes.number() - 128;
     const bool hasSource = bytes.flag();
     const HX_Block block(bytes.text());
-    Case test{bytes, hasSource ? block.getSrcRef() : nullptr, severity, ""};
-    const int unknown = 4000 + bytes.number();
-    if (row < kRows)
-      reportRow(test, row, std::make_integer_sequence<int, kRows>());
-    else
-      ERR_EmitErrorMessage(severity, test.srcRef, unknown);
+    const Report report{index < kRows ? kErrCatalogue[index] : kUnknown,
+                        severity, hasSource ? block.getSrcRef() : nullptr};
+    const std::string text = report.emitFrom(bytes);
 
     const HX_Message& message = handler.messages().back();
-    HX_Require(message.text == test.expected, "text " + test.expected);
-    const bool isKnown = row < kRows;
-    HX_Require(message.row == (isKnown ? kErrCatalogue[row].number : unknown) &&
-                   message.id == (isKnown ? kErrCatalogue[row].id : 0),
+    HX_Require(message.text == text, "text " + text);
+    HX_Require(message.row == report.row.number && message.id == report.row.id,
                "numbers");
     KyCXString source(hasSource ? block.getName() : KyCXString());
     source.replaceWhiteSpace(' ', false);
+    HX_Require(message.source == source.cstring(), "source");
     worst = std::max(worst, severity & 3);
-    HX_Require(
-        message.source == source.cstring() && ERR_get_errstatus() == worst,
-        "source, and the status is the worst so far");
+    HX_Require(ERR_get_errstatus() == worst, "the status is the worst so far");
   }
   handler.clear();
 }

@@ -32,7 +32,12 @@ class HX_Bytes {
   }
   int below(int limit) { return number() % limit; }
   bool flag() { return number() % 2 != 0; }
-  std::string line() { return partUntil('\n'); }
+  std::string line() {
+    const std::size_t length = m_Bytes.find('\n', m_At) - m_At;
+    const std::string line = m_Bytes.substr(m_At, length);
+    m_At = std::min(m_At + line.size() + 1, m_Bytes.size());
+    return line;
+  }
   /// A line; its bytes from 0xF8 on stand for the units from 0xFFF8 on.
   KyCXString text() {
     KyCXString text;
@@ -43,18 +48,11 @@ class HX_Bytes {
     }
     return text;
   }
-  std::string rest() { return partUntil(-1); }
-
- private:
-  std::string partUntil(int end) {
-    const std::size_t start = std::min(m_At, m_Bytes.size());
-    m_At = end < 0 ? std::string::npos
-                   : m_Bytes.find(static_cast<char>(end), start);
-    const std::string part = m_Bytes.substr(start, m_At - start);
-    if (m_At != std::string::npos) ++m_At;
-    return part;
+  std::string rest() {
+    return m_Bytes.substr(std::exchange(m_At, m_Bytes.size()));
   }
 
+ private:
   std::string m_Bytes;
   std::size_t m_At = 0;
 };
