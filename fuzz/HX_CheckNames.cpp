@@ -4,8 +4,6 @@
 #include <set>
 
 #include "NameSpace/HX_LimitedNameSpace.h"
-#include "NameSpace/HxCNameSpace.h"
-#include "NameSpace/HxCXStringIdServer.h"
 #include "Naming/HxCNames.h"
 #include "SourceRef/HxCDdSrcRef.h"
 #include "SourceRef/HxCStateflowSrcRef.h"
@@ -234,51 +232,22 @@ void checkRoad(Model& model, const Item& item, Id& id) {
   HX_Require(bothNames(again) == bothNames(id), "a C name is left alone");
 }
 
-// A file and a body in it, and a flat set: every name defined differs from the
-// words and, where it can be seen, from the others.
-struct Scopes {
-  Scopes() {
-    ids.boot();
-    body.newScope(file.newEnv());
-    KyCXString word("if");
-    flat.add(word);
+// The variant of a name that is no word of C and was not given before.
+void checkVariant(HX_LimitedNameSpace& taken, std::set<std::string>& given,
+                  const KyCXString& wanted, bool isLimited) {
+  HxCNames names;
+  KyCXString variant = wanted;
+  for (int i = 0; !names.isStringValidCVariableName(variant); ++i) {
+    variant = wanted;
+    names.appendSuffix(variant, i);
   }
-  Scopes(const Scopes&) = delete;
-  Scopes& operator=(const Scopes&) = delete;
-  ~Scopes() {
-    delete file.getScope();
-    ids.shutdown();
-  }
-
-  void define(HxCNameSpace& scope, const KyCXString& wanted, bool isLimited) {
-    HxCNames names;
-    KyCXString name = wanted, variant = wanted;
-    for (int i = 0;
-         !names.isStringValidCVariableName(name) || scope.stringInEnv(name);
-         ++i) {
-      name = wanted;
-      names.appendSuffix(name, i);
-    }
-    flat.addUnique(variant);
-    for (const KyCXString& given : {name, variant}) {
-      if (given == wanted) continue;
-      HX_Require(given.isValidCIdentifier() && !(given == "if"), "derived");
-      HX_Require(!isLimited || given.length() <= HxCSymbol::sm_MaxNameLength,
-                 "derived: not too long");
-    }
-    HX_Require(taken.insert(variant.cstring()).second, "given once");
-    int key = -1;
-    scope.createIdn(name, key);
-    HX_Require(scope.defineString(name) && !scope.defineString(name) &&
-                   scope.keyInScope(key) && name == ids.getString(key),
-               "defined once, and read back");
-  }
-
-  HxCXStringIdServer ids;
-  HxCNameSpace file{&ids}, body{&ids};
-  HX_LimitedNameSpace flat;
-  std::set<std::string> taken;
-};
+  taken.addUnique(variant);
+  HX_Require(given.insert(variant.cstring()).second, "given once");
+  if (variant == wanted) return;
+  HX_Require(variant.isValidCIdentifier(), "derived: an identifier");
+  HX_Require(!isLimited || variant.length() <= HxCSymbol::sm_MaxNameLength,
+             "derived: not too long");
+}
 
 }  // namespace
 
@@ -286,7 +255,8 @@ struct Scopes {
 void HX_CheckNames(HX_Bytes& bytes) {
   constexpr int kNames = 40;
   Model model(bytes);
-  Scopes scopes;
+  HX_LimitedNameSpace taken;
+  std::set<std::string> given;
   for (int i = 0; i == 0 || (i < kNames && !bytes.isEmpty()); ++i) {
     const KyCXString text = bytes.text();
     const std::string form = text.cstring();
@@ -296,8 +266,7 @@ void HX_CheckNames(HX_Bytes& bytes) {
     Id id = item.begin(text);
     substitute(model, bytes, item, id);
     checkRoad(model, item, id);
-    scopes.define(model.choices.flag() ? scopes.file : scopes.body,
-                  id.getCookedName(Id::eActualName),
-                  model.options.getLimitVariableNameLength());
+    checkVariant(taken, given, id.getCookedName(Id::eActualName),
+                 model.options.getLimitVariableNameLength());
   }
 }

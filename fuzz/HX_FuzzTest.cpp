@@ -4,8 +4,8 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
-#include <map>
 #include <random>
+#include <set>
 #include <vector>
 
 #include "fuzz/HX_Fuzz.h"
@@ -44,17 +44,17 @@ void expectHolds(const CheckRow& row, const std::string& input) {
   }
 }
 
-// In the order of the files' names.
 Corpus readCorpus(const char* name) {
-  std::map<fs::path, std::string> texts;
-  for (const auto& entry :
-       fs::directory_iterator(fs::path(HX_FUZZ_FOLDER) / "corpus" / name)) {
-    std::ifstream file(entry.path(), std::ios::binary);
-    texts[entry.path()] = {std::istreambuf_iterator<char>(file), {}};
-  }
+  const fs::directory_iterator files(fs::path(HX_FUZZ_FOLDER) / "corpus" /
+                                     name);
+  const std::set<fs::path> sorted(files, fs::directory_iterator());
   Corpus corpus;
-  for (const auto& [path, text] : texts) corpus.push_back(text);
-  EXPECT_FALSE(corpus.empty()) << name;
+  for (const fs::path& path : sorted) {
+    std::ifstream file(path, std::ios::binary);
+    corpus.emplace_back(std::istreambuf_iterator<char>(file),
+                        std::istreambuf_iterator<char>());
+  }
+  EXPECT_FALSE(corpus.empty());
   return corpus;
 }
 
