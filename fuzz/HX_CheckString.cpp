@@ -102,6 +102,7 @@ struct PlainString : std::wstring {
   mutable std::string m_Narrow;
 };
 
+// What a change or a question is given.
 template <class Text>
 struct Arguments {
   const Text &one, &two;  // each may be the changed text itself
@@ -112,6 +113,7 @@ struct Arguments {
   KyCXString::ScEPosition position;
 };
 
+// Each works on both classes; what was moved from is empty.
 template <class Text>
 constexpr void (*kChanges[])(Text& t, const Arguments<Text>& a) = {
     [](auto& t, auto& a) { t = a.given; },
@@ -121,7 +123,7 @@ constexpr void (*kChanges[])(Text& t, const Arguments<Text>& a) = {
     [](auto& t, auto& a) { t += a.character; },
     [](auto& t, auto&) { t = t.cstring() + std::min(t.length(), 3); },
     [](auto& t, auto&) {
-      Text moved(std::move(t));  // leaves an empty text
+      Text moved(std::move(t));
       t += moved;
     },
     [](auto& t, auto& a) { t = t.sub(a.from, a.to); },
