@@ -7,6 +7,9 @@
 
 namespace {
 
+constexpr wchar_t kNameUnits[] =
+    L"_0123456789abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ";
+
 // The operations of KyCXString in the plainest form. What may be a part of the
 // text itself is taken as a copy.
 struct PlainString : std::wstring {
@@ -67,9 +70,8 @@ struct PlainString : std::wstring {
     edit(L"^[0-9]", L"_$&");
   }
   bool isValidCIdentifier() const {
-    PlainString made(*this);
-    made.makeCIdentifier(false);
-    return !empty() && made == *this;
+    return !empty() && (front() < L'0' || front() > L'9') &&
+           find_first_not_of(kNameUnits) == npos;
   }
   void toLower() {
     for (wchar_t& unit : *this)
@@ -177,7 +179,7 @@ std::string step(Text* texts, HX_Bytes& bytes) {
   Text& text = texts[choice / 64 % 2];
   kChanges<Text>[change](text, arguments);
   const std::string result = answers(text, arguments);
-  if (text.length() > 500) text = "";
+  if (text.length() > 100) text = "";
   return result;
 }
 
