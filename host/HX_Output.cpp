@@ -11,9 +11,23 @@ namespace fs = std::filesystem;
 
 namespace {
 
-[[noreturn]] void fail(const fs::path& path, const std::error_code& error) {
+volatile std::sig_atomic_t s_Signal = 0;  // the last one that was held back
+
+void stopAfterSignal() {
+  if (s_Signal != 0) throw HX_OutputError("interrupted");
+}
+
+// Of this process and, as several outputs may share a folder, in it.
+std::string temporaryName() {
+  static int s_Number = 0;
+  return ".hx_codegen-" + std::to_string(getpid()) + "-" +
+         std::to_string(++s_Number);
+}
+
+[[noreturn]] void fail(const fs::path& path, const std::error_code& error,
+                       const std::string& more = "") {
   throw HX_OutputError(path.string() +
-                       ": cannot be written: " + error.message());
+                       ": cannot be written: " + error.message() + more);
 }
 
 void require(bool isDone, const fs::path& path) {
@@ -31,21 +45,32 @@ bool haveSameContent(const fs::path& a, const fs::path& b) {
 
 }  // namespace
 
+HX_Output::HeldSignals::HeldSignals() {
+  struct sigaction note = {};
+  note.sa_handler = [](int signal) { s_Signal = signal; };
+  for (const int signal : {SIGHUP, SIGINT, SIGTERM}) {
+    struct sigaction& before = m_Before[signal];
+    sigaction(signal, nullptr, &before);
+    if (before.sa_handler == SIG_DFL) sigaction(signal, &note, nullptr);
+  }
+}
+
+HX_Output::HeldSignals::~HeldSignals() {
+  for (const auto& [signal, before] : m_Before)
+    sigaction(signal, &before, nullptr);
+  if (s_Signal != 0) std::raise(s_Signal);
+}
+
 HX_Output::HX_Output(const fs::path& folder)
     : m_Folder(folder),
-      m_Temporary(folder / (".hx_codegen-" + std::to_string(getpid()))),
+      m_Temporary(folder / temporaryName()),
       m_New(m_Temporary / "new"),
       m_Old(m_Temporary / "old") {}
 
 HX_Output::~HX_Output() {
   std::error_code error;
-  for (const std::string& name : m_Moved) {
-    fs::rename(m_Old / name, m_Folder / name, error);
-    if (!error || fs::exists(m_New / name, error)) continue;
-    fs::remove(m_Folder / name, error);  // there was no old one
-  }
   m_Files.clear();
-  fs::remove_all(m_Temporary, error);
+  fs::remove_all(m_KeepsOld ? m_New : m_Temporary, error);
   for (const fs::path& made : m_MadeFolders) fs::remove(made, error);
 }
 
@@ -60,6 +85,7 @@ void HX_Output::makeFolders() {
 }
 
 std::ostream& HX_Output::open(const std::string& name) {
+  stopAfterSignal();
   if (m_Files.empty()) makeFolders();
   std::ofstream& file = m_Files[name];
   file.open(m_New / name, std::ios::binary);
@@ -81,18 +107,37 @@ std::size_t HX_Output::finish() {
   return m_Changed.size();
 }
 
-void HX_Output::commit() {
+// What was in the way is in m_Old then.
+std::error_code HX_Output::replace(const std::string& name) {
+  const fs::path path = m_Folder / name;
   std::error_code error;
-  for (const std::string& name : m_Changed) {
-    const fs::path path = m_Folder / name;
-    if (fs::exists(path, error)) {
-      fs::create_hard_link(path, m_Old / name, error);
-      if (error) fs::rename(path, m_Old / name, error);  // no links here
-      if (error) fail(path, error);
-    }
-    m_Moved.push_back(name);
-    fs::rename(m_New / name, path, error);
-    if (error) fail(path, error);
+  if (fs::exists(path, error)) {
+    fs::create_hard_link(path, m_Old / name, error);
+    if (error) fs::rename(path, m_Old / name, error);  // no links here
+    if (error) return error;
   }
-  m_Moved.clear();
+  fs::rename(m_New / name, path, error);
+  return error;
+}
+
+// Undoes replace() as far as it came.
+void HX_Output::putBack(const std::string& name) {
+  std::error_code error;
+  if (fs::exists(m_Old / name, error)) {
+    fs::rename(m_Old / name, m_Folder / name, error);
+    if (error) m_KeepsOld = true;
+  } else if (!fs::exists(m_New / name, error)) {
+    fs::remove(m_Folder / name, error);
+  }
+}
+
+void HX_Output::commit() {
+  stopAfterSignal();
+  for (const std::string& name : m_Changed) {
+    const std::error_code error = replace(name);
+    if (!error) continue;
+    for (const std::string& each : m_Changed) putBack(each);
+    fail(m_Folder / name, error,
+         m_KeepsOld ? "; old files are in " + m_Old.string() : "");
+  }
 }

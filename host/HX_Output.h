@@ -9,11 +9,13 @@
 #ifndef HOST_HX_OUTPUT_H
 #define HOST_HX_OUTPUT_H
 
+#include <csignal>
 #include <filesystem>
 #include <fstream>
 #include <map>
 #include <stdexcept>
 #include <string>
+#include <system_error>
 #include <vector>
 
 /// Something that cannot be written; tells what and why in one line.
@@ -24,7 +26,10 @@ class HX_OutputError : public std::runtime_error {
 
 /// Every operation throws HX_OutputError. Destruction without commit(), or
 /// after one that failed, leaves everything as it was: files that had been
-/// replaced are back, and a folder that was made is gone.
+/// replaced are back, and a folder that was made is gone. Old files that could
+/// not be put back stay where the error tells.
+///
+/// SIGHUP, SIGINT and SIGTERM end the program after that, or after commit().
 class HX_Output {
  public:
   explicit HX_Output(const std::filesystem::path& folder);
@@ -44,8 +49,24 @@ class HX_Output {
   void commit();
 
  private:
-  void makeFolders();
+  /// Holds back the signals that end a program: while it lives they interrupt
+  /// what waits and are noted, afterwards they act.
+  class HeldSignals {
+   public:
+    HeldSignals();
+    HeldSignals(const HeldSignals&) = delete;
+    HeldSignals& operator=(const HeldSignals&) = delete;
+    ~HeldSignals();
 
+   private:
+    std::map<int, struct sigaction> m_Before;
+  };
+
+  void makeFolders();
+  std::error_code replace(const std::string& name);
+  void putBack(const std::string& name);
+
+  const HeldSignals m_Signals;  // act when everything else is gone
   const std::filesystem::path m_Folder;
   // In m_Folder, so that moving a file is renaming it.
   const std::filesystem::path m_Temporary;
@@ -54,7 +75,7 @@ class HX_Output {
   std::vector<std::filesystem::path> m_MadeFolders;  // inner before outer
   std::map<std::string, std::ofstream> m_Files;
   std::vector<std::string> m_Changed;
-  std::vector<std::string> m_Moved;  // by a commit() that did not end
+  bool m_KeepsOld = false;  // m_Old has the only copy of something
 };
 
 #endif  // HOST_HX_OUTPUT_H

@@ -1,8 +1,7 @@
 #include "host/HX_Profile.h"
 
-#include <fstream>
-
 #include "Trace/HxCTransformationTracer.h"
+#include "host/HX_Output.h"
 #include "host/HX_Version.h"
 #include "platform/matlab/HX_MexInterface.h"
 
@@ -47,12 +46,16 @@ void HX_Profile::note(const std::string& text) {
 
 void HX_Profile::finish() {
   if (!m_IsOn) return;
+  m_IsOn = false;
   m_Server.printCurrentResults("Results");
   HX_StopWatch::endStopWatches();
   HxCTransformationTracer::shutdown();
 
-  std::ofstream("HX_Trace.json", std::ios::binary)
+  HX_Output output(fs::current_path());
+  output.open("HX_Trace.json")
       << nlohmann::ordered_json{{"traceEvents", m_Events}}.dump(1) << '\n';
+  output.finish();
+  output.commit();
 }
 
 void HX_Profile::runEnded(const char* name, std::int64_t begin,

@@ -40,7 +40,8 @@ class HX_Profile : private HX_TimingListener {
   void setModel(const std::string& name);
   /// A line of the protocol.
   void note(const std::string& text);
-  /// Writes what the servers still hold.
+  /// Writes what the servers still hold, and the trace; further calls do
+  /// nothing. Throws HX_OutputError.
   void finish();
 
   /// Measures while it lives.

@@ -97,7 +97,9 @@ void generateCode(const Arguments& arguments, HX_Generator& generator) {
     std::cout << result.names.size() << " names, " << result.variables.size()
               << " variables; " << changed << " files written to "
               << arguments.out << '\n';
-  flushOutput();  // if nobody can be told, no file changes
+  // If the rest cannot be written, no file of the code changes.
+  generator.profile.finish();
+  flushOutput();
   output.commit();
 }
 
