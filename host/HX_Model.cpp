@@ -69,14 +69,14 @@ class Reader {
     HX_ReadSources(root, m_Model, m_Sources);
     root.erase("blocks");
     HX_ReadTypes(HX_FieldOf(root, "types"), m_Model, m_Types);
+    // Scopes refer to functions, and names to scopes and other names.
+    for (Json name : root["names"]) enterName(name);
     for (Json scope : HX_FieldOf(root, "scopes")) readScope(scope, nullptr);
     if (m_Model.fileScope == nullptr) {
       m_Model.fileScope = &m_Model.scopes.emplace_back();
       m_Model.fileScope->id = m_Model.fileScope->kind = "file";
     }
     readNames(root["names"]);
-    std::size_t index = 0;
-    for (Json scope : HX_FieldOf(root, "scopes")) completeScope(scope, index);
   }
 
  private:
@@ -127,31 +127,27 @@ class Reader {
         m_Document.fail(node["kind"], "one file scope");
       m_Model.fileScope = &scope;
     }
+    if (scope.kind == "function") readFunction(node["function"], scope);
     for (Json inner : HX_FieldOf(node, "scopes")) readScope(inner, &scope);
   }
 
-  // Names are known only now. Visits the scopes in the order of readScope().
-  void completeScope(Json node, std::size_t& index) {
-    const HX_ScopeItem& scope = m_Model.scopes[index++];
-    if (scope.kind == "function") {
-      HX_Name* function = m_Names.find(node["function"]);
-      if (!function->isFunction() || function->body != nullptr)
-        m_Document.fail(
-            node["function"],
-            "the id of a function, task or isr without another scope");
-      function->body = &scope;
-    }
-    for (Json inner : HX_FieldOf(node, "scopes")) completeScope(inner, index);
+  // The function that a scope is the body of.
+  void readFunction(Json id, const HX_ScopeItem& scope) {
+    HX_Name* function = m_Names.find(id);
+    if (!function->isFunction() || function->body != nullptr)
+      m_Document.fail(
+          id, "the id of a function, task or isr without another scope");
+    function->body = &scope;
+  }
+
+  void enterName(Json node) {
+    HX_Name& name = m_Model.names.emplace_back();
+    name.id = node["id"];
+    name.kind = node.value("kind", "object");
+    m_Names.enter(node, &name);
   }
 
   void readNames(HX_Json& names) {
-    for (Json node : names) {
-      HX_Name& name = m_Model.names.emplace_back();
-      name.id = node["id"];
-      name.kind = node.value("kind", "object");
-      m_Names.enter(node, &name);
-    }
-    // Names refer to tasks and variables that may stand after them.
     std::size_t index = 0;
     for (HX_Json& node : names) {
       readName(node, m_Model.names[index++]);

@@ -67,70 +67,13 @@ const HX_Json& schemaOfModels() {
   return s_Schema;
 }
 
-void check(Json value, Json schema);
-
-bool checkReference(Json value, Json target) {
-  constexpr std::size_t kPrefix = sizeof("#/$defs/") - 1;
-  const auto& text = target.get_ref<const std::string&>();
-  check(value, schemaOfModels()["$defs"][text.substr(kPrefix)]);
-  return true;
-}
-
-bool checkRequired(Json value, Json fields) {
-  for (Json field : fields) {
-    if (!value.contains(field)) throw Misfit{value, "a field " + field.dump()};
-  }
-  return true;
-}
-
-bool checkProperties(Json value, Json properties) {
-  for (auto it = value.begin(); it != value.end(); ++it) {
-    const auto property = properties.find(it.key());
-    if (property != properties.end()) check(*it, *property);
-  }
-  return true;
-}
-
-void checkNoOtherFields(Json value, Json properties) {
-  for (auto it = value.begin(); it != value.end(); ++it) {
-    if (properties.contains(it.key())) continue;
-    HX_Json keys;
-    for (const auto& [key, property] : properties.items()) keys += key;
-    throw Misfit{*it, "one of the fields " + shown(keys)};
-  }
-}
-
-bool checkItems(Json value, Json item) {
-  if (!value.is_array()) return true;  // but the other type that is possible
-  for (Json element : value) check(element, item);
-  return true;
-}
-
-bool checkConditions(Json value, Json rules) {
-  for (Json rule : rules) {
-    try {
-      check(value, rule["if"]);
-    } catch (const Misfit&) {
-      continue;
-    }
-    check(value, rule["then"]);
-  }
-  return true;
-}
-
-/// Tests a value of the right type.
-struct Keyword {
+/// What a value of the right type has to fulfil.
+struct Condition {
   bool (*holds)(Json value, Json argument);
-  const char* expectation;  // before the argument; null: holds() throws itself
+  const char* expectation;  // before the argument
 };
 
-// Any other keyword is a comment.
-const std::map<std::string, Keyword> kKeywords = {
-    {"$ref", {checkReference, nullptr}},
-    {"allOf", {checkConditions, nullptr}},
-    {"items", {checkItems, nullptr}},
-    {"properties", {checkProperties, nullptr}},
-    {"required", {checkRequired, nullptr}},
+const std::map<std::string, Condition> kConditions = {
     {"enum", {[](Json v, Json a) { return contains(a, v); }, "one of "}},
     {"pattern",
      {[](Json v, Json a) { return hasForm(v, a); }, "a text of the form "}},
@@ -148,15 +91,55 @@ const std::map<std::string, Keyword> kKeywords = {
      {[](Json v, Json a) { return v > a; }, "a number above "}},
 };
 
-void check(Json value, Json schema) {
-  if (schema.contains("type")) checkType(value, schema["type"]);
-  if (schema.contains("additionalProperties"))
-    checkNoOtherFields(value, schema["properties"]);
-  for (auto it = schema.begin(); it != schema.end(); ++it) {
-    const auto keyword = kKeywords.find(it.key());
-    if (keyword != kKeywords.end() && !keyword->second.holds(value, *it))
-      throw Misfit{value, keyword->second.expectation + shown(*it)};
+void check(Json value, Json schema);
+
+bool fits(Json value, Json schema) {
+  try {
+    check(value, schema);
+    return true;
+  } catch (const Misfit&) {
+    return false;
   }
+}
+
+void checkObject(Json object, Json schema) {
+  Json properties = HX_FieldOf(schema, "properties");
+  for (auto it = object.begin(); it != object.end(); ++it) {
+    const auto property = properties.find(it.key());
+    if (property != properties.end()) {
+      check(*it, *property);
+    } else if (schema.contains("additionalProperties")) {
+      HX_Json keys;
+      for (const auto& [key, other] : properties.items()) keys += key;
+      throw Misfit{*it, "one of the fields " + shown(keys)};
+    }
+  }
+  for (Json field : HX_FieldOf(schema, "required")) {
+    if (!object.contains(field))
+      throw Misfit{object, "a field " + field.dump()};
+  }
+  for (Json rule : HX_FieldOf(schema, "allOf")) {
+    if (fits(object, rule["if"])) check(object, rule["then"]);
+  }
+}
+
+// A keyword that is not looked for is a comment.
+void check(Json value, Json schema) {
+  const auto reference = schema.find("$ref");
+  if (reference != schema.end()) {
+    constexpr std::size_t kPrefix = sizeof("#/$defs/") - 1;
+    const auto& text = reference->get_ref<const std::string&>();
+    return check(value, schemaOfModels()["$defs"][text.substr(kPrefix)]);
+  }
+  if (schema.contains("type")) checkType(value, schema["type"]);
+  for (auto it = schema.begin(); it != schema.end(); ++it) {
+    const auto condition = kConditions.find(it.key());
+    if (condition != kConditions.end() && !condition->second.holds(value, *it))
+      throw Misfit{value, condition->second.expectation + shown(*it)};
+  }
+  if (value.is_object()) checkObject(value, schema);
+  if (!value.is_array()) return;
+  for (Json element : value) check(element, HX_FieldOf(schema, "items"));
 }
 
 }  // namespace

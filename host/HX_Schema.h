@@ -10,7 +10,7 @@ extern const char kHxModelSchema[];
 
 /// Throws HX_DocumentError at one place that differs from the schema, always
 /// the same one for a document. Understands the part of JSON Schema that the
-/// schema uses: $ref to $defs, type, enum, required, properties,
+/// schema uses: $ref to $defs (alone), type, enum, required, properties,
 /// additionalProperties (false), items, allOf with if and then, minLength and
 /// minItems (1), pattern (of the whole text), minimum, maximum,
 /// exclusiveMinimum.
