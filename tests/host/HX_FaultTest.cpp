@@ -1,14 +1,13 @@
 // What the program does where it cannot write or is stopped: one line, and
 // nothing is left behind.
 #include <fcntl.h>
-#include <gmock/gmock.h>
 
 #include <cerrno>
 #include <climits>
 #include <csignal>
 #include <set>
 
-#include "host/HX_HostProgram.h"
+#include "host/HX_HostTest.h"
 #include "host/HX_Output.h"
 
 namespace fs = std::filesystem;
@@ -82,20 +81,20 @@ const FaultCase kFaults[] = {
      "{ head -c 1; kill -TERM $(ls -A $n | cut -d- -f2); cat; } <$p >/dev/null "
      "& $P generate $B --json --out $n >$p; exit $?",
      nullptr, 128 + SIGTERM},
-    {"interrupted, and nobody reads what is printed",
-     "{ head -c 1; kill -INT $(ls -A $d | cut -d- -f2); sleep 1; } <$p "
+    {"terminated, and nobody reads what is printed",
+     "{ head -c 1; kill -TERM $(ls -A $d | cut -d- -f2); sleep 1; } <$p "
      ">/dev/null & $P generate $B --json --out $d >$p; exit $?",
-     nullptr, 128 + SIGINT},
+     nullptr, 128 + SIGTERM},
 };
 
-TEST(FaultTest, OneLineTellsWhatCannotBeWrittenAndNothingIsLeft) {
-  const fs::path folder = HX_ScratchFolder();
-  const std::string big = (folder / "big.json").string();
-  const std::string work = (folder / "work").string();
-  HX_WriteText(big, HX_RunCodegen("synthesize --blocks 400").out);
+class FaultTest : public HX_HostTest {};
+
+TEST_F(FaultTest, OneLineTellsWhatCannotBeWrittenAndNothingIsLeft) {
+  const std::string big = m_Folder / "big.json";
+  const std::string work = m_Folder / "work";
+  write(big, codegen("synthesize --blocks 400").out);
   const bool mayMount =
-      HX_RunCommand("unshare -m mount -t tmpfs none " + folder.string()).code ==
-      0;
+      shell("unshare -m mount -t tmpfs none " + m_Folder.string()).code == 0;
   for (const FaultCase& row : kFaults) {
     SCOPED_TRACE(row.why);
     if (!mayMount &&
@@ -104,11 +103,11 @@ TEST(FaultTest, OneLineTellsWhatCannotBeWrittenAndNothingIsLeft) {
       continue;
     }
     fs::remove_all(work);
-    HX_RunCommand("mkdir -p " + work + "/d; cd " + work + "; : >f; mkfifo p");
-    const HX_ProgramResult result = HX_RunCommand(
-        "(export P='" HX_CODEGEN_COMMAND "' M='" HX_DEMO_MODEL "' B='" + big +
-        "' d=" + work + "/d f=" + work + "/f p=" + work + "/p n=" + work +
-        "/n; " + row.command + ")");
+    shell("mkdir -p " + work + "/d; cd " + work + "; : >f; mkfifo p");
+    const Result result =
+        shell("(export P='" HX_CODEGEN_COMMAND "' M='" HX_DEMO_MODEL "' B='" +
+              big + "' d=" + work + "/d f=" + work + "/f p=" + work +
+              "/p n=" + work + "/n; " + row.command + ")");
     EXPECT_EQ(row.code, result.code);
     EXPECT_EQ("", result.out);
     // After the messages about the model.
@@ -126,13 +125,12 @@ TEST(FaultTest, OneLineTellsWhatCannotBeWrittenAndNothingIsLeft) {
   }
 }
 
-TEST(FaultTest, OldFileThatCannotBePutBackStaysAndIsNamed) {
-  const fs::path folder = HX_ScratchFolder();
+TEST_F(FaultTest, OldFileThatCannotBePutBackStaysAndIsNamed) {
   std::string message;
   {
-    HX_Output output(folder);
+    HX_Output output(m_Folder);
     for (const char* name : {"a", "b"}) {
-      HX_WriteText(folder / name, "old");
+      write(m_Folder / name, "old");
       output.open(name) << "new";
     }
     output.finish();
@@ -144,12 +142,12 @@ TEST(FaultTest, OldFileThatCannotBePutBackStaysAndIsNamed) {
     }
   }
   s_RenamesThatWork = INT_MAX;
-  const std::string expected = (folder / "b").string() +
+  const std::string expected = (m_Folder / "b").string() +
                                ": cannot be written: Input/output error; "
                                "old files are in ";
   ASSERT_THAT(message, testing::StartsWith(expected));
   const fs::path place = message.substr(expected.size());
-  EXPECT_EQ("old", HX_ReadText(place / "a"));
+  EXPECT_EQ("old", read(place / "a"));
 }
 
 }  // namespace

@@ -1,0 +1,61 @@
+// Commands, options, and what tells of them.
+#include <regex>
+#include <set>
+
+#include "host/HX_HostTest.h"
+
+using testing::HasSubstr;
+
+namespace {
+
+class CommandLineTest : public HX_HostTest {};
+
+TEST_F(CommandLineTest, WrongOnesAreRefused) {
+  for (const char* arguments :
+       {"", "names", "explain " HX_DEMO_MODEL, "generate " HX_DEMO_MODEL,
+        "names " HX_DEMO_MODEL " --wrong",
+        "explain " HX_DEMO_MODEL " --name nobody", "synthesize --blocks -1"}) {
+    SCOPED_TRACE(arguments);
+    const Result result = codegen(arguments);
+    EXPECT_EQ(2, result.code);
+    EXPECT_EQ("", result.out);
+    EXPECT_NE("", result.err);
+  }
+}
+
+TEST_F(CommandLineTest, VersionNamesTheProgram) {
+  EXPECT_THAT(codegen("--version").out,
+              testing::StartsWith("hx_codegen 1.0\nfile      1.0.0.0\n"));
+}
+
+TEST_F(CommandLineTest, ManualPageHasTheOptionsOfTheHelp) {
+  const auto optionsIn = [](const std::string& text) {
+    static const std::regex option("--[a-z]+");
+    return std::set<std::string>(
+        std::sregex_token_iterator(text.begin(), text.end(), option), {});
+  };
+  const std::string page =
+      std::regex_replace(read(HX_MANUAL_PAGE), std::regex(R"(\\-)"), "-");
+  std::string help = codegen("--help").out;
+  for (const std::string command :
+       {"names", "explain", "generate", "synthesize"}) {
+    EXPECT_THAT(help, HasSubstr("\n  " + command + " "));
+    EXPECT_THAT(page, HasSubstr("\n.SS " + command + "\n"));
+    help += codegen(command + " --help").out;
+  }
+  EXPECT_EQ(optionsIn(help), optionsIn(page));
+}
+
+TEST_F(CommandLineTest, TerminalShowsProgress) {
+  const std::string model = m_Folder / "model.json";
+  write(model, codegen("synthesize --blocks 5000").out);
+  const auto shownBy = [&](const std::string& options) {
+    return shell("script -qec '" HX_CODEGEN_COMMAND " names " + model +
+                 options + " >/dev/null' /dev/null </dev/null")
+        .out;
+  };
+  EXPECT_THAT(shownBy(""), HasSubstr("\rnames: 4000 of 5000"));
+  EXPECT_EQ("", shownBy(" --quiet"));
+}
+
+}  // namespace
