@@ -1,5 +1,6 @@
 // The string class against a plain one over std::wstring.
 #include <climits>
+#include <map>
 #include <regex>
 #include <sstream>
 
@@ -98,11 +99,21 @@ struct PlainString : std::wstring {
 
  private:
   void edit(const wchar_t* pattern, const std::wstring& by) {
-    assign(std::regex_replace(*this, std::wregex(pattern), by));
+    static std::map<std::wstring, std::wregex> s_compiled;
+    const auto& compiled =
+        s_compiled.try_emplace(pattern, pattern).first->second;
+    assign(std::regex_replace(*this, compiled, by));
   }
 
   mutable std::string m_Narrow;
 };
+
+void read(KyCXString& text, HX_Bytes& bytes) { text = bytes.text(); }
+
+// Not through the class that is checked.
+void read(PlainString& text, HX_Bytes& bytes) {
+  for (const char c : bytes.line()) text.push_back(HX_Bytes::unitOf(c));
+}
 
 // What a change or a question is given.
 template <class Text>
@@ -166,10 +177,12 @@ template <class Text>
 std::string step(Text* texts, HX_Bytes& bytes) {
   const int change = bytes.below(static_cast<int>(std::size(kChanges<Text>)));
   const int choice = bytes.number();
+  Text given;
+  if (change == 0) read(given, bytes);
   const Arguments<Text> arguments{
       texts[choice % 2],
       texts[choice / 2 % 2],
-      change == 0 ? bytes.text() : KyCXString(),
+      given,
       position(bytes),
       position(bytes),
       static_cast<char>(bytes.number()),

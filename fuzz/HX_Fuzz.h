@@ -41,12 +41,12 @@ class HX_Bytes {
   /// A line; its bytes from 0xF8 on stand for the units from 0xFFF8 on.
   KyCXString text() {
     KyCXString text;
-    for (const char c : line()) {
-      const auto unit = static_cast<unsigned char>(c);
-      text.appendUnit(
-          static_cast<unsigned short>(unit < 0xF8 ? unit : unit | 0xFF00));
-    }
+    for (const char c : line()) text.appendUnit(unitOf(c));
     return text;
+  }
+  static unsigned short unitOf(char c) {
+    const auto unit = static_cast<unsigned char>(c);
+    return static_cast<unsigned short>(unit < 0xF8 ? unit : unit | 0xFF00);
   }
   std::string rest() {
     return m_Bytes.substr(std::exchange(m_At, m_Bytes.size()));
