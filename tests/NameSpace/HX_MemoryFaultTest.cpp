@@ -1,6 +1,5 @@
 // Name spaces without each of the blocks that they ask for.
 #include "NameSpace/HX_LimitedNameSpace.h"
-#include "NameSpace/HxCNameSpace.h"
 #include "NameSpace/HxCXStringIdServer.h"
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
@@ -30,24 +29,6 @@ bool internsNames() {
   return done;
 }
 
-bool definesNames() {
-  HxCXStringIdServer ids;
-  ids.boot();
-  HxCNameSpace file(&ids), body(&ids);
-  bool done =
-      file.newEnv() != nullptr && body.newScope(file.getScope()) != nullptr;
-  for (int i = 0; body.getScope() != nullptr && i < 30; ++i) {
-    const KyCXString name(i, false, true);
-    const bool defined = body.defineString(name);
-    EXPECT_EQ(body.stringInScope(name), defined);
-    EXPECT_EQ(file.stringInEnv(name), defined);
-    done &= defined;
-  }
-  delete file.getScope();
-  ids.shutdown();
-  return done;
-}
-
 bool derivesNames() {
   HX_OptionsExt options;
   HxCGlobal::setOptions(&options);
@@ -68,7 +49,6 @@ bool derivesNames() {
 
 TEST_F(MemoryFaultTest, EachBlockMayBeMissing) {
   HX_WithoutEachBlock("intern names", internsNames);
-  HX_WithoutEachBlock("define names in scopes", definesNames);
   HX_WithoutEachBlock("derive names", derivesNames);
 }
 
