@@ -94,7 +94,9 @@ TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
           s = std::next(plain.counters.begin(),
                         static_cast<long>(random() % plain.counters.size()))
                   ->first;
-        if (random() % 8 == 0) PlainNames::shorten(s);
+        if (random() % 4 == 0) PlainNames::shorten(s);
+        if (random() % 4 == 0)
+          HxCNames().appendSuffix(s, static_cast<int>(random() % 4));
         if (random() % 1000 < row.switching)
           m_Options.setLimitVariableNameLength(random() % 2 == 0);
         if (random() % 500 == 0) {
