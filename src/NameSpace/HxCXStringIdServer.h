@@ -64,37 +64,25 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
   /// assertion if the server is down.
   const char* getString(int id) const {
     if (m_pTable == nullptr) return refuseText();
-    const unsigned place = static_cast<unsigned>(id);
-    return place < m_pTable->nearSize ? m_pTable->nearTexts[place]
-                                      : textFarOff(id);
+    const unsigned bits = static_cast<unsigned>(id);
+    const Bucket& bucket = m_pTable->buckets[bits % kBucketCount];
+    const unsigned arrival = bits / kBucketCount;
+    return arrival < bucket.size() ? bucket[arrival] : nullptr;
   }
 
  private:
   static constexpr unsigned kBucketCount = 1024;
 
-  struct Bucket {
-    unsigned arrivals = 0;
-    unsigned firstFar = 0;  // the arrival that farTexts starts with
-    HX_PlainArray<const char*> farTexts;  // all arrivals since that one
-  };
+  using Bucket = HX_PlainArray<const char*>;  // in the order of arrival
 
   struct Table : HX_Allocated {
     HX_KeyTable<int> index;  // the ids, by the hash of the text
     HX_TextArena texts;
     Bucket buckets[kBucketCount];
-    // The text of each id below nearSize, null for ids not handed out. Where
-    // the buckets fill evenly, nearly all ids are near.
-    const char** nearTexts = nullptr;
-    unsigned nearSize = 0;
-    unsigned nearUsed = 0;
   };
 
   static unsigned bucketOf(const char* text, std::size_t length);
   bool add(int hash, const char* text, std::size_t length, int& id);
-  bool keepText(unsigned id, const char* text);
-  void growNear();
-  void fillNear(const Bucket& bucket, unsigned number);
-  const char* textFarOff(int id) const;
   static const char* refuseText();
 
   Table* m_pTable = nullptr;  // null while down

@@ -70,6 +70,8 @@ TEST_F(StringIdServerTest, BootsAndShutsDownRepeatedlyAndReturnsAllMemory) {
   EXPECT_TRUE(m_Ids.boot());
   m_Ids.getId("ab");
   EXPECT_EQ(m_Ids.getId("ba"), 1219);
+  int id = 5;
+  EXPECT_TRUE(m_Ids.findOrAdd("", id) && id == 0);
   EXPECT_TRUE(m_Ids.boot());
   HxCXStringIdServer copy(m_Ids);
   EXPECT_EQ(copy.getId("ba"), 1219);
