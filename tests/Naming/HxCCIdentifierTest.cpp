@@ -63,7 +63,7 @@ TEST_F(CIdentifierTest, UsedFlagsCountFromTheirLevel) {
   const char* const ofTexts[] = {"LEN:", "LN:", ":", ":"};
   const char* const stored[] = {":", "E:E", "LE:EN", "LE:EN"};
   for (int level = 0; level <= 3; ++level) {
-    Id with("x_$L$E$N:");
+    Id with("x_$L$$E$N:");
     Id without("LEN:$");
     without.setDollarLUsed(true, kFormal);
     without.setDollarEUsed(true, kFormal);
