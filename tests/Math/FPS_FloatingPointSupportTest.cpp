@@ -107,22 +107,18 @@ struct Operation {
   const char* text;
   double (*of)(double x, double b);
   std::uint64_t recorded;  // sum of many results in a 64-bit build; 0: no sum
-  Values x, b, expected;
+  Values x, expected, b;
 };
 
 Operation row(const char* text, double (*of)(double, double),
-              std::uint64_t recorded, Values x, Values expected) {
-  return {text, of, recorded, x, {}, expected};
-}
-Operation row(const char* text, double (*of)(double, double),
-              std::uint64_t recorded, Values x, Values b, Values expected) {
-  return {text, of, recorded, x, b, expected};
+              std::uint64_t recorded, Values x, Values expected,
+              Values b = {}) {
+  return {text, of, recorded, x, expected, b};
 }
 
 #define HX_OF(expression) \
-#expression, [](double x, double) -> double { return expression; }
-#define HX_OF2(expression) \
-#expression, [](double x, double b) -> double { return expression; }
+#expression,            \
+      [](double x, [[maybe_unused]] double b) -> double { return expression; }
 
 const Operation kOperations[] = {
     row(HX_OF(FPS_CastFloatToBool(x)), 0xB9FF98AB98233825, {-0.0, kTiny, kNaN},
@@ -190,50 +186,38 @@ const Operation kOperations[] = {
         {1.3169578969248166, kNaN}),
     row(HX_OF(FPS_ATanh(x)), 0x5EFA3C86D6B55F43, {0.5, 1.0},
         {0.54930614433405489, kInf}),
-    row(HX_OF2(FPS_ValuesAreEqual(x, b)), 0x0CCF98AB98233825,
-        {kNaN, kNaN, kInf, kInf, 0.0, 1.0},
-        {-kNaN, 1.0, -kInf, kInf, -0.0, above(1.0)}, {1, 0, 0, 1, 1, 0}),
-    row(HX_OF2(FPS_ValuesAreApproxEqual(x, b)), 0xCD4F98AB98233825,
+    row(HX_OF(FPS_ValuesAreEqual(x, b)), 0x0CCF98AB98233825,
+        {kNaN, kNaN, kInf, kInf, 0.0, 1.0}, {1, 0, 0, 1, 1, 0},
+        {-kNaN, 1.0, -kInf, kInf, -0.0, above(1.0)}),
+    row(HX_OF(FPS_ValuesAreApproxEqual(x, b)), 0xCD4F98AB98233825,
         {1.0, 1e9, 0.0, 0.0, 0.0, -4.0, -4.0, kMax, kMax, kNaN},
+        {1, 1, 0, 0, 1, 0, 1, 0, 0, 1},
         {1.0 + 1e-9, 1e9 + 1.0, 2e-8, kTolerance, below(kTolerance),
          -4.0 + 4 * kTolerance, below(-4.0 + 4 * kTolerance), -kMax, kInf,
-         kNaN},
-        {1, 1, 0, 0, 1, 0, 1, 0, 0, 1}),
-    row(HX_OF2(FPS_ValuesAreApproxEqual(x, b, 0)), 0xBECF98AB98233825, {1.0},
-        {1.0}, {0}),
-    row(HX_OF2(FPS_ValuesAreApproxEqual(x, b, 1)), 0x15CF98AB98233825,
-        {3.0, 0.0}, {5.0, 5.0}, {1, 0}),
+         kNaN}),
+    row(HX_OF(FPS_ValuesAreApproxEqual(x, b, 0)), 0xBECF98AB98233825, {1.0},
+        {0}, {1.0}),
+    row(HX_OF(FPS_ValuesAreApproxEqual(x, b, 1)), 0x15CF98AB98233825,
+        {3.0, 0.0}, {1, 0}, {5.0, 5.0}),
     // A tie moves up; with 53 bits the added half rounds.
-    row(HX_OF2(FPS_RoundOffBits(x, FPS_SatCastToInt(b))), 0xDB503CBE87C1D01D,
+    row(HX_OF(FPS_RoundOffBits(x, FPS_SatCastToInt(b))), 0xDB503CBE87C1D01D,
         {0x1.2p0, -0x1.2p0, below(0x1.2p0), above(1.0), above(1.0), -kMax, -1.0,
          1.5, -1.5, -kInf},
-        {3, 3, 3, 53, 54, 1024, kTwo31 - 1, 0, -kTwo31, 8},
         {0x1.4p0, -0x1p0, 0x1p0, above(above(1.0)), above(1.0), -kMax, -kInf,
-         2.0, 0.0, -kInf}),
-    row(HX_OF2(FPS_RoundOffBits(x, static_cast<int>(bitsOf(b) % 64))),
-        0x9676B81054692057, {1.5}, {1.0}, {2.0}),
+         2.0, 0.0, -kInf},
+        {3, 3, 3, 53, 54, 1024, kTwo31 - 1, 0, -kTwo31, 8}),
+    row(HX_OF(FPS_RoundOffBits(x, static_cast<int>(bitsOf(b) % 64))),
+        0x9676B81054692057, {1.5}, {2.0}, {1.0}),
     // The quotient of the tiny value is -0.
-    row(HX_OF2(FPS_SimulinkAlikeModulo(x, b)), 0xA89686C2229AD553,
+    row(HX_OF(FPS_SimulinkAlikeModulo(x, b)), 0xA89686C2229AD553,
         {-7.0, 7.0, 5.0, -1e-300, -kTiny, 1.0},
-        {3.0, -3.0, -0.0, 3.0, 3.0, kInf}, {2.0, -2.0, 5.0, 3.0, -kTiny, kNaN}),
-    row(HX_OF2(FPS_SimulinkAlikeRem(x, b)), 0xC9DF848BF21AA200,
-        {-7.0, 7.0, kInf, 0x1p70}, {3.0, -3.0, 0.0, 1.0},
-        {-1.0, 1.0, 0.0, 0x1p70 - 0x1p63})};
-
-TEST_F(FloatingPointSupportTest, OperationsAtTheirBoundaries) {
-  for (const auto& [text, of, recorded, x, b, expected] : kOperations) {
-    for (std::size_t i = 0; i < expected.size(); ++i) {
-      const double result = of(x.at(i), b.empty() ? 0.0 : b.at(i));
-      EXPECT_EQ(bitsOf(result), bitsOf(expected[i]))
-          << text << " of " << testing::PrintToString(x) << "[" << i
-          << "] gave " << result << " instead of " << expected[i];
-    }
-  }
-  EXPECT_EQ(messages().size(), 3U);
-}
+        {2.0, -2.0, 5.0, 3.0, -kTiny, kNaN}, {3.0, -3.0, -0.0, 3.0, 3.0, kInf}),
+    row(HX_OF(FPS_SimulinkAlikeRem(x, b)), 0xC9DF848BF21AA200,
+        {-7.0, 7.0, kInf, 0x1p70}, {-1.0, 1.0, 0.0, 0x1p70 - 0x1p63},
+        {3.0, -3.0, 0.0, 1.0})};
 
 // No build may differ in any bit of any result.
-TEST_F(FloatingPointSupportTest, EveryBuildGivesTheSameBits) {
+TEST_F(FloatingPointSupportTest, OperationsGiveTheSameBitsInEveryBuild) {
   Values values = {
       0.0,    -0.0,   kNaN,      std::bit_cast<double>(0x7FF0000000000001),
       kInf,   -kInf,  kMax,      -kMax,
@@ -241,49 +225,50 @@ TEST_F(FloatingPointSupportTest, EveryBuildGivesTheSameBits) {
       -0x1p63};
   std::mt19937_64 random(20240229);
   while (values.size() < 200) values.push_back(draw(random));
-  for (const Operation& row : kOperations) {
-    if (row.recorded == 0) continue;
+  for (const auto& [text, of, recorded, x, expected, b] : kOperations) {
+    SCOPED_TRACE(text);
+    for (std::size_t i = 0; i < expected.size(); ++i) {
+      const double result = of(x.at(i), b.empty() ? 0.0 : b.at(i));
+      EXPECT_EQ(bitsOf(result), bitsOf(expected[i]))
+          << testing::PrintToString(x) << "[" << i << "] gave " << result
+          << " instead of " << expected[i];
+    }
+    if (recorded == 0) continue;
     std::uint64_t sum = 14695981039346656037U;
-    for (double a : values) {
-      for (double b : values) {
-        const double result = row.of(row.b.empty() ? a * b : a, b);
+    for (double first : values) {
+      for (double second : values) {
+        const double result = of(b.empty() ? first * second : first, second);
         sum = (sum ^ bitsOf(result)) * 1099511628211U;
       }
     }
-    EXPECT_EQ(sum, row.recorded) << row.text;
+    EXPECT_EQ(sum, recorded);
   }
-}
-
-double divisor(Values& values) {
-  return FPS_FindGreatestCommonDivisor(values.data());
-}
-double multiple(Values& values) {
-  return FPS_FindLeastCommonMultiple(static_cast<int>(values.size()),
-                                     values.data());
+  EXPECT_EQ(messages().size(), 3U);
 }
 
 TEST_F(FloatingPointSupportTest, EveryStepOfADivisorAsserts) {
   const struct {
-    double (*of)(Values& values);
     Values values;
-    double expected;
+    double divisor, multiple;
     std::size_t assertions;
-  } rows[] = {
-      {divisor, {12, 8}, 4, 3},        {divisor, {5, 0}, 5, 1},
-      {divisor, {0, 0}, 0, 1},         {divisor, {-12, 8}, -4, 3},
-      {divisor, {0.75, 0.5}, 0.25, 3}, {divisor, {kNaN, 1}, kNaN, 2},
-      {divisor, {1, kNaN}, kNaN, 1},   {divisor, {kInf, 2}, kNaN, 2},
-      {divisor, {2, kInf}, kNaN, 3},   {multiple, {0.5, 0.75, 1.0}, 3.0, 7},
-      {multiple, {4, 6}, 12, 4},       {multiple, {0, 0}, kNaN, 1}};
-  for (const auto& row : rows) {
-    Values values = row.values;
+  } rows[] = {{{12, 8}, 4, 24, 6},         {{5, 0}, 5, 0, 2},
+              {{0, 0}, 0, kNaN, 2},        {{-12, 8}, -4, 24, 6},
+              {{0.75, 0.5}, 0.25, 1.5, 6}, {{kNaN, 1}, kNaN, kNaN, 4},
+              {{1, kNaN}, kNaN, kNaN, 2},  {{kInf, 2}, kNaN, kNaN, 4},
+              {{2, kInf}, kNaN, kNaN, 6},  {{0.5, 0.75, 1.0}, 0.25, 3.0, 11}};
+  for (const auto& [given, divisor, multiple, assertions] : rows) {
+    SCOPED_TRACE(testing::PrintToString(given));
+    Values values = given;
     clearMessages();
-    EXPECT_EQ(bitsOf(row.of(values)), bitsOf(row.expected));
-    EXPECT_EQ(messages().size(), row.assertions)
-        << testing::PrintToString(values);
+    EXPECT_EQ(bitsOf(FPS_FindGreatestCommonDivisor(values.data())),
+              bitsOf(divisor));
+    EXPECT_EQ(bitsOf(FPS_FindLeastCommonMultiple(
+                  static_cast<int>(values.size()), values.data())),
+              bitsOf(multiple));
+    EXPECT_EQ(messages().size(), assertions);
     EXPECT_THAT(messages(), testing::Each(testing::HasSubstr(
                                 "Math/FPS_FloatingPointSupport.cpp_")));
-    EXPECT_TRUE(std::isnan(row.expected) || values == row.values);
+    EXPECT_TRUE(std::isnan(multiple) || values == given);
   }
 }
 
