@@ -16,20 +16,18 @@ namespace {
 TEST(IntegerMathSupportTest, WordsAndRangesOfBoundaryValues) {
   for (long long v : boundaryValues()) {
     SCOPED_TRACE(v);
-    const Integer exact(v);
-    EXPECT_EQ(Integer(IMS_AbsInt64(v)),
-              v == kMin64 ? Integer(kMax64) : abs(exact));
-    const bool fitsInt = v >= -2147483648LL && v < 2147483648LL;
-    const bool fitsUInt = v >= 0 && v < 4294967296LL;
+    EXPECT_EQ(IMS_AbsInt64(v), v == kMin64 ? kMax64 : std::abs(v));
+    const bool fitsInt = std::in_range<std::int32_t>(v);
+    const bool fitsUInt = std::in_range<std::uint32_t>(v);
     EXPECT_EQ(IMS_FitsInt32(v), fitsInt);
     EXPECT_EQ(IMS_FitsUInt32(v), fitsUInt);
     EXPECT_EQ(IMS_Fits32Bit(v), fitsInt || fitsUInt);
-    EXPECT_EQ(Integer(IMS_GetUpper32Bit(v)) * 4294967296 + IMS_GetLower32Bit(v),
-              exact);
+    EXPECT_EQ(IMS_GetUpper32Bit(v) * 4294967296 + IMS_GetLower32Bit(v), v);
     EXPECT_TRUE(IMS_FitsUInt32(IMS_GetLower32Bit(v)));
-    EXPECT_EQ(IMS_IsEven(v), exact % 2 == 0);
-    if (IMS_AbsInt64(v) < 1LL << 52) {
-      EXPECT_EQ(IMS_SimulinkAlikeSqrt(v), sqrt(abs(exact)) * (v < 0 ? -1 : 1));
+    EXPECT_EQ(IMS_IsEven(v), v % 2 == 0);
+    const Integer magnitude(IMS_AbsInt64(v));
+    if (magnitude < 1LL << 52) {
+      EXPECT_EQ(IMS_SimulinkAlikeSqrt(v), sqrt(magnitude) * (v < 0 ? -1 : 1));
     }
   }
 }
@@ -93,7 +91,7 @@ TEST(IntegerMathSupportTest, MultiplesWithinTheirBounds) {
                                 i / kCount / kCount};
     long long multiple = values[0];
     for (long long v : {values[1], values[2]}) {
-      // A proper divisor of what comes before it is refused, 0 as well.
+      // 0 and a proper divisor of what came before are refused.
       const bool refused = v == 0 || (multiple % v == 0 && multiple != v);
       multiple = refused ? 0 : std::lcm(multiple, v);
       if (multiple > 60) multiple = 0;
@@ -107,22 +105,22 @@ TEST(IntegerMathSupportTest, WrapsAndMatchesAsTheTypeDoes) {
   for (int kind = 2; kind < 34; ++kind) {
     const int width = kind / 2;
     const bool isSigned = kind % 2 != 0;
+    SCOPED_TRACE(testing::Message() << width << " bits, signed " << isSigned);
     const long long size = 1LL << width;
     const long long low = isSigned ? -size / 2 : 0, high = low + size - 1;
     const HX_NumericalType type(static_cast<double>(low),
                                 static_cast<double>(high), width, isSigned);
     for (long long v = -2 * size; v <= 2 * size; ++v) {
       const long long wrapped = ((v - low) % size + size) % size + low;
-      if (!isSigned || width >= 8) {
-        ASSERT_EQ(IMS_ShrinkValueToBaseType(v, &type), wrapped)
-            << v << " to " << width << " bits, signed " << isSigned;
+      if (!isSigned || width >= 8) {  // the others: below
+        ASSERT_EQ(IMS_ShrinkValueToBaseType(v, &type), wrapped) << v;
       }
       for (double half : {0.0, 0.5}) {
         const double x = static_cast<double>(v) + half;
         ASSERT_EQ(IMS_ValueMatchesSignednessAndWidth(x, isSigned, width),
                   x <= static_cast<double>(high) &&
                       (!isSigned || x >= static_cast<double>(low)))
-            << x << " in " << width << " bits, signed " << isSigned;
+            << x;
       }
     }
   }
