@@ -73,8 +73,7 @@ std::string HX_HostTest::read(const fs::path& path) {
 HX_HostTest::Files HX_HostTest::filesIn(const fs::path& folder) {
   Files files;
   for (const auto& entry : fs::directory_iterator(folder))
-    files[entry.path().filename()] =
-        entry.is_directory() ? "a folder" : read(entry.path());
+    files[entry.path().filename()] = read(entry.path());
   return files;
 }
 
