@@ -79,7 +79,8 @@ TEST(IntegerMathSupportTest, MultiplesWithinTheirBounds) {
               {{kMin64, 1}, kInf, 0},
               {{kTwo62, 1}, kInf, 0},
               {{1, kTwo62, 3}, kInf, -kTwo62},  // wraps
-              {{1, kTwo62, 2}, kInf, 0}};
+              {{1, kTwo62, 2}, kInf, 0},
+              {{1LL << 33, 3}, kInf, 3LL << 33}};
   for (const auto& [values, limit, expected] : rows) {
     EXPECT_EQ(IMS_FindLeastCommonMultiple(static_cast<int>(values.size()),
                                           values.data(), limit),
