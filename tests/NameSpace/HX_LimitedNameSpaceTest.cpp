@@ -3,7 +3,6 @@
 #include <iterator>
 #include <map>
 #include <random>
-#include <utility>
 
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
@@ -19,17 +18,6 @@ class LimitedNameSpaceTest : public HX_TestFixture {
 
   HX_OptionsExt m_Options;
 };
-
-TEST_F(LimitedNameSpaceTest, VariantsAreLetteredInTurn) {
-  HX_LimitedNameSpace names;
-  const std::pair<const char*, const char*> rows[] = {
-      {"x", "x"}, {"x", "x_a"}, {"x", "x_b"}, {"X", "X"}, {"x_a", "x_a_a"}};
-  for (const auto& [wanted, given] : rows) {
-    KyCXString name(wanted);
-    names.addUnique(&name);
-    EXPECT_EQ(name, given);
-  }
-}
 
 // The set as its definition reads: every suffix is tried.
 struct PlainNames {
