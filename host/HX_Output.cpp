@@ -120,24 +120,24 @@ std::error_code HX_Output::replace(const std::string& name) {
   return error;
 }
 
-// Undoes replace() as far as it came.
-void HX_Output::putBack(const std::string& name) {
+// Undoes replace() as far as it came; what it has not placed is not removed.
+void HX_Output::putBack(const std::string& name, bool isPlaced) {
   std::error_code error;
   if (fs::exists(m_Old / name, error)) {
     fs::rename(m_Old / name, m_Folder / name, error);
     if (error) m_KeepsOld = true;
-  } else if (!fs::exists(m_New / name, error)) {
+  } else if (isPlaced) {
     fs::remove(m_Folder / name, error);
   }
 }
 
 void HX_Output::commit() {
   stopAfterSignal();
-  for (const std::string& name : m_Changed) {
-    const std::error_code error = replace(name);
+  for (std::size_t i = 0; i < m_Changed.size(); ++i) {
+    const std::error_code error = replace(m_Changed[i]);
     if (!error) continue;
-    for (const std::string& each : m_Changed) putBack(each);
-    fail(m_Folder / name, error,
+    for (std::size_t k = 0; k <= i; ++k) putBack(m_Changed[k], k < i);
+    fail(m_Folder / m_Changed[i], error,
          m_KeepsOld ? "; old files are in " + m_Old.string() : "");
   }
 }

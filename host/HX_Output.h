@@ -64,7 +64,7 @@ class HX_Output {
 
   void makeFolders();
   std::error_code replace(const std::string& name);
-  void putBack(const std::string& name);
+  void putBack(const std::string& name, bool isPlaced);
 
   const HeldSignals m_Signals;  // act when everything else is gone
   const std::filesystem::path m_Folder;

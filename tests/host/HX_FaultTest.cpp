@@ -57,6 +57,12 @@ const FaultCase kFaults[] = {
      "$P generate $B --json --out $d >$p; code=$?; "
      "grep -qx old $d/name_map.json && rm $d/name_map.json; exit $code",
      "synthetic.c: cannot be written: No such file or directory"},
+    {"temporary folder removed: old files stay",
+     "echo old >$d/name_map.json; "
+     "{ head -c 1; rm -r $d/.hx*; cat; } <$p >/dev/null & "
+     "$P generate $B --json --out $d >$p; code=$?; "
+     "grep -qx old $d/name_map.json && rm $d/name_map.json; exit $code",
+     "cannot be written: "},
     {"folder that came in the way and cannot be put back: it is kept",
      "{ head -c 1; mkdir $d/name_map.csv; rm $d/.hx*/new/synthetic.c; cat; } "
      "<$p >/dev/null & $P generate $B --json --out $d >$p; code=$?; "
