@@ -1,4 +1,4 @@
-# Checks the includes of src/ and platform/ against a table of permitted edges.
+# Checks the includes of src/, platform/ and host/ against a table of permitted edges.
 #
 #   cmake -DROOT=<tree> -DTABLE=<table> -P CheckIncludes.cmake
 #
@@ -16,8 +16,8 @@ endfunction()
 
 # The folder that a path below src/ or the root belongs to.
 function(folder_of path result)
-  if(path MATCHES "^platform/[^/]+/")
-    string(REGEX MATCH "^platform/[^/]+" folder "${path}")
+  if(path MATCHES "^(platform|host)/[^/]+/")
+    string(REGEX MATCH "^[^/]+/[^/]+" folder "${path}")
   elseif(path MATCHES "/")
     string(REGEX MATCH "^[^/]+" folder "${path}")
   else()
@@ -49,7 +49,8 @@ endforeach()
 # Reads the includes and refuses those that the table does not permit.
 file(GLOB_RECURSE files RELATIVE ${ROOT}
      ${ROOT}/src/*.h ${ROOT}/src/*.cpp
-     ${ROOT}/platform/*.h ${ROOT}/platform/*.cpp)
+     ${ROOT}/platform/*.h ${ROOT}/platform/*.cpp
+     ${ROOT}/host/*.h ${ROOT}/host/*.cpp)
 set(used)
 foreach(file IN LISTS files)
   string(REGEX REPLACE "^src/" "" path ${file})

@@ -1,0 +1,263 @@
+#include "host/model/HX_Model.h"
+
+#include <fstream>
+
+#include "Naming/HxCNames.h"
+#include "host/base/HX_Text.h"
+#include "host/model/HX_ModelParts.h"
+#include "platform/datadictionary/HX_DdTree.h"
+#include "platform/model/HxCGlobal.h"
+
+namespace {
+
+using Json = const HX_Json&;
+
+const std::map<std::string, unsigned int> kMacroBits = {
+    {"$L", HxCNames::eMacroLabel},
+    {"$B", HxCNames::eMacroBlockName},
+    {"$S", HxCNames::eMacroSystemNumber},
+    {"$I", HxCNames::eMacroSystemId},
+    {"$M", HxCNames::eMacroModelName},
+    {"$N", HxCNames::eMacroSubsystemName},
+    {"$H", HxCNames::eMacroStateHierarchy},
+    {"$O", HxCNames::eMacroSFObjectName},
+    {"$C", HxCNames::eMacroSFObjectId},
+    {"$D", HxCNames::eMacroDdObjectName},
+    {"$T", HxCNames::eMacroTypeName},
+    {"$X", HxCNames::eMacroXName},
+    {"$R", HxCNames::eMacroChangeable},
+    {"$(Type)", HxCNames::eMacroLongTypeName},
+};
+
+const std::map<std::string, int> kSubstitutionKinds = {
+    {"exact", HxCNames::eMacroKindExact},
+    {"any", HxCNames::eMacroKindAnyCase},
+    {"selects", HxCNames::eMacroKindCaseSelectsValue},
+};
+
+const std::map<std::string, int> kSymbolKinds = {
+    {"variable", HxCSymbol::eVariable},
+    {"constant", HxCSymbol::eConstant},
+    {"function", HxCSymbol::eFunction},
+};
+
+unsigned int macroBits(const HX_Json& macros) {
+  unsigned int bits = 0;
+  for (const HX_Json& macro : macros) bits |= kMacroBits.at(macro);
+  return bits;
+}
+
+// 1 for what is no array; elements of nested arrays are counted in all.
+std::size_t elementCount(const HX_TypeItem* type) {
+  std::size_t count = 1;
+  if (type->scalar() == nullptr) return count;
+  for (; type != nullptr; type = type->of) {
+    if (type->kind == "array") count *= static_cast<std::size_t>(type->length);
+  }
+  return count;
+}
+
+class Reader {
+ public:
+  Reader(HX_Document& document, HX_Model& model)
+      : m_Document(document), m_Model(model) {}
+
+  void read(const std::string& keywordFolder) {
+    HX_Json& root = m_Document.root;
+    readModel(root["model"]);
+    readOptions(HX_FieldOf(root, "options"), keywordFolder);
+    HX_ReadSources(root, m_Model, m_Sources);
+    root.erase("blocks");
+    HX_ReadTypes(HX_FieldOf(root, "types"), m_Model, m_Types);
+    // Scopes refer to functions, and names to scopes and other names.
+    for (Json name : root["names"]) enterName(name);
+    for (Json scope : HX_FieldOf(root, "scopes")) readScope(scope, nullptr);
+    if (m_Model.fileScope == nullptr) {
+      m_Model.fileScope = &m_Model.scopes.emplace_back();
+      m_Model.fileScope->id = m_Model.fileScope->kind = "file";
+    }
+    readNames(root["names"]);
+  }
+
+ private:
+  void readModel(Json model) {
+    m_Model.name = model["name"];
+    GLB_SetModelName(HX_FromUtf8(m_Model.name));
+    GLB_SetSubsystemName(HX_FromUtf8(model.value("subsystem", "")));
+    m_Model.options.setHxSystemID(HX_FromUtf8(model.value("systemId", "")));
+  }
+
+  // One word on a line; lines that begin with '#' are comments.
+  void readOptions(Json options, const std::string& keywordFolder) {
+    m_Model.options.setLimitVariableNameLength(
+        options.value("limitNames", false));
+    for (Json list : HX_FieldOf(options, "keywords")) {
+      std::ifstream file(keywordFolder + "/" + list.get<std::string>() +
+                         ".txt");
+      if (!file)
+        m_Document.fail(list, "the name of a word list in " + keywordFolder +
+                                  ", found " + list.dump());
+      for (std::string line; std::getline(file, line);) {
+        if (!line.empty() && line[0] != '#') m_Model.words.insert(line);
+      }
+    }
+  }
+
+  void readScope(Json node, HX_ScopeItem* parent) {
+    // Where a scope may stand. A block may also stand in a block.
+    static const std::map<std::string, std::string> kParents = {
+        {"file", "the document"},
+        {"flat", "the document"},
+        {"function", "file"},
+        {"block", "function"}};
+    HX_ScopeItem& scope = m_Model.scopes.emplace_back();
+    scope.id = node["id"];
+    scope.kind = node["kind"];
+    scope.parent = parent;
+    m_Scopes.enter(node, &scope);
+    const std::string around =
+        parent != nullptr ? parent->kind : "the document";
+    const bool isBlockInBlock = scope.kind == "block" && around == "block";
+    if (around != kParents.at(scope.kind) && !isBlockInBlock)
+      m_Document.fail(node["kind"], "a scope of this kind only in " +
+                                        kParents.at(scope.kind));
+    if (scope.kind == "block") parent->blocks[scope.id] = &scope;
+    if (scope.kind == "file") {
+      if (m_Model.fileScope != nullptr)
+        m_Document.fail(node["kind"], "one file scope");
+      m_Model.fileScope = &scope;
+    }
+    if (scope.kind == "function") readFunction(node["function"], scope);
+    for (Json inner : HX_FieldOf(node, "scopes")) readScope(inner, &scope);
+  }
+
+  // The function that a scope is the body of.
+  void readFunction(Json id, const HX_ScopeItem& scope) {
+    HX_Name* function = m_Names.find(id);
+    if (!function->isFunction() || function->body != nullptr)
+      m_Document.fail(
+          id, "the id of a function, task or isr without another scope");
+    function->body = &scope;
+  }
+
+  void enterName(Json node) {
+    HX_Name& name = m_Model.names.emplace_back();
+    name.id = node["id"];
+    name.kind = node.value("kind", "object");
+    m_Names.enter(node, &name);
+  }
+
+  void readNames(HX_Json& names) {
+    std::size_t index = 0;
+    for (HX_Json& node : names) {
+      readName(node, m_Model.names[index++]);
+      node = nullptr;
+    }
+  }
+
+  void readName(Json node, HX_Name& name) {
+    name.nameTemplate = node["template"];
+    name.source = m_Sources.findIn(node, "source");
+    name.dd = m_Sources.findIn(node, "dd");
+    if (name.dd != nullptr && name.dd->isDd() == nullptr)
+      m_Document.fail(node["dd"], "the id of a dictionary object");
+    name.sources.addSrcRef(name.source);
+    name.sources.addSrcRef(name.dd);
+    for (Json id : HX_FieldOf(node, "alsoFrom"))
+      name.sources.addSrcRef(m_Sources.find(id));
+    if (node.contains("ivBlock")) name.ivBlock = node["ivBlock"];
+    name.label = node.value("label", "");
+    name.x = node.value("x", "");
+    name.type = m_Types.findIn(node, "type");
+    name.scope = m_Scopes.findIn(node, "scope");
+    if (name.scope == nullptr) name.scope = m_Model.fileScope;
+    if (name.isFunction() && name.scope->kind != "file")
+      m_Document.fail(node["scope"], "the id of a file scope for a function");
+    name.retained = macroBits(HX_FieldOf(node, "retained"));
+    name.provisional = macroBits(HX_FieldOf(node, "provisional"));
+    name.modelContext = node.value("modelContext", false);
+    for (Json entry : HX_FieldOf(node, "substitute"))
+      name.substitutions.push_back(
+          {entry["macro"], entry["value"],
+           kSubstitutionKinds.at(entry.value("case", "exact"))});
+    if (node.contains("symbol")) readSymbol(node["symbol"], name);
+    readMultirate(node, name);
+    if (name.kind == "variable") readVariable(node, name);
+  }
+
+  void readSymbol(Json node, HX_Name& name) {
+    HX_TypeItem* type = m_Types.findIn(node, "type");
+    name.symbol = std::make_unique<HxCSymbol>(
+        HX_FromUtf8(node["name"]), kSymbolKinds.at(node["kind"]),
+        type != nullptr ? &type->type : nullptr);
+    name.symbol->setDollarX(HX_Utf8ToLatin1(node.value("x", "")).c_str());
+  }
+
+  void readMultirate(Json node, HX_Name& name) {
+    name.task = m_Names.findIn(node, "task");
+    name.isr = m_Names.findIn(node, "isr");
+    for (const auto& [kind, named] :
+         {std::make_pair("task", name.task), std::make_pair("isr", name.isr)}) {
+      if (named != nullptr && (named->kind != kind || named == &name))
+        m_Document.fail(node[kind],
+                        std::string("the id of another name of kind ") + kind);
+    }
+    for (const char* field :
+         {"event", "counter", "message", "messageVariable", "osObject"}) {
+      if (node.contains(field)) name.osTexts[field] = node[field];
+    }
+    name.period = node.value("period", 0.0);
+    name.offset = node.value("offset", 0.0);
+    name.cyclic = node.value("cyclic", true);
+  }
+
+  void readVariable(Json node, HX_Name& name) {
+    HX_FindNamedType(m_Types, node["type"]);
+    if (name.scope->kind == "flat")
+      m_Document.fail(node["scope"], "the id of a scope that is not flat");
+    for (Json id : HX_FieldOf(node, "dependsOn")) {
+      name.dependsOn.push_back(m_Names.find(id));
+      if (name.dependsOn.back()->kind != "variable")
+        m_Document.fail(id, "the id of a variable");
+    }
+    name.lsb = node.value("lsb", 1.0);
+    name.zero = node.value("zero", 0.0);
+    if (!node.contains("initial")) return;
+
+    Json initial = node["initial"];
+    const HX_TypeItem* scalar = name.type->scalar();
+    if (scalar != nullptr && !scalar->numerical)
+      m_Document.fail(initial,
+                      "no initial value for a structure or an enumeration");
+    if (initial.is_array())
+      name.initial = initial.get<std::vector<double>>();
+    else
+      name.initial = {initial.get<double>()};
+    const std::size_t room = elementCount(name.type);
+    if (name.initial.size() > room || name.initial.empty())
+      m_Document.fail(initial, "1 to " + std::to_string(room) + " values");
+  }
+
+  HX_Document& m_Document;
+  HX_Model& m_Model;
+  HX_SourceIds m_Sources{m_Document,
+                         "a block, a chart object or a dictionary object"};
+  HX_TypeIds m_Types{m_Document, "a type"};
+  HX_Ids<HX_ScopeItem> m_Scopes{m_Document, "a scope"};
+  HX_Ids<HX_Name> m_Names{m_Document, "a name"};
+};
+
+}  // namespace
+
+HX_Model::HX_Model(HX_Document& document, const std::string& keywordFolder) {
+  HxCGlobal::setOptions(&options);
+  HxCGlobal::setDataTypeServer(&typeServer);
+  HX_DdTree::instance().clear();
+  Reader(document, *this).read(keywordFolder);
+}
+
+HX_Model::~HX_Model() {
+  HxCGlobal::setOptions(nullptr);
+  HxCGlobal::setDataTypeServer(nullptr);
+  HX_DdTree::instance().clear();
+}

@@ -1,0 +1,127 @@
+#include "host/names/HX_Ordering.h"
+
+#include <algorithm>
+#include <deque>
+#include <unordered_map>
+
+#include "DependencySorting/HxCDepSortComp.h"
+#include "DependencySorting/HxCDepSortNode.h"
+#include "DependencySorting/HxCDependencySorting.h"
+#include "host/base/HX_Text.h"
+
+namespace {
+
+/// What both kinds of nodes have.
+class Node : public HxCDepSortNode {
+ public:
+  Node(const std::string& name, const std::string& id, const HX_TypeItem& type)
+      : m_Name(HX_FromUtf8(name)), m_Id(id) {
+    const HX_TypeItem* scalar = type.scalar();
+    if (scalar != nullptr && scalar->numerical)
+      m_Width = scalar->numerical->getBitWidth();
+  }
+  const KyCXString& getName() override { return m_Name; }
+  int width() const { return m_Width; }
+  /// Names repeat in scopes beside each other, ids do not.
+  int compareNames(const Node& other) const {
+    const int order = leda::compare(m_Name, other.m_Name);
+    return order != 0 ? order : m_Id.compare(other.m_Id);
+  }
+
+ private:
+  KyCXString m_Name;
+  const std::string& m_Id;
+  int m_Width = 0;  // bits
+};
+
+struct ByWidth : HxCDepSortComp {
+  int compare(HxCDepSortNode* a, HxCDepSortNode* b) override {
+    return static_cast<Node*>(b)->width() - static_cast<Node*>(a)->width();
+  }
+};
+
+struct ByName : HxCDepSortComp {
+  int compare(HxCDepSortNode* a, HxCDepSortNode* b) override {
+    return static_cast<Node*>(a)->compareNames(*static_cast<Node*>(b));
+  }
+};
+
+}  // namespace
+
+// The library tells the two apart in what it reports.
+class HxCSdtNode : public Node {
+ public:
+  explicit HxCSdtNode(const HX_TypeItem& type)
+      : Node(type.name, type.id, type), item(type) {}
+  HxCSdtNode* isSdtNode() override { return this; }
+  const HX_TypeItem& item;
+};
+
+class HxCSsNode : public Node {
+ public:
+  explicit HxCSsNode(const HX_Name& name)
+      : Node(name.actual, name.id, *name.type), item(name) {}
+  HxCSsNode* isSsNode() override { return this; }
+  const HX_Name& item;
+};
+
+namespace {
+
+template <class NodeType, class Item, class DependenciesOf>
+std::vector<const Item*> order(const std::vector<const Item*>& items,
+                               DependenciesOf dependenciesOf) {
+  std::deque<NodeType> nodes;
+  std::unordered_map<const Item*, NodeType*> nodeOf;  // looked up, never walked
+  std::vector<NodeType*> byName;
+  byName.reserve(items.size());
+  for (const Item* item : items)
+    byName.push_back(nodeOf[item] = &nodes.emplace_back(*item));
+  // Ties fall the same way whatever the order of the document.
+  std::sort(byName.begin(), byName.end(),
+            [](NodeType* a, NodeType* b) { return a->compareNames(*b) < 0; });
+
+  ByWidth byWidth;
+  ByName byNames;
+  leda::array<HxCDepSortComp*> criteria(2);
+  criteria[0] = &byWidth;
+  criteria[1] = &byNames;
+  HxCDependencySorting sorting;
+  sorting.setSortingCriteriaAndInit(criteria);
+  for (NodeType* node : byName) sorting.add(node);
+  for (NodeType* node : byName) {
+    for (const Item* first : dependenciesOf(node->item)) {
+      const auto found = nodeOf.find(first);
+      if (found != nodeOf.end()) sorting.addDependency(found->second, node);
+    }
+  }
+  std::vector<const Item*> ordered;
+  ordered.reserve(items.size());
+  if (!sorting.sort()) return ordered;
+  for (HxCDepSortNode* node : sorting.getNodes())
+    ordered.push_back(&static_cast<NodeType*>(node)->item);
+  return ordered;
+}
+
+}  // namespace
+
+std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model) {
+  std::vector<const HX_TypeItem*> types;
+  types.reserve(model.types.size());
+  for (const HX_TypeItem& type : model.types) types.push_back(&type);
+  return order<HxCSdtNode>(types, [](const HX_TypeItem& type) {
+    std::vector<const HX_TypeItem*> before{type.of};
+    for (const auto& [name, field] : type.fields) before.push_back(field);
+    return before;
+  });
+}
+
+std::vector<const HX_Name*> HX_OrderVariables(const HX_Model& model) {
+  std::vector<const HX_Name*> variables;
+  for (const HX_Name& name : model.names) {
+    if (name.kind == "variable" && name.isDefined) variables.push_back(&name);
+  }
+  return order<HxCSsNode>(
+      variables, [](const HX_Name& name) -> const std::vector<const HX_Name*>& {
+        return name.dependsOn;
+      });
+}

@@ -1,0 +1,83 @@
+#include "host/program/HX_Profile.h"
+
+#include "Trace/HxCTransformationTracer.h"
+#include "host/base/HX_Output.h"
+#include "host/program/HX_Version.h"
+#include "platform/matlab/HX_MexInterface.h"
+
+namespace fs = std::filesystem;
+
+namespace {
+
+constexpr char kTransformations[] = "HX_Transformations.txt";
+
+}  // namespace
+
+HX_Profile::HX_Profile(const std::string& folder) : m_IsOn(!folder.empty()) {
+  if (!m_IsOn) return;
+  fs::create_directories(folder);
+  fs::current_path(folder);
+  fs::remove(kTransformations);  // the tracer appends, as the protocol does
+  fs::remove("HX_DebugProtocol.txt");
+  HX_SetCommandWindow([](const char*) {});
+  HxCTransformationTracer::boot(kTransformations);
+  m_Server.boot();
+  HX_TimingListener::install(this);
+}
+
+HX_Profile::~HX_Profile() {
+  HX_TimingListener::install(nullptr);
+  HxCTransformationTracer::shutdown();
+  m_Server.shutdown();
+}
+
+void HX_Profile::setModel(const std::string& name) {
+  if (!m_IsOn) return;
+  HX_BuildNumber build = HX_BuildOfProgram();
+  std::string text = name;  // the server takes a text that it could change
+  m_Server.setModelInfo(&build, text.data());
+  m_Server.logModelInfo();
+}
+
+void HX_Profile::note(const std::string& text) {
+  char format[] = "%s";
+  if (m_IsOn) m_Server.protocolEntry(format, text.c_str());
+}
+
+void HX_Profile::finish() {
+  if (!m_IsOn) return;
+  m_IsOn = false;
+  m_Server.printCurrentResults("Results");
+  HX_StopWatch::endStopWatches();
+  HxCTransformationTracer::shutdown();
+
+  HX_Output output(fs::current_path());
+  output.open("HX_Trace.json")
+      << nlohmann::ordered_json{{"traceEvents", m_Events}}.dump(1) << '\n';
+  output.finish();
+  output.commit();
+}
+
+void HX_Profile::runEnded(const char* name, std::int64_t begin,
+                          std::int64_t duration) {
+  // A phase is both a run time and, around it, a stop watch: shown once.
+  if (!m_Events.empty() && m_Events.back()["name"] == name)
+    m_Events.erase(m_Events.size() - 1);
+  m_Events.push_back({{"name", name},
+                      {"ph", "X"},
+                      {"ts", begin},
+                      {"dur", duration},
+                      {"pid", 1},
+                      {"tid", 1}});
+}
+
+HX_Profile::Phase::Phase(HX_Profile& profile, const char* name)
+    : m_Profile(profile), m_Watch(profile.m_Watches.emplace_back(name)) {
+  m_Watch.start();
+  if (m_Profile.m_IsOn) m_Profile.m_Server.runTimeStart(name);
+}
+
+HX_Profile::Phase::~Phase() {
+  if (m_Profile.m_IsOn) m_Profile.m_Server.runTimeEnd(m_Watch.getName());
+  m_Watch.stop();
+}

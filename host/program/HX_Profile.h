@@ -1,0 +1,70 @@
+// What took how long in a run, and the files that tell it.
+//
+//   HX_Profile profile("profile");   // "" measures, but writes nothing
+//   {
+//     HX_Profile::Phase phase(profile, "Form names");
+//     ...
+//   }
+//   profile.finish();
+
+#ifndef HOST_PROGRAM_HX_PROFILE_H
+#define HOST_PROGRAM_HX_PROFILE_H
+
+#include <cstdint>
+#include <filesystem>
+#include <list>
+#include <nlohmann/json.hpp>
+#include <string>
+
+#include "Diagnostics/HX_StopWatch.h"
+#include "Diagnostics/HX_TimingListener.h"
+#include "Diagnostics/HxCDebugServer.h"
+
+/// One per process. With a folder it makes that folder the working directory,
+/// where the library's servers write their files: HX_StopWatch.html,
+/// HX_DebugLog.txt, HX_DebugProtocol.txt and HX_Transformations.txt. Beside
+/// them stands HX_Trace.json, complete events of the trace-event format, in
+/// microseconds.
+class HX_Profile : private HX_TimingListener {
+ public:
+  /// Throws std::filesystem::filesystem_error for a folder that cannot be made
+  /// or entered.
+  explicit HX_Profile(const std::string& folder);
+  HX_Profile(const HX_Profile&) = delete;
+  HX_Profile& operator=(const HX_Profile&) = delete;
+  ~HX_Profile() override;
+
+  /// The working directory at the start, where the user's paths count from.
+  const std::filesystem::path start = std::filesystem::current_path();
+
+  void setModel(const std::string& name);
+  /// A line of the protocol.
+  void note(const std::string& text);
+  /// Writes what the servers still hold, and the trace; further calls do
+  /// nothing. Throws HX_OutputError.
+  void finish();
+
+  /// Measures while it lives.
+  class Phase {
+   public:
+    Phase(HX_Profile& profile, const char* name);
+    Phase(const Phase&) = delete;
+    Phase& operator=(const Phase&) = delete;
+    ~Phase();
+
+   private:
+    HX_Profile& m_Profile;
+    HX_StopWatch& m_Watch;
+  };
+
+ private:
+  void runEnded(const char* name, std::int64_t begin,
+                std::int64_t duration) override;
+
+  bool m_IsOn;
+  HxCDebugServer m_Server;
+  std::list<HX_StopWatch> m_Watches;  // stay registered until the report
+  nlohmann::ordered_json m_Events = nlohmann::ordered_json::array();
+};
+
+#endif  // HOST_PROGRAM_HX_PROFILE_H
