@@ -1,10 +1,35 @@
-// Counts what a test program asks of the heap.
+// Counts the blocks that a test program takes from the heap, and lets the heap
+// run out.
 
 #ifndef SUPPORT_HX_HEAPCOUNT_H
 #define SUPPORT_HX_HEAPCOUNT_H
 
-/// Blocks asked for by new since the start of the program. A program that calls
-/// this gets the counting operator new.
+/// Blocks asked for by new since the start of the program. A program that uses
+/// this header gets the counting operator new.
 int HX_HeapBlocks();
+
+/// Blocks of new that no delete has given back yet.
+int HX_LiveHeapBlocks();
+
+/// Heap that runs out, installed while the object lives. Only operator new
+/// fails, by std::bad_alloc; malloc() does not.
+class HX_FailingHeap {
+ public:
+  /// The allocation with the given number fails (0 is the next allocation),
+  /// with \p allAfter all later allocations as well.
+  HX_FailingHeap(int number, bool allAfter);
+  HX_FailingHeap(const HX_FailingHeap&) = delete;
+  HX_FailingHeap& operator=(const HX_FailingHeap&) = delete;
+  ~HX_FailingHeap();
+
+  /// Allocations asked for since the constructor, failed ones included.
+  int allocated() const;
+  /// Live blocks now minus live blocks at the constructor.
+  int liveBlocks() const;
+
+ private:
+  int m_Start;
+  int m_LiveAtStart;
+};
 
 #endif  // SUPPORT_HX_HEAPCOUNT_H

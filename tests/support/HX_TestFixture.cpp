@@ -1,6 +1,7 @@
 #include "support/HX_TestFixture.h"
 
 #include "platform/messages/HX_MessageHandler.h"
+#include "support/HX_HeapCount.h"
 
 void PrintTo(const KyCXString& text, std::ostream* stream) {
   *stream << '"' << text.cstring() << '"';
@@ -54,21 +55,48 @@ void HX_CountingController::freeMemBlock(void* block) {
   HxCMemController::freeMemBlock(block);
 }
 
-void HX_WithoutEachBlock(const char* why, bool (*job)()) {
+namespace {
+
+// Memory(number, allAfter) gives out blocks while alive.
+template <class Memory>
+void withoutEachBlock(const char* why, bool (*job)()) {
   for (const bool allAfter : {false, true}) {
     for (int missing = 0;; ++missing) {
+      bool done = false;
+      int live = 0;
+      int asked = 0;
+      {
+        Memory memory(missing, allAfter);
+        done = job();
+        live = memory.liveBlocks();
+        asked = memory.allocated();
+      }
       SCOPED_TRACE(testing::Message()
                    << why << " without block " << missing
-                   << (allAfter ? " and all later ones" : ""));
-      HX_CountingController memory;
-      memory.failAt(missing, allAfter);
-      const bool done = job();
-      ASSERT_EQ(memory.liveBlocks(), 0) << "leaks";
-      if (memory.allocated() <= missing) {
-        EXPECT_TRUE(done && missing > 0);
+                   << (allAfter ? " and all later blocks" : ""));
+      ASSERT_EQ(live, 0) << "leaks";
+      if (asked <= missing) {
+        EXPECT_TRUE(done);
+        EXPECT_GT(missing, 0) << "asks for no block";
         break;
       }
-      EXPECT_FALSE(done && missing == 0);
+      if (missing == 0) {
+        EXPECT_FALSE(done);
+      }
     }
   }
+}
+
+struct FailingController : HX_CountingController {
+  FailingController(int number, bool allAfter) { failAt(number, allAfter); }
+};
+
+}  // namespace
+
+void HX_WithoutEachBlock(const char* why, bool (*job)()) {
+  withoutEachBlock<FailingController>(why, job);
+}
+
+void HX_WithoutEachHeapBlock(const char* why, bool (*job)()) {
+  withoutEachBlock<HX_FailingHeap>(why, job);
 }

@@ -26,14 +26,13 @@ class HX_TestFixture : public testing::Test {
   HX_TestFixture();
   ~HX_TestFixture() override;
 
-  /// What was reported since the start of the test or the last clearMessages(),
-  /// each as "row/severity text" or, with a source, "row/severity text
-  /// [source]".
+  /// Messages since the start of the test or the last clearMessages(), as
+  /// "row/severity text" or, with a source, "row/severity text [source]".
   static std::vector<std::string> messages();
   static void clearMessages();
 
-  /// Shows internal information from now on and records debug reports (their
-  /// expressions) instead of printing them; each is answered with 0.
+  /// Shows internal information from now on and records the expressions of
+  /// debug reports instead of printing reports; every answer is 0.
   std::vector<std::string>& recordDebugReports();
 
  private:
@@ -42,7 +41,7 @@ class HX_TestFixture : public testing::Test {
   std::vector<std::string> m_DebugReports;
 };
 
-/// Installed while it lives; counts what the library holds.
+/// Controller that counts the blocks of the library; installed while alive.
 class HX_CountingController : public HxCMemController {
  public:
   HX_CountingController() { pHXMemory = this; }
@@ -56,8 +55,8 @@ class HX_CountingController : public HxCMemController {
   int allocated() const { return m_Asked; }
   /// From now on every allocation fails.
   void fail() { failAt(m_Asked, true); }
-  /// The allocation with this number (the first is 0) fails, with \p allAfter
-  /// all later ones as well.
+  /// The allocation with the given number fails (the first is 0), with
+  /// \p allAfter all later allocations as well.
   void failAt(int number, bool allAfter) {
     m_FirstFailure = number;
     m_LastFailure = allAfter ? INT_MAX : number;
@@ -70,13 +69,17 @@ class HX_CountingController : public HxCMemController {
   int m_LastFailure = INT_MAX;
 };
 
-/// Runs \p job again and again: without the first block that it asks for, then
-/// without the second, until none was missing; then the same without that block
-/// and all later ones. It must return all blocks each time, say false without
-/// its first block, and true at last.
+/// Runs \p job again and again without block 0, 1, 2, ... of the controller,
+/// until no block was missing; then the same without block n and all later
+/// blocks. Expects of \p job: gives back all blocks in every run, returns false
+/// without block 0, returns true in the run that misses none.
 void HX_WithoutEachBlock(const char* why, bool (*job)());
 
-/// Installed while it lives; its time stands still until it is set.
+/// The same with blocks of the global operator new, without a controller.
+/// \p job must not use assertions of GoogleTest, because assertions allocate.
+void HX_WithoutEachHeapBlock(const char* why, bool (*job)());
+
+/// Clock that stands still until a test sets the time; installed while alive.
 class HX_ManualClock : public HX_ClockSource {
  public:
   HX_ManualClock() { install(this); }
