@@ -1,4 +1,4 @@
-// The substitution of environment variables against a regular expression.
+// Compares the substitution of environment variables with a regular expression.
 #include <cstdlib>
 #include <regex>
 
@@ -17,8 +17,9 @@ std::string plainStep(const std::string& text) {
 
 }  // namespace
 
-// The first lines define variables that may refer to each other and to
-// themselves; texts are 8-bit ones without zeros, as the environment's are.
+// The first lines define variables; a value may refer to any of the variables.
+// Texts have 8-bit characters without zeros, because the environment has no
+// wider texts.
 void HX_CheckEnvironment(HX_Bytes& bytes) {
   constexpr int kSteps = 20;
   for (const char* name : {"HX_A", "HX_B", "X"})

@@ -1,8 +1,8 @@
-// Checks that must hold for every input, and the bytes that drive them.
+// Checks that must hold for every input, and the bytes that drive a check.
 //
-// A check builds its case from the bytes, does the work and compares it with
-// a plain form. The fuzzers feed a check what the coverage suggests, the tests
-// the corpus and random changes of it.
+// A check builds a case from the bytes, does the work and compares the result
+// with a plain form. Fuzzers choose the bytes by coverage; tests take the bytes
+// from the corpus and from random changes of the corpus.
 //
 //   void HX_CheckSplit(HX_Bytes& bytes) {
 //     const KyCXString text = bytes.text();
@@ -20,7 +20,8 @@
 
 #include "platform/strings/KyCXString.h"
 
-/// Read from the front; an end gives zeros and empty texts.
+/// Bytes of one input, read from the front. After the end come zeros and empty
+/// texts.
 class HX_Bytes {
  public:
   explicit HX_Bytes(std::string bytes) : m_Bytes(std::move(bytes)) {}
@@ -38,7 +39,7 @@ class HX_Bytes {
     m_At = std::min(m_At + line.size() + 1, m_Bytes.size());
     return line;
   }
-  /// A line; its bytes from 0xF8 on stand for the units from 0xFFF8 on.
+  /// A line as units; bytes from 0xF8 on stand for the units from 0xFFF8 on.
   KyCXString text() {
     KyCXString text;
     for (const char c : line()) text.appendUnit(unitOf(c));
@@ -62,7 +63,7 @@ inline void HX_Require(bool holds, const std::string& claim) {
   if (!holds) throw std::logic_error("does not hold: " + claim);
 }
 
-// The checks; each stands in a source of its own.
+// One source per check.
 void HX_CheckDocument(HX_Bytes& bytes);
 void HX_CheckEnvironment(HX_Bytes& bytes);
 void HX_CheckMessages(HX_Bytes& bytes);

@@ -1,4 +1,4 @@
-// What libFuzzer calls; one program for each check.
+// Entry points of libFuzzer; one program per check.
 #include <cstddef>
 #include <cstdint>
 

@@ -1,6 +1,4 @@
-// Every check over its corpus and over random changes of it.
-#include <gtest/gtest.h>
-
+// Runs every check over the corpus and over random changes of the corpus.
 #include <filesystem>
 #include <fstream>
 #include <iterator>
@@ -10,6 +8,7 @@
 
 #include "fuzz/HX_Fuzz.h"
 #include "platform/messages/HX_MessageHandler.h"
+#include "support/HX_TestFixture.h"
 
 namespace {
 
@@ -58,7 +57,7 @@ Corpus readCorpus(const char* name) {
   return corpus;
 }
 
-// One to four bytes or ranges replaced, taken out or put in from elsewhere.
+// Replaces, removes or inserts one to four bytes or ranges of the corpus.
 std::string changed(const Corpus& corpus, Random& random) {
   std::string input = corpus[random() % corpus.size()];
   for (auto changes = 1 + random() % 4; changes > 0; --changes) {
@@ -73,7 +72,7 @@ std::string changed(const Corpus& corpus, Random& random) {
 }
 
 TEST(FuzzTest, ChecksHoldForTheCorpusAndForRandomChangesOfIt) {
-  const unsigned seed = std::random_device()();
+  const unsigned seed = HX_Seed();
   SCOPED_TRACE(testing::Message() << "seed " << seed);
   for (const CheckRow& row : kChecks) {
     SCOPED_TRACE(row.corpus);

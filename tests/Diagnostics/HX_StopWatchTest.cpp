@@ -131,7 +131,7 @@ std::string plainReport(const PlainRegistry& registry) {
 
 TEST_F(StopWatchTest, RandomUseAccountsLikeThePlainForm) {
   constexpr std::size_t kSlots = 6;
-  const unsigned seed = std::random_device()();
+  const unsigned seed = HX_Seed();
   SCOPED_TRACE("seed " + std::to_string(seed));
   std::mt19937 random(seed);
   const auto below = [&](unsigned bound) {

@@ -86,7 +86,7 @@ class InputBlockTest : public HX_TestFixture {
 // Every block of a damaged model, some of whose parents form loops, while one
 // of the reads fails.
 TEST_F(InputBlockTest, TextIsTheJoinedNamesFromTheSystemDown) {
-  const unsigned seed = std::random_device()();
+  const unsigned seed = HX_Seed();
   SCOPED_TRACE(seed);
   std::mt19937 random(seed);
   std::vector<double> handles;

@@ -19,6 +19,11 @@
 /// Lets GoogleTest print texts.
 void PrintTo(const KyCXString& text, std::ostream* stream);
 
+/// Seed of a random test: HX_TEST_SEED of the build, 1 unless changed.
+inline unsigned HX_Seed() {
+  return static_cast<unsigned>(testing::UnitTest::GetInstance()->random_seed());
+}
+
 /// Starts each test with an empty message handler that shows nothing, internal
 /// information off, no memory controller and the system's clocks.
 class HX_TestFixture : public testing::Test {
