@@ -12,7 +12,7 @@
 namespace {
 
 constexpr int kRows = static_cast<int>(std::size(kErrCatalogue));
-constexpr ERR_CatalogueRow kUnknown{4711, 0, "", 0, false, ""};
+constexpr ERR_CatalogueRow kUnknown{4711, 0, "", 0, ""};
 
 // A row with its severity and source; gives the text that it must have.
 struct Report {

@@ -1,18 +1,19 @@
-// The rows of the message catalogue that this library emits.
+// The messages that this library emits, one row each.
 //
-// A new message is a new row here and a new emitter in ERR_Messages.h; the
-// compiler checks that the two fit together.
+// A new message is a new row here. The row makes the entry of the catalogue,
+// which a message handler reads, and the emitter ERR_Msg<number> in
+// ERR_Messages.h. The compiler checks each row: the numbers ascend, and the
+// parameters of the emitter fit the conversions of the text.
 
 #ifndef CONTROL_ERR_CATALOGUE_H
 #define CONTROL_ERR_CATALOGUE_H
 
-/// One message: how it is numbered, classed and worded.
+/// One message: number, identification, class and wording.
 struct ERR_CatalogueRow {
   int number;            ///< what ERR_EmitErrorMessage() receives
-  int id;                ///< what a user sees
-  const char* category;  ///< the group it is shown in
+  int id;                ///< the number that a user sees
+  const char* category;  ///< the group that a user sees
   int severity;          ///< 0 to 7, see ERR_EmitErrorMessage()
-  bool hasSrcRef;        ///< the emitter takes a source reference first
   const char* text;      ///< a printf format
 };
 
@@ -24,50 +25,89 @@ inline constexpr const char* kVariableMessages = "Variables Messages";
 inline constexpr const char* kNamingMessages = "Naming Macros Messages";
 inline constexpr const char* kInternalMessages = "Internals message";
 
+/// Calls ROW for each message, ascending by number, with: number, id, category,
+/// severity, parameters of the emitter, the same parameters without types,
+/// text. An emitter whose first parameter is a source reference attaches the
+/// message to that reference.
+#define ERR_MESSAGES(ROW)                                                      \
+  ROW(2, 10002, kGeneralMessages, 0, (const char* label, double seconds),      \
+      (label, seconds), "%-30s in %7.3lf seconds.")                            \
+  ROW(7, 10007, kGeneralMessages, 3, (const char* fileCode, int line),         \
+      (fileCode, line),                                                        \
+      "Internal error. Error code: %s%d. Please report it to the support, "    \
+      "with the model if you can.")                                            \
+  ROW(90, 10651, kSystemMessages, 3, (const char* fileName), (fileName),       \
+      "Cannot create file: %s.")                                               \
+  ROW(403, 17051, kCompileMessages, 2, (const char* kind, const char* list),   \
+      (kind, list),                                                            \
+      "Found unresolvable dependencies between the following %s : %s. Modify " \
+      "your modeling.")                                                        \
+  ROW(408, 17056, kCompileMessages, 2, (const char* name), (name),             \
+      "C keyword %s used as identifier.")                                      \
+  ROW(409, 17057, kCompileMessages, 2, (const char* name), (name),             \
+      "Base type name %s used as identifier.")                                 \
+  ROW(410, 17058, kCompileMessages, 2, (const char* name), (name),             \
+      "User data type name %s used as identifier.")                            \
+  ROW(503, 17260, kVariableMessages, 1, (const HxCSrcRef* srcRef), (srcRef),   \
+      "A template name is empty.")                                             \
+  ROW(1202, 30303, kNamingMessages, 1,                                         \
+      (const HxCSrcRef* srcRef, const char* macro, const char* nameTemplate),  \
+      (srcRef, macro, nameTemplate),                                           \
+      "The %s name macro in the %s name template is not supported here. It "   \
+      "is ignored.")                                                           \
+  ROW(1203, 30304, kNamingMessages, 1,                                         \
+      (const HxCSrcRef* srcRef, const char* macro, const char* nameTemplate),  \
+      (srcRef, macro, nameTemplate),                                           \
+      "The %s name macro in the %s name template is unknown. It is ignored.")  \
+  ROW(1204, 30305, kNamingMessages, 2,                                         \
+      (const HxCSrcRef* srcRef, const char* nameTemplate),                     \
+      (srcRef, nameTemplate),                                                  \
+      "The $Task name macro is used in the task name template %s. This is "    \
+      "not allowed.")                                                          \
+  ROW(1205, 30306, kNamingMessages, 2,                                         \
+      (const HxCSrcRef* srcRef, const char* nameTemplate),                     \
+      (srcRef, nameTemplate),                                                  \
+      "A time/period/offset name macro is used in a noncyclic task. Name "     \
+      "template: %s")                                                          \
+  ROW(1206, 30307, kNamingMessages, 1,                                         \
+      (const HxCSrcRef* srcRef, const char* macro, const char* timeBase,       \
+       double period, double offset),                                          \
+      (srcRef, macro, timeBase, period, offset),                               \
+      "A time name macro '%s' with the time base %s is used. The period time " \
+      "%f or offset %f cannot be represented precisely with this time base.")  \
+  ROW(1207, 30308, kNamingMessages, 1,                                         \
+      (const HxCSrcRef* srcRef, const char* kind, const char* value),          \
+      (srcRef, kind, value),                                                   \
+      "The %s %s cannot be represented precisely with the $(Time) name "       \
+      "macro.")                                                                \
+  ROW(1209, 30310, kNamingMessages, 1, (const HxCSrcRef* srcRef), (srcRef),    \
+      "The $(Component) name macro could not substitute")                      \
+  ROW(1210, 30311, kNamingMessages, 2,                                         \
+      (const HxCSrcRef* srcRef, const char* firstProperty,                     \
+       const char* firstComponent, const char* secondProperty,                 \
+       const char* secondComponent),                                           \
+      (srcRef, firstProperty, firstComponent, secondProperty,                  \
+       secondComponent),                                                       \
+      "The variable was referenced first through the RelatedVariables "        \
+      "property %s of software component %s and second by the "                \
+      "RelatedVariables property %s of software component %s.")                \
+  ROW(1272, 99000, kInternalMessages, 4,                                       \
+      (const HxCSrcRef* srcRef, const char* text), (srcRef, text), "%s.")      \
+  ROW(1273, 99001, kInternalMessages, 5,                                       \
+      (const HxCSrcRef* srcRef, const char* text), (srcRef, text), "%s.")      \
+  ROW(1274, 99002, kInternalMessages, 6,                                       \
+      (const HxCSrcRef* srcRef, const char* text), (srcRef, text), "%s.")      \
+  ROW(1275, 99003, kInternalMessages, 7,                                       \
+      (const HxCSrcRef* srcRef, const char* text), (srcRef, text), "%s.")      \
+  ROW(1292, 99023, kInternalMessages, 5, (const char* text), (text),           \
+      "INTERNAL: %s")
+
 /// Ascending by number.
 inline constexpr ERR_CatalogueRow kErrCatalogue[] = {
-    {2, 10002, kGeneralMessages, 0, false, "%-30s in %7.3lf seconds."},
-    {7, 10007, kGeneralMessages, 3, false,
-     "Internal error. Error code: %s%d. Please report it to the support, "
-     "with the model if you can."},
-    {90, 10651, kSystemMessages, 3, false, "Cannot create file: %s."},
-    {403, 17051, kCompileMessages, 2, false,
-     "Found unresolvable dependencies between the following %s : %s. Modify "
-     "your modeling."},
-    {408, 17056, kCompileMessages, 2, false,
-     "C keyword %s used as identifier."},
-    {409, 17057, kCompileMessages, 2, false,
-     "Base type name %s used as identifier."},
-    {410, 17058, kCompileMessages, 2, false,
-     "User data type name %s used as identifier."},
-    {503, 17260, kVariableMessages, 1, true, "A template name is empty."},
-    {1202, 30303, kNamingMessages, 1, true,
-     "The %s name macro in the %s name template is not supported here. It is "
-     "ignored."},
-    {1203, 30304, kNamingMessages, 1, true,
-     "The %s name macro in the %s name template is unknown. It is ignored."},
-    {1204, 30305, kNamingMessages, 2, true,
-     "The $Task name macro is used in the task name template %s. This is not "
-     "allowed."},
-    {1205, 30306, kNamingMessages, 2, true,
-     "A time/period/offset name macro is used in a noncyclic task. Name "
-     "template: %s"},
-    {1206, 30307, kNamingMessages, 1, true,
-     "A time name macro '%s' with the time base %s is used. The period time "
-     "%f or offset %f cannot be represented precisely with this time base."},
-    {1207, 30308, kNamingMessages, 1, true,
-     "The %s %s cannot be represented precisely with the $(Time) name macro."},
-    {1209, 30310, kNamingMessages, 1, true,
-     "The $(Component) name macro could not substitute"},
-    {1210, 30311, kNamingMessages, 2, true,
-     "The variable was referenced first through the RelatedVariables property "
-     "%s of software component %s and second by the RelatedVariables property "
-     "%s of software component %s."},
-    {1272, 99000, kInternalMessages, 4, true, "%s."},
-    {1273, 99001, kInternalMessages, 5, true, "%s."},
-    {1274, 99002, kInternalMessages, 6, true, "%s."},
-    {1275, 99003, kInternalMessages, 7, true, "%s."},
-    {1292, 99023, kInternalMessages, 5, false, "INTERNAL: %s"},
+#define ERR_ROW(number, id, category, severity, parameters, arguments, text) \
+  {number, id, category, severity, text},
+    ERR_MESSAGES(ERR_ROW)
+#undef ERR_ROW
 };
 
 /// The index of the row with this number, -1 if the library does not emit it.

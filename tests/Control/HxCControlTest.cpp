@@ -1,8 +1,12 @@
 #include "Control/HxCControl.h"
 
 #include <cmath>
+#include <string>
+#include <tuple>
+#include <type_traits>
 #include <utility>
 
+#include "Control/ERR_Messages.h"
 #include "Control/HX_SelfCheck.h"
 #include "Control/HxCUtilsControl.h"
 #include "SourceRef/HxCSrcRef.h"
@@ -10,7 +14,7 @@
 #include "Strings/HX_StringParser.h"
 #include "SystemServices/HX_SystemCall.h"
 #include "Trace/HxCTraceFallThrough.h"
-#include "platform/messages/ERR_MessageHandler.h"
+#include "platform/messages/HX_MessageHandler.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -73,6 +77,92 @@ TEST_F(ControlTest, ErrorLevelFallsWithTheFirstError) {
     ERR_EmitErrorMessage(severity, nullptr, 1292, "x");
   }
   EXPECT_FALSE(m_Control.checkErrorLevel());
+}
+
+// Calls an emitter with the texts a, b, ..., the integer 3 and numbers from
+// 0.5.
+template <class... Args>
+void callWithSamples(void (*emitter)(Args...), const HxCSrcRef* srcRef) {
+  static const char* const kTexts[] = {"a", "b", "c", "d"};
+  const char* const* text = kTexts;
+  double number = -0.5;
+  const auto sample = [&]<class T>(T) -> T {
+    if constexpr (std::is_same_v<T, const HxCSrcRef*>)
+      return srcRef;
+    else if constexpr (std::is_same_v<T, const char*>)
+      return *text++;
+    else if constexpr (std::is_same_v<T, double>)
+      return number += 1;
+    else
+      return 3;
+  };
+  std::tuple<Args...> arguments{sample(Args{})...};
+  std::apply(emitter, arguments);
+}
+
+TEST_F(ControlTest, EachMessageHasItsIdGroupSeverityAndText) {
+  const HxCSrcRef item;
+#define HX_CALL(number, ...) callWithSamples(&ERR_Msg##number, &item);
+  ERR_MESSAGES(HX_CALL)
+#undef HX_CALL
+  std::vector<std::string> reported;
+  for (const HX_Message& m : HX_MessageHandler::instance().messages())
+    reported.push_back(std::to_string(m.row) + " " + std::to_string(m.id) +
+                       " " + ERR_FindRow(m.row)->category + ", " +
+                       HX_MessageHandler::severityName(m.severity) +
+                       (m.srcRef == &item ? ", of an item: " : ": ") + m.text);
+  const std::string macros = " Naming Macros Messages, ";
+  EXPECT_THAT(
+      reported,
+      ElementsAre(
+          "2 10002 General Messages, note: a                              in   "
+          "0.500 seconds.",
+          "7 10007 General Messages, fatal error: Internal error. Error code: "
+          "a3. Please report it to the support, with the model if you can.",
+          "90 10651 Operating System Messages, fatal error: Cannot create "
+          "file: a.",
+          "403 17051 Compile Time Messages, error: Found unresolvable "
+          "dependencies between the following a : b. Modify your modeling.",
+          "408 17056 Compile Time Messages, error: C keyword a used as "
+          "identifier.",
+          "409 17057 Compile Time Messages, error: Base type name a used as "
+          "identifier.",
+          "410 17058 Compile Time Messages, error: User data type name a used "
+          "as identifier.",
+          "503 17260 Variables Messages, warning, of an item: A template name "
+          "is empty.",
+          "1202 30303" + macros +
+              "warning, of an item: The a name macro in the b name template is "
+              "not supported here. It is ignored.",
+          "1203 30304" + macros +
+              "warning, of an item: The a name macro in the b name template is "
+              "unknown. It is ignored.",
+          "1204 30305" + macros +
+              "error, of an item: The $Task name macro is used in the task "
+              "name template a. This is not allowed.",
+          "1205 30306" + macros +
+              "error, of an item: A time/period/offset name macro is used in a "
+              "noncyclic task. Name template: a",
+          "1206 30307" + macros +
+              "warning, of an item: A time name macro 'a' with the time base b "
+              "is used. The period time 0.500000 or offset 1.500000 cannot be "
+              "represented precisely with this time base.",
+          "1207 30308" + macros +
+              "warning, of an item: The a b cannot be represented precisely "
+              "with the $(Time) name macro.",
+          "1209 30310" + macros +
+              "warning, of an item: The $(Component) name macro could not "
+              "substitute",
+          "1210 30311" + macros +
+              "error, of an item: The variable was referenced first through "
+              "the RelatedVariables property a of software component b and "
+              "second by the RelatedVariables property c of software component "
+              "d.",
+          "1272 99000 Internals message, internal note, of an item: a.",
+          "1273 99001 Internals message, internal warning, of an item: a.",
+          "1274 99002 Internals message, internal error, of an item: a.",
+          "1275 99003 Internals message, internal fatal error, of an item: a.",
+          "1292 99023 Internals message, internal warning: INTERNAL: a"));
 }
 
 TEST_F(ControlTest, AssertionReportsCodeAndLineAndGoesOn) {
