@@ -104,6 +104,7 @@ inline constexpr const char* kInternalMessages = "Internals message";
 
 /// Ascending by number.
 inline constexpr ERR_CatalogueRow kErrCatalogue[] = {
+/// A message as a row of the table.
 #define ERR_ROW(number, id, category, severity, parameters, arguments, text) \
   {number, id, category, severity, text},
     ERR_MESSAGES(ERR_ROW)

@@ -82,7 +82,7 @@ static_assert(isAscending(), "each number stands once, in ascending order");
 
 }  // namespace err_detail
 
-// The emitters, from the rows of the catalogue. Times are in seconds.
+/// A message as an emitter. Times are in seconds.
 #define ERR_EMITTER(number, id, category, severity, parameters, arguments, \
                     text)                                                  \
   inline void ERR_Msg##number parameters { err_detail::emit<number> arguments; }

@@ -54,12 +54,14 @@ bool HX_WithinMemory(Work&& work) {
 /// installed. allocate() throws std::bad_alloc.
 template <class T>
 struct HX_ControllerAllocator {
+  /// What std::allocator_traits asks of every allocator.
   using value_type = T;
-
   HX_ControllerAllocator() = default;
+  /// Allocators have no state: a copy of another type is an allocator as well.
   template <class U>
   HX_ControllerAllocator(const HX_ControllerAllocator<U>&) noexcept {}
 
+  /// Memory for \p count objects. Throws std::bad_alloc if memory runs out.
   T* allocate(std::size_t count) {
     static_assert(alignof(T) <= alignof(std::max_align_t));
     if (count > std::numeric_limits<std::size_t>::max() / sizeof(T))
@@ -68,8 +70,10 @@ struct HX_ControllerAllocator {
     if (block == nullptr) throw std::bad_alloc();
     return static_cast<T*>(block);
   }
+  /// Returns memory of allocate().
   void deallocate(T* block, std::size_t) noexcept { HX_Free(block); }
 
+  /// True: every allocator returns the memory of every other.
   friend bool operator==(const HX_ControllerAllocator&,
                          const HX_ControllerAllocator&) {
     return true;
