@@ -21,7 +21,7 @@ template <class Key, class Inf, class Impl = ab_tree>
 class dictionary {
   struct Less {
     bool operator()(const Key& a, const Key& b) const {
-      return compare(a, b) < 0;
+      return detail::compareKeys(a, b) < 0;
     }
   };
   using Map = std::map<Key, Inf, Less>;
