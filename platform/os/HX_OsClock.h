@@ -7,7 +7,9 @@
 
 #include "platform/HX_PlatformExport.h"
 
-/// Milliseconds of elapsed time since the process started.
+/// Milliseconds of elapsed time since the start of the process, however late
+/// the library was loaded. Where the system does not tell the start of the
+/// process, the load of the library counts as the start.
 HX_PLATFORM_API std::int64_t HX_ProcessClock();
 
 /// Ticks per second of the system's own high-resolution counter. A tick is 64
