@@ -3,7 +3,7 @@
 #include "Trace/HxCTransformationTracer.h"
 #include "host/base/HX_Output.h"
 #include "host/program/HX_Version.h"
-#include "platform/matlab/HX_MexInterface.h"
+#include "platform/matlab/HX_MatlabSession.h"
 
 namespace fs = std::filesystem;
 

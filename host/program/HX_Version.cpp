@@ -4,7 +4,8 @@
 
 #include "SystemServices/HX_OfficialVersion.h"
 #include "SystemServices/ResourceInfo/HxCResourceInfo.h"
-#include "platform/matlab/HX_MexInterface.h"
+#include "platform/matlab/HX_MatlabSession.h"
+#include "platform/matlab/HX_MxContent.h"
 #include "platform/os/HX_VersionResource.h"
 #include "platform/strings/KyCXString.h"
 

@@ -7,18 +7,23 @@
 #include <string>
 #include <utility>
 
+#include "platform/HX_NeverDestroyed.h"
+#include "platform/matlab/HX_MatlabSession.h"
+#include "platform/matlab/HX_MxArrayConverter.h"
+#include "platform/matlab/HX_MxContent.h"
 #include "platform/strings/KyCXString.h"
 
 namespace {
 
 HX_CommandWindow& commandWindow() {
-  static HX_CommandWindow s_window;
-  return s_window;
+  static HX_NeverDestroyed<HX_CommandWindow> s_window;
+  return s_window.value;
 }
 
 std::map<std::string, HX_MatlabFunction>& functions() {
-  static std::map<std::string, HX_MatlabFunction> s_functions;
-  return s_functions;
+  static HX_NeverDestroyed<std::map<std::string, HX_MatlabFunction>>
+      s_functions;
+  return s_functions.value;
 }
 
 }  // namespace
@@ -69,8 +74,5 @@ mxArray* MXGetField(mxArray* array, int index, const char* name) {
 }
 
 bool MXCopyMXArrayToString(const mxArray* array, KyCXString& text) {
-  const char* characters = mxGetText(array);
-  if (characters == nullptr) return false;
-  text = characters;
-  return true;
+  return HX_MxArrayConverter().mxArrayToString(array, text);
 }

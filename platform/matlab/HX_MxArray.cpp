@@ -1,4 +1,4 @@
-#include "platform/matlab/HX_MxArray.h"
+#include "platform/matlab/HX_MxContent.h"
 
 #include <cstddef>
 #include <limits>
@@ -6,6 +6,8 @@
 #include <string>
 #include <variant>
 #include <vector>
+
+#include "platform/strings/KyCXString.h"
 
 namespace {
 
@@ -18,7 +20,7 @@ int s_liveArrays = 0;
 
 class mxArray {
  public:
-  explicit mxArray(std::variant<std::string, double, Structure> content)
+  explicit mxArray(std::variant<KyCXString, double, Structure> content)
       : m_Content(std::move(content)) {
     ++s_liveArrays;
   }
@@ -46,7 +48,7 @@ class mxArray {
   }
 
  private:
-  std::variant<std::string, double, Structure> m_Content;
+  std::variant<KyCXString, double, Structure> m_Content;
 };
 
 namespace {
@@ -60,8 +62,10 @@ const T* contentAs(const mxArray* array) {
 }  // namespace
 
 mxArray* mxCreateString(const char* text) {
-  return new mxArray(std::string(text == nullptr ? "" : text));
+  return mxCreateText(KyCXString(text));
 }
+
+mxArray* mxCreateText(const KyCXString& text) { return new mxArray(text); }
 
 mxArray* mxCreateScalarDouble(double value) { return new mxArray(value); }
 
@@ -79,7 +83,7 @@ mxArray* mxCreateStructMatrix(int rows, int columns,
 void mxDestroyArray(mxArray* array) { delete array; }
 
 bool mxIsChar(const mxArray* array) {
-  return contentAs<std::string>(array) != nullptr;
+  return contentAs<KyCXString>(array) != nullptr;
 }
 
 bool mxIsDouble(const mxArray* array) {
@@ -95,14 +99,13 @@ double mxGetScalar(const mxArray* array) {
   return value == nullptr ? std::numeric_limits<double>::quiet_NaN() : *value;
 }
 
-const char* mxGetText(const mxArray* array) {
-  const std::string* text = contentAs<std::string>(array);
-  return text == nullptr ? nullptr : text->c_str();
+const KyCXString* mxGetText(const mxArray* array) {
+  return contentAs<KyCXString>(array);
 }
 
 mxArray* mxGetField(const mxArray* array, int index, const char* name) {
   if (array == nullptr) return nullptr;
-  // The caller may change the value, as the workspace's own interface has it.
+  // The workspace's own interface lets the caller change the value.
   mxArray** place = const_cast<mxArray*>(array)->place(index, name);
   return place == nullptr ? nullptr : *place;
 }

@@ -1,12 +1,13 @@
 #include "platform/matlab/HX_MxArrayConverter.h"
 
+#include "platform/matlab/HX_MxContent.h"
 #include "platform/strings/KyCXString.h"
 
 bool HX_MxArrayConverter::mxArrayToString(const mxArray* array,
                                           KyCXString& text) const {
-  const char* characters = mxGetText(array);
-  if (characters == nullptr) return false;
-  text = characters;
+  const KyCXString* found = mxGetText(array);
+  if (found == nullptr) return false;
+  text = *found;
   return true;
 }
 

@@ -8,8 +8,9 @@
 
 class KyCXString;
 
-/// Holds no data. An array of another kind, and null, cannot be converted: the
-/// result is false and the value is not written.
+/// Holds no data.
+/// RETURNS: false, with the value unchanged, for an array of a different kind
+/// and for null.
 class HX_PLATFORM_API HX_MxArrayConverter {
  public:
   /// The characters of a text array.

@@ -1,6 +1,5 @@
-// Access to the simulation tool's data.
+// Questions to the simulation tool.
 //
-//   HX_SimulinkInterface::setTree(&tree);
 //   mxArray* path = mxCreateString("cruise/Gain 1");
 //   mxArray* handle = HX_SimulinkInterface::getMxSlData(path, "Handle");
 
@@ -20,11 +19,14 @@ class HX_PLATFORM_API HX_SimulinkInterface {
   static constexpr double s_invalidHandle = -1.0;
 
   /// The value of a parameter of the block that \p object names, a handle or a
-  /// path. A new array, owned by the caller; null for a null or unknown object,
-  /// an unknown parameter, and while there is no model.
+  /// path.
+  /// RETURNS: a new array; null for a null or unknown object, an unknown
+  /// parameter, and while no model is open.
+  /// OWNERSHIP: the caller's.
   static mxArray* getMxSlData(mxArray* object, const KyCXString& parameter);
 
-  /// Makes \p tree, which is not owned, the open model; null for none.
+  /// Not called by the library: makes \p tree the open model; null for none.
+  /// OWNERSHIP: the host's; \p tree outlives its use.
   static void setTree(const HX_SimulinkTree* tree);
 };
 

@@ -9,6 +9,7 @@
 #define PLATFORM_MATLAB_HX_SIMULINKTREE_H
 
 #include <map>
+#include <vector>
 
 #include "platform/HX_PlatformExport.h"
 #include "platform/matlab/HX_MxArray.h"
@@ -16,7 +17,8 @@
 #include "platform/strings/KyCXString.h"
 
 /// Handles count from 1.0. A path is the names from the model down to the block
-/// with '/' between them; a '/' inside a name is doubled.
+/// with '/' between the names; a '/' inside a name is doubled. A model with an
+/// empty name has the empty path, and paths below the model begin with '/'.
 class HX_PLATFORM_API HX_SimulinkTree {
  public:
   HX_SimulinkTree() = default;
@@ -24,22 +26,29 @@ class HX_PLATFORM_API HX_SimulinkTree {
   HX_SimulinkTree& operator=(const HX_SimulinkTree&) = default;
   virtual ~HX_SimulinkTree();
 
-  /// Adds a block, or a model if there is no block \p parent. Names differ
-  /// among the blocks of one parent. \return the new block's handle
+  /// Adds a block below \p parent, or a model if \p parent is no block. Names
+  /// differ among the blocks of one parent.
+  /// RETURNS: the handle of the new block.
   double addBlock(const KyCXString& name,
                   double parent = HX_SimulinkInterface::s_invalidHandle);
 
-  /// The path of a block; empty for an unknown handle.
+  /// RETURNS: the path of a block; empty for an unknown handle.
   KyCXString getPath(double handle) const;
 
-  /// Makes a block name \p path as its parent, as a damaged model does. Its
-  /// own path stays.
+  /// Makes the parameter "Parent" of a block answer \p path, as in a damaged
+  /// model. The path of the block stays.
   void setParentPath(double handle, const KyCXString& path);
 
-  /// The value of a parameter of \p object, a handle or a path: the texts
-  /// "Name" and "Parent" (the parent's path, empty for a model), and the double
-  /// "Handle". A new array, owned by the caller; null for an unknown object or
-  /// parameter.
+  /// Parameters of a block, given as a handle or a path:
+  ///
+  ///   "Name"    text
+  ///   "Handle"  double
+  ///   "Parent"  text: the path of the parent, empty for a model
+  ///
+  /// A path of 8-bit characters also names a block whose path has '?' in place
+  /// of units above 255.
+  /// RETURNS: a new array; null for an unknown block or parameter.
+  /// OWNERSHIP: the caller's.
   virtual mxArray* getParameter(const mxArray* object,
                                 const KyCXString& parameter) const;
 
@@ -50,10 +59,13 @@ class HX_PLATFORM_API HX_SimulinkTree {
     KyCXString parentPath;
   };
 
+  const Block* find(double handle) const;
   double findHandle(const mxArray* object) const;
 
-  std::map<double, Block> m_Blocks;        // by handle
-  std::map<KyCXString, double> m_Handles;  // by path
+  std::vector<Block> m_Blocks;  // the block of handle 1.0 first
+  // By path and, unless a path says the same, by the 8-bit form of a path.
+  std::map<KyCXString, double> m_Handles;
+  std::map<KyCXString, double> m_NarrowHandles;
 };
 
 #endif  // PLATFORM_MATLAB_HX_SIMULINKTREE_H

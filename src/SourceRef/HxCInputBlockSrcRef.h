@@ -9,9 +9,9 @@
 #define SOURCEREF_HXCINPUTBLOCKSRCREF_H
 
 #include "SourceRef/HxCSrcRef.h"
+#include "platform/matlab/HX_MxArray.h"
 
 class HX_InputBlockId;
-class mxArray;
 
 /// Created and owned by the model reader. The identifier is not owned; it must
 /// outlive the reference, its copies and its clones. Copies keep the number.

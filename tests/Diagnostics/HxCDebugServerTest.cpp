@@ -5,7 +5,7 @@
 
 #include "Diagnostics/HX_FileFixture.h"
 #include "SystemServices/HX_BuildNumber.h"
-#include "platform/matlab/HX_MexInterface.h"
+#include "platform/matlab/HX_MatlabSession.h"
 
 namespace {
 

@@ -2,7 +2,7 @@
 
 #include <random>
 
-#include "platform/matlab/HX_MxArray.h"
+#include "platform/matlab/HX_MxContent.h"
 #include "platform/matlab/HX_SimulinkTree.h"
 #include "platform/model/HX_BlockDataBase.h"
 #include "platform/model/HX_InputBlockId.h"

@@ -3,7 +3,8 @@
 #include <tuple>
 
 #include "SystemServices/HX_OfficialVersion.h"
-#include "platform/matlab/HX_MexInterface.h"
+#include "platform/matlab/HX_MatlabSession.h"
+#include "platform/matlab/HX_MxContent.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
