@@ -1,5 +1,7 @@
 #include "platform/datadictionary/HX_DdTree.h"
 
+#include "platform/HX_NeverDestroyed.h"
+
 namespace {
 
 constexpr char kRoot[] = "//DD0";
@@ -12,8 +14,8 @@ std::string absolute(const std::string& path) {
 }  // namespace
 
 HX_DdTree& HX_DdTree::instance() {
-  static HX_DdTree s_tree;
-  return s_tree;
+  static HX_NeverDestroyed<HX_DdTree> s_tree;
+  return s_tree.value;
 }
 
 void HX_DdTree::clear() {
@@ -31,9 +33,11 @@ unsigned long HX_DdTree::add(const std::string& path, unsigned short kind) {
   const std::size_t slash = full.rfind('/');
   const bool hasParent = slash != std::string::npos && slash > 1;
   const unsigned long parent = hasParent ? add(full.substr(0, slash)) : 0;
-  m_Objects.push_back({full, parent, kind, {}});
-  m_Handles.emplace(full, m_Objects.size());
-  return m_Objects.size();
+  m_Objects.push_back({full, kind, {}, {}});
+  const auto handle = static_cast<unsigned long>(m_Objects.size());
+  m_Handles.emplace(full, handle);
+  if (parent != 0) m_Objects[parent - 1].children.push_back(handle);
+  return handle;
 }
 
 void HX_DdTree::addReference(unsigned long handle, const std::string& property,
@@ -67,8 +71,7 @@ const std::vector<HX_DdTree::Reference>& HX_DdTree::references(
 std::vector<unsigned long> HX_DdTree::children(unsigned long handle,
                                                unsigned short kind) const {
   std::vector<unsigned long> result;
-  for (unsigned long child = 1; child <= m_Objects.size(); ++child)
-    if (object(child).parent == handle && object(child).kind == kind)
-      result.push_back(child);
+  for (const unsigned long child : object(handle).children)
+    if (object(child).kind == kind) result.push_back(child);
   return result;
 }

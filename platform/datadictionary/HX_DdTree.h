@@ -59,8 +59,8 @@ class HX_PLATFORM_API HX_DdTree {
  private:
   struct Object {
     std::string path;
-    unsigned long parent;
     unsigned short kind;
+    std::vector<unsigned long> children;  // in the order of their making
     std::vector<Reference> references;
   };
 

@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include "platform/HX_NeverDestroyed.h"
 #include "platform/datadictionary/HX_DdTree.h"
 
 namespace {
@@ -16,8 +17,8 @@ struct Heap {
 };
 
 Heap& heap() {
-  static Heap s_heap;
-  return s_heap;
+  static HX_NeverDestroyed<Heap> s_heap;
+  return s_heap.value;
 }
 
 void* allocate(std::size_t size) {

@@ -9,6 +9,7 @@
 
 #include "Control/ERR_Catalogue.h"
 #include "SourceRef/HxCSrcRef.h"
+#include "platform/HX_NeverDestroyed.h"
 #include "platform/messages/ERR_MessageHandler.h"
 #include "platform/strings/KyCXString.h"
 
@@ -44,8 +45,8 @@ std::string format(const char* text, std::va_list arguments) {
 }  // namespace
 
 HX_MessageHandler& HX_MessageHandler::instance() {
-  static HX_MessageHandler s_handler;
-  return s_handler;
+  static HX_NeverDestroyed<HX_MessageHandler> s_handler;
+  return s_handler.value;
 }
 
 void HX_MessageHandler::clear() {

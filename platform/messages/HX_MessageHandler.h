@@ -16,6 +16,8 @@
 #include "platform/HX_PlatformExport.h"
 
 class HxCSrcRef;
+template <class>
+union HX_NeverDestroyed;
 
 /// One reported message. Texts are ISO-8859-1.
 struct HX_Message {
@@ -36,7 +38,8 @@ class HX_PLATFORM_API HX_MessageHandler {
   /// Receives file, line and expression; answers 1 to debug.
   using DebugReport = std::function<int(const char*, int, const char*)>;
 
-  /// The one handler of the process.
+  /// The handler of the process. Destructors of static objects may still
+  /// report: the end of the process does not destroy the handler.
   static HX_MessageHandler& instance();
 
   /// Every message since the last clear(), in the order of reporting.
@@ -68,6 +71,8 @@ class HX_PLATFORM_API HX_MessageHandler {
   static const char* severityName(int severity);
 
  private:
+  template <class>
+  friend union HX_NeverDestroyed;
   HX_MessageHandler() = default;
 
   std::vector<HX_Message> m_Messages;

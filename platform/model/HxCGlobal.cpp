@@ -1,5 +1,6 @@
 #include "platform/model/HxCGlobal.h"
 
+#include "platform/HX_NeverDestroyed.h"
 #include "platform/model/HX_Options.h"
 #include "platform/model/HX_SlBlockHandlesDB.h"
 
@@ -18,8 +19,8 @@ struct Global {
 };
 
 Global& global() {
-  static Global s_global;
-  return s_global;
+  static HX_NeverDestroyed<Global> s_global;
+  return s_global.value;
 }
 
 }  // namespace

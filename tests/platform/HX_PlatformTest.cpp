@@ -2,12 +2,17 @@
 // clocks.
 
 #include <climits>
+#include <limits>
 #include <set>
 
 #include "Control/ERR_Catalogue.h"
 #include "platform/containers/dictionary.h"
 #include "platform/containers/list.h"
 #include "platform/containers/stack.h"
+#include "platform/datadictionary/HX_DdTree.h"
+#include "platform/matlab/HX_MxArrayConverter.h"
+#include "platform/matlab/HX_MxContent.h"
+#include "platform/matlab/HX_SimulinkTree.h"
 #include "platform/messages/ERR_MessageHandler.h"
 #include "platform/messages/HX_MessageHandler.h"
 #include "platform/os/HX_OsClock.h"
@@ -68,6 +73,79 @@ TEST_F(PlatformTest, StackAndArrayGiveBackWhatTheyHold) {
   EXPECT_THAT(std::vector<int>(array.begin(), array.end()),
               ElementsAre(1, 2, 0, 0));
   EXPECT_EQ(leda::array<int>().high(), -1);
+}
+
+// Name, path and parent of blocks that are asked by handle and by path.
+TEST_F(PlatformTest, ModelTreeAnswersForEachBlock) {
+  const unsigned short kWide[] = {'g', 0x3B1, 0x416};
+  const KyCXString wide(kWide, 3);
+  HX_SimulinkTree tree;
+  const double model = tree.addBlock("m");
+  const double sub = tree.addBlock("a/b", model);
+  const double gain = tree.addBlock(wide, sub);
+  const double unnamed = tree.addBlock("");
+  const double orphan = tree.addBlock("m", unnamed);
+  const double nan = std::numeric_limits<double>::quiet_NaN();
+  const double other = tree.addBlock("n", nan);  // a model
+  const struct {
+    double handle;
+    KyCXString name, path, parent;
+  } rows[] = {{model, "m", "m", ""},
+              {sub, "a/b", "m/a//b", "m"},
+              {gain, wide, KyCXString("m/a//b/") + wide, "m/a//b"},
+              {unnamed, "", "", ""},
+              {orphan, "m", "/m", ""},
+              {other, "n", "n", ""}};
+  const HX_MxArrayConverter converter;
+  const auto ask = [&](mxArray* object, const char* parameter) {
+    mxArray* value = tree.getParameter(object, parameter);
+    KyCXString text("none");
+    double number = 0.0;
+    converter.mxArrayToString(value, text);
+    if (converter.mxArrayToDouble(value, number))
+      text = KyCXString(static_cast<int>(number), false, true);
+    mxDestroyArray(value);
+    return text;
+  };
+  const int liveArrays = HX_LiveMxArrays();
+  for (const auto& row : rows) {
+    const KyCXString handle(static_cast<int>(row.handle), false, true);
+    // As the library asks, by a path in 8 bits, and with all units.
+    for (mxArray* object :
+         {mxCreateScalarDouble(row.handle), mxCreateString(row.path.cstring()),
+          mxCreateText(row.path)}) {
+      EXPECT_EQ(ask(object, "Name"), row.name);
+      EXPECT_EQ(ask(object, "Parent"), row.parent);
+      EXPECT_EQ(ask(object, "Handle"), handle);
+      mxDestroyArray(object);
+    }
+    EXPECT_EQ(tree.getPath(row.handle), row.path);
+  }
+  for (const double handle : {0.0, 1.5, 7.0, -1.0, nan}) {
+    mxArray* object = mxCreateScalarDouble(handle);
+    EXPECT_EQ(ask(object, "Name"), "none") << handle;
+    mxDestroyArray(object);
+  }
+  EXPECT_EQ(HX_LiveMxArrays(), liveArrays);
+}
+
+TEST_F(PlatformTest, DictionaryTreeListsChildrenOfOneKindInOrder) {
+  HX_DdTree& tree = HX_DdTree::instance();
+  tree.clear();
+  const unsigned long pool = tree.add("/Pool");
+  std::vector<unsigned long> components;
+  for (const char* name : {"b", "a", "c"}) {
+    const std::string path = "/Pool/" + std::string(name);
+    components.push_back(tree.add(path, HX_DdTree::kSoftwareComponent));
+    tree.add(path + "/below", HX_DdTree::kSoftwareComponent);
+  }
+  const unsigned long late = tree.add("/Pool/late");
+  EXPECT_THAT(tree.children(pool, 0), ElementsAre(late));
+  tree.add("/Pool/late", HX_DdTree::kSoftwareComponent);
+  components.push_back(late);
+  EXPECT_EQ(tree.children(pool, HX_DdTree::kSoftwareComponent), components);
+  EXPECT_EQ(tree.find("//DD0/Pool/a"), components[1]);
+  tree.clear();
 }
 
 TEST_F(PlatformTest, NumbersAreWrittenInTheWidthAsked) {

@@ -6,6 +6,7 @@
 #include <filesystem>
 #include <system_error>
 
+#include "platform/HX_NeverDestroyed.h"
 #include "platform/os/HX_OsVersion.h"
 #include "platform/os/HX_VersionResource.h"
 
@@ -17,8 +18,8 @@ struct Module {
 };
 
 std::map<std::string, Module>& modules() {
-  static std::map<std::string, Module> s_modules;
-  return s_modules;
+  static HX_NeverDestroyed<std::map<std::string, Module>> s_modules;
+  return s_modules.value;
 }
 
 const std::string* findBlock(const char* path) {
