@@ -13,4 +13,13 @@
 #define HX_UTILS_API __attribute__((visibility("default")))
 #endif
 
+/// Marks inline functions. A shared object exports them, see
+/// Control/HX_ExportInline.h; a host compiles their bodies instead of
+/// importing.
+#if defined(_WIN32) && !defined(HX_UTILS_BUILDING)
+#define HX_UTILS_INLINE_API
+#else
+#define HX_UTILS_INLINE_API HX_UTILS_API
+#endif
+
 #endif  // HX_EXPORT_H
