@@ -3,6 +3,8 @@
 #include <string>
 
 #include "Control/ERR_Messages.h"
+#include "Control/HX_ExportInline.h"
+#include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
 #include "Math/IMS_Log2.h"
 #include "Strings/STR_StringSupport.h"
@@ -11,8 +13,10 @@
 namespace {
 
 constexpr char kErrorCode[] = __FILE__ "_";
-constexpr char kHeader[] = "FLAG.h";
-constexpr char kHeaderErrorCode[] = "FLAG.h_";
+constexpr char kReportHead[] = "Flag conflict found ! Flag ";
+
+using Text = std::basic_string<char, std::char_traits<char>,
+                               HX_ControllerAllocator<char>>;
 
 // The row of flag; -1, after the assertion, if the table has none.
 int rowOfFlag(unsigned int flag, int rowCount) {
@@ -35,9 +39,9 @@ Conflict findConflict(unsigned int field, unsigned int flag, int rowCount,
   return {row, row < 0 ? 0 : field & rows[row].excludedFlags};
 }
 
-std::string describe(const Conflict& conflict, int rowCount,
-                     const FLAG_flag_info* rows, const char* suffix) {
-  std::string report = "Flag conflict found ! Flag ";
+Text describe(const Conflict& conflict, int rowCount,
+              const FLAG_flag_info* rows, const char* suffix) {
+  Text report = kReportHead;
   report += nameOf(rows[conflict.row]);
   report += " excludes flag(s): ";
   for (unsigned int conflicts = conflict.flags; conflicts != 0;
@@ -51,17 +55,32 @@ std::string describe(const Conflict& conflict, int rowCount,
   return report;
 }
 
+// Reports a conflict, by the head of the text alone if memory runs out.
+// clear: what has to happen between the forming of the text and the report.
+template <class Clear>
 void report(const Conflict& conflict, int rowCount, const FLAG_flag_info* rows,
-            const char* suffix) {
+            const char* suffix, Clear clear) {
   if (conflict.flags == 0) return;
-  ERR_Msg1292(describe(conflict, rowCount, rows, suffix).c_str());
+  const Text text = HX_WithinMemory(
+      Text(), [&] { return describe(conflict, rowCount, rows, suffix); });
+  clear();
+  ERR_Msg1292(text.empty() ? kReportHead : text.c_str());
 }
 
 }  // namespace
 
-void hx_detail::failFlagField(int line) {
-  HX_Assert(false, kHeaderErrorCode, kHeader, line);
-}
+template struct HX_ExportInline<
+    &FLAG_ClearAll, &FLAG_ClearFlag, &FLAG_SetFlag, &FLAG_GetFlag,
+    &FLAG_GetFlags, &FLAG_GetAllFlagsFromFlagField, &FLAG_GetNumberOfFlags,
+    &FLAG_GetNumberOfFlagsInField, &FLAG_GetIthFlag, &FLAG_GetIthFlagInField,
+    &FLAG_CompareFlagfields>;
+
+void hx_detail::failClearAll() { HX_Assert(false, kErrorCode); }
+void hx_detail::failClearFlag() { HX_Assert(false, kErrorCode); }
+void hx_detail::failSetFlag() { HX_Assert(false, kErrorCode); }
+void hx_detail::failGetFlag() { HX_Assert(false, kErrorCode); }
+void hx_detail::failGetFlags() { HX_Assert(false, kErrorCode); }
+void hx_detail::failGetAllFlags() { HX_Assert(false, kErrorCode); }
 
 unsigned int* FLAG_NewField() {
   auto* field =
@@ -81,14 +100,14 @@ unsigned int* FLAG_DupFlagField(unsigned int* field) {
 int FLAG_CheckFlag(unsigned int* field, unsigned int flag, int rowCount,
                    const FLAG_flag_info* rows) {
   const Conflict conflict = findConflict(*field, flag, rowCount, rows);
-  report(conflict, rowCount, rows, "");
+  report(conflict, rowCount, rows, "", [] {});
   return static_cast<int>(conflict.flags);
 }
 
 int FLAG_SaveSetFlag(unsigned int* field, unsigned int flag, int rowCount,
                      const FLAG_flag_info* rows) {
   const Conflict conflict = findConflict(*field, flag, rowCount, rows);
-  report(conflict, rowCount, rows, ". Didn't set flag.");
+  report(conflict, rowCount, rows, ". Didn't set flag.", [] {});
   if (conflict.row >= 0 && conflict.flags == 0) *field |= flag;
   return static_cast<int>(conflict.flags);
 }
@@ -97,9 +116,7 @@ void FLAG_ForceSetFlag(unsigned int* field, unsigned int flag, int rowCount,
                        const FLAG_flag_info* rows) {
   *field |= flag;
   const Conflict conflict = findConflict(*field, flag, rowCount, rows);
-  if (conflict.flags == 0) return;
-  const std::string text =
-      describe(conflict, rowCount, rows, ". Clearing bad flag(s).");
-  *field &= ~flag;  // before the report: who receives it may read the field
-  ERR_Msg1292(text.c_str());
+  // Cleared before the report: the receiver of the message may read the field.
+  report(conflict, rowCount, rows, ". Clearing bad flag(s).",
+         [&] { *field &= ~flag; });
 }

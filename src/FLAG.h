@@ -33,14 +33,19 @@ struct FLAG_flag_info {
 
 namespace hx_detail {
 
-/// Raises the assertion of a null field for \p line of this header.
-HX_UTILS_API void failFlagField(int line);
+// The assertions of a null field, one per operation: message 7 tells the line
+// of FLAG.cpp and so the operation.
+HX_UTILS_API void failClearAll();
+HX_UTILS_API void failClearFlag();
+HX_UTILS_API void failSetFlag();
+HX_UTILS_API void failGetFlag();
+HX_UTILS_API void failGetFlags();
+HX_UTILS_API void failGetAllFlags();
 
-inline bool isFlagField(const unsigned int* field,
-                        int line = __builtin_LINE()) {
+inline bool isFlagField(const unsigned int* field, void (*fail)()) {
   if (field != nullptr) [[likely]]
     return true;
-  failFlagField(line);
+  fail();
   return false;
 }
 
@@ -58,58 +63,69 @@ HX_UTILS_API unsigned int* FLAG_NewField();
 HX_UTILS_API unsigned int* FLAG_DupFlagField(unsigned int* field);
 
 /// Asserts that the field is not null.
-inline void FLAG_ClearAll(unsigned int* field) {
-  if (hx_detail::isFlagField(field)) *field = 0;
+HX_UTILS_INLINE_API inline void FLAG_ClearAll(unsigned int* field) {
+  if (hx_detail::isFlagField(field, hx_detail::failClearAll)) *field = 0;
 }
 
 /// Asserts that the field is not null.
-inline void FLAG_ClearFlag(unsigned int* field, unsigned int flags) {
-  if (hx_detail::isFlagField(field)) *field &= ~flags;
+HX_UTILS_INLINE_API inline void FLAG_ClearFlag(unsigned int* field,
+                                               unsigned int flags) {
+  if (hx_detail::isFlagField(field, hx_detail::failClearFlag)) *field &= ~flags;
 }
 
 /// Asserts that the field is not null.
-inline void FLAG_SetFlag(unsigned int* field, unsigned int flags) {
-  if (hx_detail::isFlagField(field)) *field |= flags;
+HX_UTILS_INLINE_API inline void FLAG_SetFlag(unsigned int* field,
+                                             unsigned int flags) {
+  if (hx_detail::isFlagField(field, hx_detail::failSetFlag)) *field |= flags;
 }
 
 /// True if any of \p flags is set; false for no flags. Asserts that the field
 /// is not null.
-inline bool FLAG_GetFlag(unsigned int* field, unsigned int flags) {
-  return hx_detail::isFlagField(field) && (*field & flags) != 0;
+HX_UTILS_INLINE_API inline bool FLAG_GetFlag(unsigned int* field,
+                                             unsigned int flags) {
+  return hx_detail::isFlagField(field, hx_detail::failGetFlag) &&
+         (*field & flags) != 0;
 }
 
 /// True if all of \p flags are set; true for no flags. Asserts that the field
 /// is not null.
-inline bool FLAG_GetFlags(unsigned int* field, unsigned int flags) {
-  return hx_detail::isFlagField(field) && (*field & flags) == flags;
+HX_UTILS_INLINE_API inline bool FLAG_GetFlags(unsigned int* field,
+                                              unsigned int flags) {
+  return hx_detail::isFlagField(field, hx_detail::failGetFlags) &&
+         (*field & flags) == flags;
 }
 
 /// The whole word. Asserts that the field is not null.
-inline unsigned int FLAG_GetAllFlagsFromFlagField(unsigned int* field) {
-  return hx_detail::isFlagField(field) ? *field : 0;
+HX_UTILS_INLINE_API inline unsigned int FLAG_GetAllFlagsFromFlagField(
+    unsigned int* field) {
+  return hx_detail::isFlagField(field, hx_detail::failGetAllFlags) ? *field : 0;
 }
 
 /// The number of set bits.
-inline int FLAG_GetNumberOfFlags(unsigned int word) {
+HX_UTILS_INLINE_API inline int FLAG_GetNumberOfFlags(unsigned int word) {
   return std::popcount(word);
 }
-inline int FLAG_GetNumberOfFlagsInField(unsigned int* field) {
+HX_UTILS_INLINE_API inline int FLAG_GetNumberOfFlagsInField(
+    unsigned int* field) {
   return FLAG_GetNumberOfFlags(*field);
 }
 
 /// The mask of the \p i-th set bit: 1 asks for the lowest, the number of flags
 /// for the highest. 0 if there is no such bit.
-inline unsigned int FLAG_GetIthFlag(unsigned int word, int i) {
+HX_UTILS_INLINE_API inline unsigned int FLAG_GetIthFlag(unsigned int word,
+                                                        int i) {
   if (i < 1) return 0;
   while (--i > 0 && word != 0) word &= word - 1;
   return word & (0U - word);
 }
-inline unsigned int FLAG_GetIthFlagInField(unsigned int* field, int i) {
+HX_UTILS_INLINE_API inline unsigned int FLAG_GetIthFlagInField(
+    unsigned int* field, int i) {
   return FLAG_GetIthFlag(*field, i);
 }
 
 /// HXCG_EQUAL if both fields hold the same flags.
-inline HXCG_compare FLAG_CompareFlagfields(unsigned int* a, unsigned int* b) {
+HX_UTILS_INLINE_API inline HXCG_compare FLAG_CompareFlagfields(
+    unsigned int* a, unsigned int* b) {
   return *a == *b ? HXCG_EQUAL : HXCG_DIFFERENT;
 }
 

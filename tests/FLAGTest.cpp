@@ -1,5 +1,7 @@
 #include "FLAG.h"
 
+#include <set>
+
 #include "platform/messages/HX_MessageHandler.h"
 #include "support/HX_TestFixture.h"
 
@@ -66,8 +68,11 @@ TEST_F(FLAGTest, NullFieldsAreReportedAndLeftAlone) {
   FLAG_ClearAll(nullptr);
   EXPECT_FALSE(FLAG_GetFlag(nullptr, kA) || FLAG_GetFlags(nullptr, 0));
   EXPECT_EQ(FLAG_GetAllFlagsFromFlagField(nullptr), 0U);
-  const auto internal = StartsWith("7/3 Internal error. Error code: FLAG.h_");
+  const auto internal = StartsWith("7/3 Internal error. Error code: FLAG.cpp_");
   EXPECT_THAT(messages(), AllOf(SizeIs(6), Each(internal)));
+  const std::vector<std::string> all = messages();
+  EXPECT_EQ(std::set<std::string>(all.begin(), all.end()).size(), 6U)
+      << "each operation fails on a line of its own";
 }
 
 TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
@@ -120,6 +125,21 @@ TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
     EXPECT_EQ(seen, row.forced);
     EXPECT_THAT(messages(), ElementsAreArray(expected));
   }
+}
+
+TEST_F(FLAGTest, AConflictIsReportedWithoutMemoryAndByTheController) {
+  unsigned int field = kA;
+  EXPECT_EQ(FLAG_CheckFlag(&field, kB, 4, kRows), static_cast<int>(kA));
+  EXPECT_GT(m_Controller.allocated(), 0);
+  m_Controller.fail();
+  clearMessages();
+  EXPECT_EQ(FLAG_SaveSetFlag(&field, kB, 4, kRows), static_cast<int>(kA));
+  FLAG_ForceSetFlag(&field, kB, 4, kRows);
+  EXPECT_EQ(field, kA);
+  EXPECT_THAT(
+      messages(),
+      AllOf(SizeIs(2), Each("1292/5 INTERNAL: Flag conflict found ! Flag ")));
+  EXPECT_EQ(m_Controller.liveBlocks(), 0);
 }
 
 }  // namespace
