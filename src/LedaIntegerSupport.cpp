@@ -1,11 +1,17 @@
 #include "LedaIntegerSupport.h"
 
+#include "Control/HX_ExportInline.h"
+
 namespace hx_detail {
 
 constinit leda::integer ledaLargestInt64;
 constinit leda::integer ledaSmallestInt64;
 
 }  // namespace hx_detail
+
+template struct HX_ExportInline<
+    static_cast<leda::integer (*)(long long)>(&toInteger),
+    static_cast<leda::integer (*)(unsigned long long)>(&toInteger), &toInt64>;
 
 void LedaIntegerSupportBoot() {
   hx_detail::ledaLargestInt64 =

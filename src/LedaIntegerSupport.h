@@ -25,12 +25,12 @@ HX_UTILS_API extern leda::integer ledaSmallestInt64;
 }  // namespace hx_detail
 
 /// The same value.
-inline leda::integer toInteger(long long v) {
+HX_UTILS_INLINE_API inline leda::integer toInteger(long long v) {
   const leda::integer low(static_cast<unsigned int>(v));
   const leda::integer high(static_cast<int>(v >> 32));
   return (high << 32) + low;
 }
-inline leda::integer toInteger(unsigned long long v) {
+HX_UTILS_INLINE_API inline leda::integer toInteger(unsigned long long v) {
   const leda::integer low(static_cast<unsigned int>(v));
   const leda::integer high(static_cast<unsigned int>(v >> 32));
   return (high << 32) + low;
@@ -41,7 +41,7 @@ inline leda::integer toInteger(unsigned long long v) {
 /// Before LedaIntegerSupportBoot() the bounds are 0: every positive value gives
 /// the largest, every negative value the smallest result. A debug check
 /// reports values of more than two words, which cannot get past the bounds.
-inline long long toInt64(const leda::integer& x) {
+HX_UTILS_INLINE_API inline long long toInt64(leda::integer x) {
   if (x > hx_detail::ledaLargestInt64) {
     return std::numeric_limits<long long>::max();
   }

@@ -81,7 +81,7 @@ void overPairs(benchmark::State& state, std::int64_t inputs,
 
 void BM_IMS_Gcd(benchmark::State& state) {
   overPairs(state, state.range(0), [](long long a, long long b) {
-    const long long pair[] = {a, b};
+    long long pair[] = {a, b};
     return IMS_FindGreatestCommonDivisor(pair);
   });
 }
@@ -105,7 +105,7 @@ BENCHMARK(BM_Boost_Gcd)->DenseRange(eMixed, e63Bits);
 
 void BM_IMS_Lcm(benchmark::State& state) {
   overPairs(state, eSampleRates, [](long long a, long long b) {
-    const long long pair[] = {a, b};
+    long long pair[] = {a, b};
     return IMS_FindLeastCommonMultiple(2, pair, 0x1p62);
   });
 }

@@ -6,6 +6,7 @@
 #include <limits>
 #include <utility>
 
+#include "Control/HX_ExportInline.h"
 #include "Math/FPS_FloatingPointSupport.h"
 #include "platform/datatypes/HX_NumericalType.h"
 #include "platform/datatypes/HX_TypeSupport.h"
@@ -67,6 +68,11 @@ double powerOf2(int exponent) { return std::ldexp(1.0, exponent); }
 
 }  // namespace
 
+template struct HX_ExportInline<
+    &IMS_FindGreatestCommonDivisor, static_cast<int (*)(unsigned)>(&IMS_Log2),
+    static_cast<int (*)(int)>(&IMS_Log2), static_cast<int (*)(long)>(&IMS_Log2),
+    static_cast<int (*)(long long)>(&IMS_Log2)>;
+
 long long hx_detail::gcdOfAny(long long a, long long b) {
   if (a == 0) return b;
   if (b == 0) return a;
@@ -116,8 +122,7 @@ long long IMS_SimulinkAlikeSqrt(long long v) {
   return FPS_SatCastToInt64(FPS_SimulinkAlikeSqrt(static_cast<double>(v)));
 }
 
-long long IMS_FindLeastCommonMultiple(int n, const long long* values,
-                                      double limit) {
+long long IMS_FindLeastCommonMultiple(int n, long long* values, double limit) {
   const double product =
       static_cast<double>(values[0]) * static_cast<double>(values[1]);
   if (!(std::fabs(product) < 0x1p63)) return 0;
@@ -126,7 +131,7 @@ long long IMS_FindLeastCommonMultiple(int n, const long long* values,
   for (int i = 1; i < n; ++i) {
     const long long value = values[i];
     if (multiple == 0 || value == 0) return 0;
-    const long long pair[] = {multiple, value};
+    long long pair[] = {multiple, value};
     const long long divisor = IMS_FindGreatestCommonDivisor(pair);
     if (divisor == value && remainder(value, multiple) != 0) return 0;
     multiple = wrappedQuotient(
@@ -137,7 +142,7 @@ long long IMS_FindLeastCommonMultiple(int n, const long long* values,
   return multiple;
 }
 
-long long IMS_ShrinkValueToBaseType(long long v, const HX_NumericalType* type) {
+long long IMS_ShrinkValueToBaseType(long long v, HX_NumericalType* type) {
   const auto asDouble = static_cast<double>(v);
   if (!(asDouble > type->getMaximum()) && !(asDouble < type->getMinimum())) {
     return v;

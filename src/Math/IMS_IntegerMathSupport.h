@@ -81,7 +81,8 @@ HX_UTILS_API long long IMS_SimulinkAlikeSqrt(long long v);
 /// leads to. The smallest value is divided like any other, also by -1.
 /// Cost: operands of equal sign take the binary algorithm of J. Stein (J. Comp.
 /// Phys. 1, 1967), with about one subtraction per bit.
-inline long long IMS_FindGreatestCommonDivisor(const long long* pair) {
+HX_UTILS_INLINE_API inline long long IMS_FindGreatestCommonDivisor(
+    long long* pair) {
   const auto a = static_cast<unsigned long long>(pair[0]);
   const auto b = static_cast<unsigned long long>(pair[1]);
   // One test for the sign, for 0 and for the size: 1 to 2^32.
@@ -104,8 +105,7 @@ inline long long IMS_FindGreatestCommonDivisor(const long long* pair) {
 /// than the first is a proper divisor of the multiple of those before it: 3, 6
 /// gives 6, but 6, 3 gives 0. Any value 0 gives 0 as well.
 /// Products after the first are not checked: they wrap to 64 bits.
-HX_UTILS_API long long IMS_FindLeastCommonMultiple(int n,
-                                                   const long long* values,
+HX_UTILS_API long long IMS_FindLeastCommonMultiple(int n, long long* values,
                                                    double limit);
 
 /// \p v wrapped into the range of \p type: 40000 becomes -25536 in a signed
@@ -116,7 +116,7 @@ HX_UTILS_API long long IMS_FindLeastCommonMultiple(int n,
 /// A value from 0 to 127 is cut, but never becomes negative: 12 wraps to 12 in
 /// a signed 4-bit type, and 140 to -4.
 HX_UTILS_API long long IMS_ShrinkValueToBaseType(long long v,
-                                                 const HX_NumericalType* type);
+                                                 HX_NumericalType* type);
 
 /// True if \p x is not above the range of an integer with that signedness and
 /// bit width; fractions are allowed, and NaN is above no range.

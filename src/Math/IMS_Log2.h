@@ -11,13 +11,15 @@
 
 #include <bit>
 
+#include "HX_Export.h"
+
 /// The logarithm of \p value, rounded down: [0, 63]; 0 for 0, -1 below.
-constexpr int IMS_Log2(unsigned int value) {
+HX_UTILS_INLINE_API constexpr int IMS_Log2(unsigned int value) {
   return static_cast<int>(std::bit_width(value | 1U)) - 1;
 }
 
 /// \copydoc IMS_Log2(unsigned int)
-constexpr int IMS_Log2(long long value) {
+HX_UTILS_INLINE_API constexpr int IMS_Log2(long long value) {
   if (value <= 0) [[unlikely]] {
     return value == 0 ? 0 : -1;
   }
@@ -27,12 +29,12 @@ constexpr int IMS_Log2(long long value) {
 }
 
 /// \copydoc IMS_Log2(unsigned int)
-constexpr int IMS_Log2(int value) {
+HX_UTILS_INLINE_API constexpr int IMS_Log2(int value) {
   return IMS_Log2(static_cast<long long>(value));
 }
 
 /// \copydoc IMS_Log2(unsigned int)
-constexpr int IMS_Log2(long value) {
+HX_UTILS_INLINE_API constexpr int IMS_Log2(long value) {
   return IMS_Log2(static_cast<long long>(value));
 }
 

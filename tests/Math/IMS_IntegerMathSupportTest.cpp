@@ -57,7 +57,7 @@ TEST(IntegerMathSupportTest, DivisorsMatchThePlainRemainders) {
     for (long long second : values) {
       long long a = first, b = second;
       while (b != 0) a = std::exchange(b, b == -1 ? 0 : a % b);
-      const long long pair[] = {first, second};
+      long long pair[] = {first, second};
       ASSERT_EQ(IMS_FindGreatestCommonDivisor(pair), a)
           << first << ", " << second;
     }
@@ -81,7 +81,7 @@ TEST(IntegerMathSupportTest, MultiplesWithinTheirBounds) {
               {{1, kTwo62, 3}, kInf, -kTwo62},  // wraps
               {{1, kTwo62, 2}, kInf, 0},
               {{1LL << 33, 3}, kInf, 3LL << 33}};
-  for (const auto& [values, limit, expected] : rows) {
+  for (auto [values, limit, expected] : rows) {
     EXPECT_EQ(IMS_FindLeastCommonMultiple(static_cast<int>(values.size()),
                                           values.data(), limit),
               expected)
@@ -89,7 +89,7 @@ TEST(IntegerMathSupportTest, MultiplesWithinTheirBounds) {
   }
   constexpr long long kCount = 25;
   for (long long i = 0; i < kCount * kCount * kCount; ++i) {
-    const long long values[] = {i % kCount, i / kCount % kCount,
+    long long values[] = {i % kCount, i / kCount % kCount,
                                 i / kCount / kCount};
     long long multiple = values[0];
     for (long long v : {values[1], values[2]}) {
@@ -110,7 +110,7 @@ TEST(IntegerMathSupportTest, WrapsAndMatchesAsTheTypeDoes) {
     SCOPED_TRACE(testing::Message() << width << " bits, signed " << isSigned);
     const long long size = 1LL << width;
     const long long low = isSigned ? -size / 2 : 0, high = low + size - 1;
-    const HX_NumericalType type(static_cast<double>(low),
+    HX_NumericalType type(static_cast<double>(low),
                                 static_cast<double>(high), width, isSigned);
     for (long long v = -2 * size; v <= 2 * size; ++v) {
       const long long wrapped = ((v - low) % size + size) % size + low;
@@ -144,7 +144,7 @@ TEST(IntegerMathSupportTest, WrapOfUnusualTypes) {
               {"negative values count as high", int4, -9, 7},
               {"no bits", {0, 0, 0, true}, 5, 0},
               {"less than no bits", {0, 0, -3, true}, 5, 0}};
-  for (const auto& row : rows) {
+  for (auto row : rows) {
     EXPECT_EQ(IMS_ShrinkValueToBaseType(row.v, &row.type), row.wrapped)
         << row.why << ": " << row.v;
   }
