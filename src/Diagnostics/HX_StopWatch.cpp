@@ -1,12 +1,33 @@
+// Problem: stop() reports to every running registered watch. The plain form
+// walks the whole registry at each stop, though nearly all watches are idle.
+//
+// Idea: the running registered watches also form a doubly linked list without
+// order (s_pRunning). stop() walks the list alone: no report depends on the
+// order of the receivers.
+//
+// Example: A, B and C are registered, A and C run, the list is C - A.
+// C.stop() unlinks C, then reports to A. B is not visited.
+//
+// Invariants:
+//   1. A watch is linked exactly while registered and running
+//      (updateRunningList() restores this after each change of either).
+//   2. The registry holds no destroyed watch, and each watch at most once,
+//      under m_RegistryKey.
+//   3. m_SubWatchCalls and m_SubWatchTimes of a watch hold the same ids.
+//
+// StopWatchTest.RandomUseAccountsLikeThePlainForm compares with the plain form.
+
 #include "Diagnostics/HX_StopWatch.h"
 
-#include <algorithm>
 #include <cstring>
-#include <string>
+#include <new>
+#include <utility>
 
+#include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
 #include "Diagnostics/HX_TimingListener.h"
 #include "Diagnostics/implDiagnostics/HX_RawClock.h"
+#include "Diagnostics/implDiagnostics/HX_ReportText.h"
 #include "platform/os/HX_OsFile.h"
 
 namespace {
@@ -14,6 +35,7 @@ namespace {
 using hx_detail::wrapAdd;
 using hx_detail::wrapSubtract;
 
+constexpr char kSourceFile[] = "HX_StopWatch";  // of debug reports
 constexpr char kReportFile[] = "HX_StopWatch.html";
 
 constexpr char kReportHead[] =
@@ -34,7 +56,7 @@ constexpr char kReportTail[] =
     "</body>\n"
     "</html>\n";
 
-// The colours of even and odd rows by column; the last two are in reserve.
+// Colours of even and of odd rows, by column. The last two are not used yet.
 constexpr const char* kPalettes[2][7] = {
     {"80F080", "80E090", "80D0A0", "80C0B0", "80B0C0", "80A0D0", "8090E0"},
     {"B0F080", "B0E090", "B0D0A0", "B0C0B0", "B0B0C0", "B0A0D0", "B090E0"}};
@@ -44,19 +66,21 @@ std::int32_t wrapAdd32(std::int32_t a, std::int64_t b) {
                                    static_cast<std::uint32_t>(b));
 }
 
-// Adds to the entry of \p key, which starts at 0.
+// Enters \p id with 0 into both dictionaries; into neither without memory.
 template <class Dictionary>
-void addTo(Dictionary& entries, int key, std::int64_t value) {
-  if (auto entry = entries.lookup(key))
-    entries[entry] = wrapAdd32(entries[entry], value);
-  else
-    entries.insert(key, wrapAdd32(0, value));
+bool enterZeros(Dictionary& calls, Dictionary& times, int id) {
+  const bool isEntered = HX_WithinMemory([&] {
+    calls.insert(id, 0);
+    times.insert(id, 0);
+  });
+  if (!isEntered) calls.del(id);
+  return isEntered;
 }
 
 }  // namespace
 
-// The rows of the report, as they are built up. All functions are inline: the
-// library would export others with the class around this one.
+// The rows of the report so far. All functions are inline, because the library
+// exports every other function of an exported class.
 struct HX_StopWatch::Report {
   inline void addRow(const HX_StopWatch& watch);
   inline void addSubWatches(const HX_StopWatch& watch);
@@ -65,12 +89,14 @@ struct HX_StopWatch::Report {
         .append(kPalettes[rows % 2][column])
         .append(">");
   }
-  void addCell(int column, const std::string& content) {
+  void closeCell() { text += "</td>\n"; }
+  void addCell(int column, std::int64_t number) {
     openCell(column);
-    text.append(content).append("</td>\n");
+    hx_detail::appendNumber(text, number);
+    closeCell();
   }
 
-  std::string text = kReportHead;
+  HX_ReportText text = kReportHead;
   int rows = 0;
 };
 
@@ -80,9 +106,11 @@ bool HX_StopWatch::m_PerformanceCounter = false;
 bool HX_StopWatch::m_bInit = false;
 HX_StopWatch* HX_StopWatch::s_pRunning = nullptr;
 
-// Created by the first watch, so that it outlives every static watch.
+// Never destroyed: static objects of a host may own watches, and are destroyed
+// in any order.
 HX_StopWatch::Registry& HX_StopWatch::watches() {
-  static Registry s_watches;
+  alignas(Registry) static unsigned char s_place[sizeof(Registry)];
+  static Registry& s_watches = *new (s_place) Registry;
   return s_watches;
 }
 
@@ -92,37 +120,52 @@ HX_StopWatch::HX_StopWatch(const char* name) : m_Id(WatchIdCounter++) {
   if (length != 0) std::memcpy(m_Name, name, length);
   m_Name[length] = 0;
 
-  watches().insert(m_Id, this);
-  m_RegistryKey = m_Id;
+  if (HX_WithinMemory([&] { watches().insert(m_Id, this); }))
+    m_RegistryKey = m_Id;
   if (m_bInit) return;
   m_PerformanceCounter = hx_detail::queryFrequency(m_ProcessorFreq);
   m_bInit = true;
 }
 
-HX_StopWatch::HX_StopWatch(const HX_StopWatch& other) { assignFields(other); }
+HX_StopWatch::HX_StopWatch(const HX_StopWatch& other) {
+  assignPlainFields(other);
+  const bool isCopied = HX_WithinMemory([&] {
+    m_SubWatchCalls = other.m_SubWatchCalls;
+    m_SubWatchTimes = other.m_SubWatchTimes;
+  });
+  if (isCopied) return;
+  m_SubWatchCalls.clear();
+  m_SubWatchTimes.clear();
+}
 
 HX_StopWatch& HX_StopWatch::operator=(const HX_StopWatch& other) {
   if (this == &other) return *this;
-  assignFields(other);
+  PerSubWatch calls;
+  PerSubWatch times;
+  const bool isCopied = HX_WithinMemory([&] {
+    calls = other.m_SubWatchCalls;
+    times = other.m_SubWatchTimes;
+  });
+  if (!isCopied) return *this;
+  assignPlainFields(other);
+  m_SubWatchCalls = std::move(calls);
+  m_SubWatchTimes = std::move(times);
   updateRunningList();
   return *this;
 }
 
 HX_StopWatch::~HX_StopWatch() {
   unregister(m_Id);
-  // After an assignment the watch may still be registered under another id; no
-  // dead watch may stay behind.
+  // After an assignment the watch may be registered under another id.
   if (m_RegistryKey != kNotRegistered) unregister(m_RegistryKey);
 }
 
-void HX_StopWatch::assignFields(const HX_StopWatch& other) {
+void HX_StopWatch::assignPlainFields(const HX_StopWatch& other) {
   m_Id = other.m_Id;
   m_TotalTime = other.m_TotalTime;
   m_SubWatchTime = other.m_SubWatchTime;
   m_Calls = other.m_Calls;
   m_Start = other.m_Start;
-  m_SubWatchCalls = other.m_SubWatchCalls;
-  m_SubWatchTimes = other.m_SubWatchTimes;
   std::memcpy(m_Name, other.m_Name, sizeof m_Name);
 }
 
@@ -135,7 +178,7 @@ void HX_StopWatch::unregister(int key) {
   watch->updateRunningList();
 }
 
-// Called after every change of what decides about membership.
+// Restores invariant 1.
 void HX_StopWatch::updateRunningList() {
   const bool belongs = m_RegistryKey != kNotRegistered && isActive();
   if (belongs == m_IsLinked) return;
@@ -158,7 +201,7 @@ void HX_StopWatch::unlink() {
 
 void HX_StopWatch::start() {
   if (isActive()) {
-    HX_DebugCheck(false, "0");
+    HX_DebugCheck(false, "0", kSourceFile);
     return;
   }
   m_Start = hx_detail::rawTime(m_PerformanceCounter);
@@ -167,7 +210,7 @@ void HX_StopWatch::start() {
 
 void HX_StopWatch::stop() {
   if (!isActive()) {
-    HX_DebugCheck(false, "0");
+    HX_DebugCheck(false, "0", kSourceFile);
     return;
   }
   const std::int64_t now = hx_detail::rawTime(m_PerformanceCounter);
@@ -183,7 +226,8 @@ void HX_StopWatch::stop() {
   m_SubWatchTime = 0;
 }
 
-// Kept out of stop(), which is measured along with what it measures.
+// Not inlined: the code of stop() runs inside the measured intervals of the
+// surrounding watches.
 [[gnu::noinline]] void HX_StopWatch::tellListener(std::int64_t interval) const {
   HX_TimingListener::installed()->runEnded(
       m_Name,
@@ -194,7 +238,7 @@ void HX_StopWatch::stop() {
 
 [[gnu::noinline]] void HX_StopWatch::addIntervalToActiveWatches(
     std::int64_t time) {
-  // This watch has just stopped, so the list holds only others.
+  // By invariant 1 the list no longer holds this watch.
   for (HX_StopWatch* watch = s_pRunning; watch != nullptr;
        watch = watch->m_pNext)
     watch->addIntervalOfSubWatch(time, m_Id);
@@ -203,23 +247,30 @@ void HX_StopWatch::stop() {
 void HX_StopWatch::addIntervalOfSubWatch(std::int64_t time, int subWatchId) {
   if (!isActive()) return;
   m_SubWatchTime = wrapAdd(m_SubWatchTime, time);
-  addTo(m_SubWatchCalls, subWatchId, 1);
-  addTo(m_SubWatchTimes, subWatchId, time);
+  auto calls = m_SubWatchCalls.lookup(subWatchId);
+  if (!calls) {
+    if (!enterZeros(m_SubWatchCalls, m_SubWatchTimes, subWatchId)) return;
+    calls = m_SubWatchCalls.lookup(subWatchId);
+  }
+  const auto times = m_SubWatchTimes.lookup(subWatchId);
+  m_SubWatchCalls[calls] = wrapAdd32(m_SubWatchCalls[calls], 1);
+  m_SubWatchTimes[times] = wrapAdd32(m_SubWatchTimes[times], time);
 }
 
 void HX_StopWatch::endStopWatches() {
-  if (watches().empty()) return;
+  if (watches().empty() || !HX_WithinMemory(writeReport)) return;
   m_bInit = false;
+  terminate();
+  while (auto entry = watches().first_item()) unregister(watches().key(entry));
+}
 
+void HX_StopWatch::writeReport() {
   Report report;
   for (auto entry = watches().first_item(); entry;
        entry = watches().next_item(entry))
     report.addRow(*watches().inf(entry));
   report.text += kReportTail;
   HX_RewriteFile(kReportFile, report.text.data(), report.text.size());
-
-  terminate();
-  while (auto entry = watches().first_item()) unregister(watches().key(entry));
 }
 
 void HX_StopWatch::terminate() { WatchIdCounter = 0; }
@@ -231,14 +282,16 @@ void HX_StopWatch::Report::addRow(const HX_StopWatch& watch) {
     ownTime = wrapSubtract(ownTime, times.inf(entry));
 
   text += "<tr>\n";
-  addCell(0, watch.m_Name);
-  addCell(1, std::to_string(watch.m_Calls));
-  addCell(2, std::to_string(watch.m_TotalTime));
+  openCell(0);
+  text += watch.m_Name;
+  closeCell();
+  addCell(1, watch.m_Calls);
+  addCell(2, watch.m_TotalTime);
   openCell(3);
   text += "\n";
   addSubWatches(watch);
-  text += "</td>\n";
-  addCell(4, std::to_string(ownTime));
+  closeCell();
+  addCell(4, ownTime);
   ++rows;
 }
 
@@ -252,7 +305,9 @@ void HX_StopWatch::Report::addSubWatches(const HX_StopWatch& watch) {
     separator = "<BR>\n";
     if (const auto found = watches().lookup(id))
       text += watches().inf(found)->m_Name;
-    text.append(" / ").append(std::to_string(calls.inf(entry)));
-    text.append(" / ").append(std::to_string(times.inf(times.lookup(id))));
+    text += " / ";
+    hx_detail::appendNumber(text, calls.inf(entry));
+    text += " / ";
+    hx_detail::appendNumber(text, times.inf(times.lookup(id)));
   }
 }

@@ -1,12 +1,17 @@
 #include "Diagnostics/HX_StopWatch.h"
 
 #include <array>
+#include <chrono>
+#include <cstdio>
 #include <map>
 #include <memory>
 #include <random>
+#include <string_view>
+#include <thread>
 #include <utility>
 
 #include "Diagnostics/HX_FileFixture.h"
+#include "platform/messages/HX_MessageHandler.h"
 
 namespace {
 
@@ -194,6 +199,88 @@ TEST_F(StopWatchTest, RandomUseAccountsLikeThePlainForm) {
   }
   EXPECT_EQ(reports, std::vector<std::string>(misuses, "0"));
   EXPECT_THAT(messages(), testing::IsEmpty());
+}
+
+TEST_F(StopWatchTest, MisuseIsReportedWithTheSourceAndChangesNothing) {
+  std::vector<std::string> reports;
+  HX_MessageHandler& handler = HX_MessageHandler::instance();
+  handler.setShowInternalInfo(true);
+  handler.setDebugReport([&](const char* file, int line, const char* text) {
+    reports.push_back(std::string(file) + (line > 0 ? "_n " : "_0 ") + text);
+    return 0;
+  });
+  HX_StopWatch watch("");
+  watch.stop();
+  m_Clock.ticks = 1;
+  watch.start();
+  watch.start();
+  EXPECT_THAT(reports,
+              testing::ElementsAre("HX_StopWatch_n 0", "HX_StopWatch_n 0"));
+}
+
+// The real counter, with the standard clock around and inside the run.
+TEST_F(StopWatchTest, AMicrosecondIsAMicrosecondOfTheRealClock) {
+  using namespace std::chrono;
+  setFrequency(1);
+  HX_ClockSource::install(nullptr);
+  HX_StopWatch watch("");
+  const auto before = steady_clock::now();
+  watch.start();
+  const auto inside = steady_clock::now();
+  std::this_thread::sleep_for(milliseconds(20));
+  const auto shortest = steady_clock::now() - inside;
+  watch.stop();
+  const auto longest = steady_clock::now() - before;
+  EXPECT_GE(watch.getTotalTime() + 1,
+            duration_cast<microseconds>(shortest).count());
+  EXPECT_LE(watch.getTotalTime() - 1,
+            duration_cast<microseconds>(longest).count());
+}
+
+// Uses everything that asks for memory. Times are exact in any case.
+bool reportsTwoWatches() {
+  static const std::string s_Expected =
+      kHead +
+      "<tr>\n<td bgcolor=#80F080>outer</td>\n<td bgcolor=#80E090>1</td>\n"
+      "<td bgcolor=#80D0A0>30</td>\n<td bgcolor=#80C0B0>\n / 1 / 10</td>\n"
+      "<td bgcolor=#80B0C0>20</td>\n<tr>\n<td bgcolor=#B0F080>outer</td>\n"
+      "<td bgcolor=#B0E090>1</td>\n<td bgcolor=#B0D0A0>30</td>\n"
+      "<td bgcolor=#B0C0B0>\n / 1 / 10</td>\n<td bgcolor=#B0B0C0>20</td>\n"
+      "</table>\n</body>\n</html>\n";
+  auto& ticks =
+      static_cast<HX_ManualClock*>(HX_ClockSource::installed())->ticks;
+  HX_StopWatch outer("outer"), copied("copied");
+  {
+    HX_StopWatch inner("inner");
+    ticks = 1;
+    outer.start();
+    inner.start();
+    ticks = 11;
+    inner.stop();
+    ticks = 31;
+    outer.stop();
+  }
+  const HX_StopWatch copy(outer);
+  copied = copy;
+  const bool isKept = copied.getName() == std::string_view("copied");
+  if (outer.getTotalTime() + copy.getTotalTime() != 60) std::abort();
+  if (copied.getTotalTime() != (isKept ? 0 : 30)) std::abort();
+
+  HX_StopWatch::endStopWatches();
+  char text[2000];
+  std::FILE* file = std::fopen(kReport, "r");
+  if (file == nullptr) return false;
+  const std::size_t length = std::fread(text, 1, sizeof text, file);
+  std::fclose(file);
+  std::remove(kReport);
+  return std::string_view(text, length) == s_Expected;
+}
+
+TEST_F(StopWatchTest, MissingMemoryLosesRecordsButNoTimes) {
+  setFrequency(1'000'000);
+  ASSERT_TRUE(reportsTwoWatches());
+  HX_WithoutEachHeapBlock("watches", reportsTwoWatches);
+  HX_WithoutEachBlock("report", reportsTwoWatches);
 }
 
 }  // namespace
