@@ -1,3 +1,8 @@
+// Lines of run times, protocol entries and the model information have a known
+// greatest length: these texts stand in buffers on the stack, and the
+// operations cannot run out of memory. Only the table of results has a title
+// of any length.
+
 #include "Diagnostics/HxCDebugServer.h"
 
 #include <algorithm>
@@ -9,6 +14,7 @@
 
 #include "Diagnostics/HX_TimingListener.h"
 #include "Diagnostics/implDiagnostics/HX_RawClock.h"
+#include "Diagnostics/implDiagnostics/HX_ReportText.h"
 #include "SystemServices/HX_BuildNumber.h"
 #include "platform/matlab/HX_MexInterface.h"
 #include "platform/os/HX_OsFile.h"
@@ -20,11 +26,16 @@ constexpr char kLogFile[] = "HX_DebugLog.txt";
 constexpr char kProtocolFile[] = "HX_DebugProtocol.txt";
 
 constexpr std::size_t kMaxEntryLength = 1023;
-constexpr std::size_t kLineWidth = 40;        // of a run time, before its time
+constexpr int kLineWidth = 40;                // of a run time, before its time
 constexpr char kNoTime[] = "              ";  // as wide as the time of an END
 constexpr char kMissingEnd[] = "Missing END runtimes\n";
 constexpr char kInvalidEnd[] =
     "Invalid END runtime - no active START found with that name\n";
+
+constexpr char kClockHead[] =
+    "\nclocks--------------------------------------------------------------\n"
+    " Nr     Calls    TotalTime    MaxTime  AverageTime Name\n"
+    "--------------------------------------------------------------------\n";
 
 #define HX_MICROSECONDS "\xB5s"  // ISO-8859-1
 
@@ -43,8 +54,8 @@ void copyCut(char (&field)[size], const char* text) {
 }
 
 template <class... Args>
-void appendFormatted(std::string& text, const char* format, Args... args) {
-  char buffer[160];  // more than the longest of the numeric lines
+void appendFormatted(HX_ReportText& text, const char* format, Args... args) {
+  char buffer[160];  // more than the longest line of numbers
   std::snprintf(buffer, sizeof buffer, format, args...);
   text += buffer;
 }
@@ -53,18 +64,51 @@ void log(const char* text, std::size_t length) {
   HX_AppendToFile(kLogFile, text, length);
 }
 
-void logAndPrint(const std::string& text) {
-  log(text.data(), text.size());
-  mexPrintf("%s", text.c_str());
+void logAndPrint(const char* text) {
+  log(text, std::strlen(text));
+  // The command window of a host may run out of memory.
+  HX_WithinMemory([&] { mexPrintf("%s", text); });
 }
 
-// A run time's line without its time: indented, filled up or cut.
-std::string runTimeLine(int level, const char* keyword, const char* name) {
-  std::string line(static_cast<std::size_t>(level) * 2, ' ');
-  line += keyword;
-  line += name;
-  line.resize(kLineWidth, '.');
-  return line;
+// Logs and prints the line of a run time: indented, filled up with '.' or cut,
+// then \p time.
+void logRunTime(int level, const char* keyword, const char* name,
+                const char* time) {
+  char head[128];  // more than indentation, keyword and name
+  const int length =
+      std::snprintf(head, sizeof head, "%*s%s%s", level * 2, "", keyword, name);
+  char line[kLineWidth + 32];
+  std::memset(line, '.', kLineWidth);
+  std::memcpy(line, head,
+              static_cast<std::size_t>(std::min(length, kLineWidth)));
+  std::snprintf(line + kLineWidth, sizeof line - kLineWidth, "%s\n", time);
+  logAndPrint(line);
+}
+
+void addCounters(HX_ReportText& text, const std::int64_t* counters) {
+  text += "\ncounter-----------------------------------\n";
+  for (int i = 0; i < kDebugCounters; ++i)
+    appendFormatted(
+        text, "Counter %03d has %09" PRId64 " calls (%s)\n", i, counters[i],
+        HxCDebugElements::getCounterComment(static_cast<ScEDebugCounter>(i)));
+  text += "\n";
+}
+
+void addClock(HX_ReportText& text, int index, std::int64_t calls,
+              std::int64_t total, std::int64_t maximum) {
+  const double average =
+      calls == 0 ? 0.0
+                 : static_cast<double>(total) / static_cast<double>(calls);
+  // printf() would write the decimal point of the locale.
+  char digits[32] = "";
+  std::to_chars(digits, std::end(digits) - 1, average, std::chars_format::fixed,
+                3);
+  appendFormatted(
+      text,
+      "%3d %9" PRId64 " %10" PRId64 HX_MICROSECONDS " %8" PRId64 HX_MICROSECONDS
+      " %10s" HX_MICROSECONDS " %s\n",
+      index, calls, total, maximum, digits,
+      HxCDebugElements::getClockComment(static_cast<ScEDebugClock>(index)));
 }
 
 }  // namespace
@@ -134,9 +178,8 @@ void HxCDebugServer::runTimeStart(const char* name) {
   if (m_ActiveRunTimes >= kMaxRunTimes) return;
   HxCDebugRuntime& runTime = m_RunTimes[m_ActiveRunTimes];
   copyCut(runTime.name, orEmpty(name));
-  std::string line = runTimeLine(m_ActiveRunTimes, "START ", runTime.name);
   getCurrentTime(runTime.start, false);
-  logAndPrint(line.append(kNoTime).append("\n"));
+  logRunTime(m_ActiveRunTimes, "START ", runTime.name, kNoTime);
   ++m_ActiveRunTimes;
 }
 
@@ -150,13 +193,13 @@ void HxCDebugServer::runTimeEnd(const char* name) {
   m_ActiveRunTimes = level;
 
   const HxCDebugRuntime& runTime = m_RunTimes[level];
-  std::string line = runTimeLine(level, "END   ", runTime.name);
   std::int64_t duration = 0;
   getCurrentTime(duration, false);
   duration = hx_detail::wrapSubtract(duration, runTime.start);
   transformTimeIntoMicroSeconds(duration);
-  appendFormatted(line, " %10" PRId64 HX_MICROSECONDS " \n", duration);
-  logAndPrint(line);
+  char time[32];
+  std::snprintf(time, sizeof time, " %10" PRId64 HX_MICROSECONDS " ", duration);
+  logRunTime(level, "END   ", runTime.name, time);
   if (HX_TimingListener* listener = HX_TimingListener::installed())
     listener->runEnded(runTime.name,
                        hx_detail::rawTimeToMicroseconds(
@@ -164,7 +207,7 @@ void HxCDebugServer::runTimeEnd(const char* name) {
                        duration);
 }
 
-// The level of the innermost run time \p name, -1 if none is active.
+// Returns the level of the innermost run time \p name; -1 if none is active.
 int HxCDebugServer::findRunTime(const char* name) const {
   HxCDebugRuntime wanted;
   copyCut(wanted.name, name);
@@ -180,7 +223,7 @@ void HxCDebugServer::protocolEntry(char* format, ...) {
   va_start(args, format);
   const int length = std::vsnprintf(text, sizeof text, orEmpty(format), args);
   va_end(args);
-  if (length < 0) text[0] = 0;  // an argument that cannot be shown
+  if (length < 0) text[0] = 0;  // an argument without a printable form
 
   char line[sizeof text + 32];
   const int written = std::snprintf(line, sizeof line, "%09" PRId64 " %s\n",
@@ -193,50 +236,22 @@ std::int64_t HxCDebugServer::getCurrentProtocolIndex() {
 }
 
 void HxCDebugServer::printCurrentResults(const char* title) {
-  std::string text = "\n\nDebug-Results - ";
-  text += orEmpty(title);
-  text += "\n-----------------------------------\n";
-  addCounters(text);
-  addClocks(text);
-  log(text.data(), text.size());
-}
-
-void HxCDebugServer::addCounters(std::string& text) const {
-  text += "\ncounter-----------------------------------\n";
-  for (int i = 0; i < kDebugCounters; ++i)
-    appendFormatted(
-        text, "Counter %03d has %09" PRId64 " calls (%s)\n", i, m_Counters[i],
-        HxCDebugElements::getCounterComment(static_cast<ScEDebugCounter>(i)));
-  text += "\n";
-}
-
-void HxCDebugServer::addClocks(std::string& text) const {
-  text +=
-      "\nclocks--------------------------------------------------------------\n"
-      " Nr     Calls    TotalTime    MaxTime  AverageTime Name\n"
-      "--------------------------------------------------------------------\n";
-  for (int i = 0; i < kDebugClocks; ++i) {
-    const HxCDebugClock& clock = m_Clocks[i];
-    std::int64_t total = clock.total;
-    std::int64_t maximum = clock.maximum;
-    transformTimeIntoMicroSeconds(total);
-    transformTimeIntoMicroSeconds(maximum);
-    const double average =
-        clock.calls == 0
-            ? 0.0
-            : static_cast<double>(total) / static_cast<double>(clock.calls);
-    // Not printf(), which would write the decimal point of the locale.
-    char digits[32] = "";
-    std::to_chars(digits, std::end(digits) - 1, average,
-                  std::chars_format::fixed, 3);
-    appendFormatted(
-        text,
-        "%3d %9" PRId64 " %10" PRId64 HX_MICROSECONDS
-        " %8" PRId64 HX_MICROSECONDS " %10s" HX_MICROSECONDS " %s\n",
-        i, clock.calls, total, maximum, digits,
-        HxCDebugElements::getClockComment(static_cast<ScEDebugClock>(i)));
-  }
-  text += "\n\n";
+  HX_WithinMemory([&] {
+    HX_ReportText text = "\n\nDebug-Results - ";
+    text += orEmpty(title);
+    text += "\n-----------------------------------\n";
+    addCounters(text, m_Counters);
+    text += kClockHead;
+    for (int i = 0; i < kDebugClocks; ++i) {
+      std::int64_t total = m_Clocks[i].total;
+      std::int64_t maximum = m_Clocks[i].maximum;
+      transformTimeIntoMicroSeconds(total);
+      transformTimeIntoMicroSeconds(maximum);
+      addClock(text, i, m_Clocks[i].calls, total, maximum);
+    }
+    text += "\n\n";
+    log(text.data(), text.size());
+  });
 }
 
 void HxCDebugServer::setModelInfo(HX_BuildNumber* build, char* modelName) {
@@ -251,14 +266,14 @@ void HxCDebugServer::setModelInfo(HX_BuildNumber* build, char* modelName) {
 void HxCDebugServer::printModelInfo() {
   static constexpr char kRule[] =
       "====================================================\n";
-  std::string text = "\n\n";
-  text += kRule;
-  text.append("Model name: ").append(m_ModelName).append("\n");
-  text.append("Version:    ").append(m_Version).append("\n");
-  text.append("BuildTime:  ").append(m_BuildTime).append("\n");
-  text.append("BuildDate:  ").append(m_BuildDate).append("\n");
-  text += kRule;
-  log(text.data(), text.size());
+  char text[sizeof m_ModelName + sizeof m_Version + sizeof m_BuildTime +
+            sizeof m_BuildDate + 2 * sizeof kRule + 64];
+  const int length = std::snprintf(
+      text, sizeof text,
+      "\n\n%sModel name: %s\nVersion:    %s\nBuildTime:  %s\n"
+      "BuildDate:  %s\n%s",
+      kRule, m_ModelName, m_Version, m_BuildTime, m_BuildDate, kRule);
+  log(text, static_cast<std::size_t>(length));
 }
 
 void HxCDebugServer::getCurrentTime(std::int64_t& time,

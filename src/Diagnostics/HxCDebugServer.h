@@ -25,7 +25,6 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <string>
 
 #include "Control/HX_Allocated.h"
 #include "Diagnostics/HxCDebugElements.h"
@@ -33,19 +32,22 @@
 
 class HX_BuildNumber;
 
-/// The instance that was constructed last is the registered one. Not copied: a
-/// copy's destruction would unregister the original.
+/// The last constructed instance is the registered one. Not copied, because
+/// the destruction of a copy would unregister the original.
 ///
-/// Files are complete after each operation: it opens the file, writes and
-/// closes it. A file that cannot be opened is not reported and the text is
-/// lost. Values outside the enumerations are ignored, null texts count as
-/// empty, texts that exceed their limit are cut. No operation but boot() asks
+/// Each operation opens its file, writes and closes the file: between two
+/// operations the files are complete. If a file cannot be opened, the text is
+/// lost without a report. Values outside the enumerations are ignored, null
+/// texts count as empty, texts above their limit are cut. Only boot() asks
 /// whether the server is booted. Sums wrap around at 64 bits. One thread;
 /// nothing is locked.
+///
+/// MEMORY: nothing throws. Only printCurrentResults() needs memory, and writes
+/// nothing without.
 class HX_UTILS_API HxCDebugServer : public HX_Allocated {
  public:
-  /// Sums of one clock, in raw times: ticks of the high-resolution counter or,
-  /// where there is none, milliseconds of the process clock.
+  /// Sums of one clock, in raw times: ticks of the high-resolution counter; on
+  /// a machine without counter, milliseconds of the process clock.
   struct HxCDebugClock {
     std::int64_t total = 0;         ///< of all intervals that ended
     std::int64_t maximum = 0;       ///< the longest single interval
@@ -63,47 +65,46 @@ class HX_UTILS_API HxCDebugServer : public HX_Allocated {
   HxCDebugServer();
   HxCDebugServer(const HxCDebugServer&) = delete;
   HxCDebugServer& operator=(const HxCDebugServer&) = delete;
-  /// Leaves no instance registered, whichever it was.
+  /// Leaves no instance registered, not even another instance.
   ~HxCDebugServer();
 
-  /// The registered instance, null if there is none.
+  /// RETURNS: the registered instance, or null.
   static HxCDebugServer* getDebugServer() { return s_pDebugServer; }
 
   /// Chooses the clock, starts a new log, clears the counters and numbers the
   /// protocol from 1 again. Clocks and run times stay. Before the first boot()
-  /// the clock is the process clock; what runs across a change of the clock
-  /// gets a meaningless time. Nothing happens while the server is booted.
-  /// \return true
+  /// the clock is the process clock; an interval across a change of the clock
+  /// has a meaningless time. Does nothing while the server is booted.
+  /// RETURNS: true
   bool boot();
 
-  /// Allows the next boot(). Writes nothing. \return true
+  /// Allows the next boot(). Writes nothing. RETURNS: true
   bool shutdown();
 
   /// Adds 1.
   void count(ScEDebugCounter counter);
-  /// 0 for a value outside the enumeration.
+  /// RETURNS: the count; 0 for a value outside the enumeration.
   std::int64_t getCounter(ScEDebugCounter counter) const;
 
-  /// Starts and counts an interval; ignored while the clock is running. Where
-  /// the raw time is 0, the start is counted but the clock does not run.
+  /// Starts and counts an interval; ignored while the clock is running. At the
+  /// raw time 0 the start is counted, but the clock does not run.
   void clockStart(ScEDebugClock clock);
   /// Ends the interval; ignored while the clock is not running.
   void clockStop(ScEDebugClock clock);
   /// Clears the sums; a running clock stops uncounted.
   void clockReset(ScEDebugClock clock);
 
-  /// Begins a run time inside those that are active and logs and prints its
-  /// START line. The 11th nested one is ignored, its line included.
-  /// \param name  known by its first 63 characters, shown by what fits into 40
-  ///     columns
+  /// Begins a run time inside the active run times; logs and prints the START
+  /// line. The 11th nested run time is ignored and writes no line.
+  /// \param name  cut to 63 characters, in the line to 40 columns
   void runTimeStart(const char* name);
 
-  /// Ends the innermost run time \p name and logs and prints its END line with
-  /// the microseconds it took.
+  /// Ends the innermost run time \p name; logs and prints the END line with
+  /// the duration in microseconds.
   ///
-  /// Run times inside it that did not end are dropped after the line "Missing
-  /// END runtimes". Without an active run time of that name the line "Invalid
-  /// END runtime - no active START found with that name" is all that happens.
+  /// Inner run times without END are dropped after the line "Missing END
+  /// runtimes". Without an active run time \p name only the line "Invalid END
+  /// runtime - no active START found with that name" is written.
   void runTimeEnd(const char* name);
 
   /// Appends a numbered line to the protocol, which the server never empties.
@@ -114,21 +115,20 @@ class HX_UTILS_API HxCDebugServer : public HX_Allocated {
 #endif
       ;
 
-  /// The number of the registered instance's last protocol entry; 0 before its
-  /// first one and without an instance.
+  /// RETURNS: the number of the last protocol entry of the registered instance;
+  /// 0 before the first entry and without an instance.
   static std::int64_t getCurrentProtocolIndex();
 
   /// Appends a table of all counters and clocks to the log, under \p title.
-  /// Running intervals are not in it; nothing is changed.
+  /// Running intervals are not counted; counters and clocks stay.
   void printCurrentResults(const char* title);
 
   /// Takes over build time and date (each cut to 49 characters), long version
-  /// text (99) and model name (259). Texts that \p build does not define are
-  /// empty.
+  /// text (99) and model name (259). Texts missing in \p build are empty.
   void setModelInfo(HX_BuildNumber* build, char* modelName);
 
-  /// Appends what setModelInfo() took over to the log. The server never does so
-  /// by itself.
+  /// Appends the texts of setModelInfo() to the log. Only the host calls this
+  /// operation.
   void logModelInfo() { printModelInfo(); }
 
  private:
@@ -140,8 +140,6 @@ class HX_UTILS_API HxCDebugServer : public HX_Allocated {
   void transformTimeIntoMicroSeconds(std::int64_t& time) const;
 
   int findRunTime(const char* name) const;
-  void addCounters(std::string& text) const;
-  void addClocks(std::string& text) const;
 
   static HxCDebugServer* s_pDebugServer;
 

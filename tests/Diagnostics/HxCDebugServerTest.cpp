@@ -1,11 +1,12 @@
 #include "Diagnostics/HxCDebugServer.h"
 
-#include <clocale>
 #include <limits>
 
 #include "Diagnostics/HX_FileFixture.h"
 #include "SystemServices/HX_BuildNumber.h"
 #include "platform/matlab/HX_MatlabSession.h"
+#include "support/HX_ForeignLocale.h"
+#include "support/HX_HeapCount.h"
 
 namespace {
 
@@ -109,8 +110,6 @@ TEST_F(DebugServerTest, WhatCannotBeWrittenIsLostWithoutAReport) {
 }
 
 TEST_F(DebugServerTest, ResultsAreWrittenByteForByte) {
-  // A locale with a decimal comma must not show; skipped where none is there.
-  std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
   const auto interval = [&](ScEDebugClock clock, std::int64_t microseconds) {
     m_Server.clockStart(clock);
     m_Clock.ticks += 2 * microseconds;
@@ -139,8 +138,10 @@ TEST_F(DebugServerTest, ResultsAreWrittenByteForByte) {
     m_Server.clockReset(clock);
     EXPECT_STREQ(HxCDebugElements::getClockComment(clock), "");
   }
-  m_Server.printCurrentResults("50% done");
-  std::setlocale(LC_NUMERIC, "C");
+  {
+    const HX_ForeignLocale foreign;
+    m_Server.printCurrentResults("50% done");
+  }
 
   std::string expected =
       "\n\nDebug-Results - 50% done\n-----------------------------------\n"
@@ -207,6 +208,21 @@ TEST_F(DebugServerTest, ModelInformationIsCutToItsFields) {
                        "\nModel name: \nVersion:    \nBuildTime:  \n"
                        "BuildDate:  \n" +
                        rule + "\n");
+}
+
+TEST_F(DebugServerTest, MissingMemoryCostsOnlyTheTableOfResults) {
+  HX_CountingController controller;
+  controller.fail();
+  {
+    const HX_FailingHeap heap(0, true);
+    m_Server.runTimeStart("A");
+    m_Server.printCurrentResults("lost");
+    m_Server.runTimeEnd("A");
+    m_Server.protocolEntry(m_Entry, "");
+  }
+  EXPECT_EQ(log(), line("START A") + line("END   A", "0"));
+  EXPECT_EQ(content(kProtocol), "000000001 * \n");
+  EXPECT_EQ(controller.allocated(), 1) << "the table asks the controller";
 }
 
 TEST_F(DebugServerTest, LatestInstanceIsRegistered) {
