@@ -17,6 +17,10 @@ install(TARGETS hx_utils hx_platform EXPORT hx_utils-libraries
   FILE_SET HEADERS DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/hx_utils
     COMPONENT development)
 
+# The lists of reserved words, for every host of the library.
+install(DIRECTORY data/keywords
+  DESTINATION ${CMAKE_INSTALL_DATADIR}/hx_utils COMPONENT runtime)
+
 set(packageFolder ${CMAKE_INSTALL_LIBDIR}/cmake/hx_utils)
 install(EXPORT hx_utils-libraries NAMESPACE hx::
   DESTINATION ${packageFolder} COMPONENT development)

@@ -2,7 +2,7 @@
 // what becomes of its names.
 //
 //   HX_Document document("cruise_control.json", folder);
-//   HX_Model model(document, "host/keywords");
+//   HX_Model model(document, "data/keywords");
 //   for (HX_Name& name : model.names) form(name);
 //
 // While a model lives it is the one that the library sees: options, model

@@ -2,7 +2,7 @@
 // written.
 //
 //   HX_Profile profile("");
-//   HX_Generator generator(profile, "cruise_control.json", "host/keywords");
+//   HX_Generator generator(profile, "cruise_control.json", "data/keywords");
 //   generator.run(progress);
 //   HX_WriteTable(std::cout, generator.result);
 
