@@ -1,7 +1,5 @@
 #include "host/base/HX_Output.h"
 
-#include <unistd.h>
-
 #include <algorithm>
 #include <cerrno>
 #include <iterator>
@@ -11,17 +9,15 @@ namespace fs = std::filesystem;
 
 namespace {
 
-volatile std::sig_atomic_t s_Signal = 0;  // the last one that was held back
-
 void stopAfterSignal() {
-  if (s_Signal != 0) throw HX_OutputError("interrupted");
+  if (HX_DelayedSignals::isEndRequested()) throw HX_OutputError("interrupted");
 }
 
-// Of this process and, as several outputs may share a folder, in it.
+// Unique in the machine, and in the process: several outputs may share a
+// folder.
 std::string temporaryName() {
   static int s_Number = 0;
-  return ".hx_codegen-" + std::to_string(getpid()) + "-" +
-         std::to_string(++s_Number);
+  return ".hx_codegen-" + HX_ProcessNumber() + "-" + std::to_string(++s_Number);
 }
 
 [[noreturn]] void fail(const fs::path& path, const std::error_code& error,
@@ -44,22 +40,6 @@ bool haveSameContent(const fs::path& a, const fs::path& b) {
 }
 
 }  // namespace
-
-HX_Output::HeldSignals::HeldSignals() {
-  struct sigaction note = {};
-  note.sa_handler = [](int signal) { s_Signal = signal; };
-  for (const int signal : {SIGHUP, SIGINT, SIGTERM}) {
-    struct sigaction& before = m_Before[signal];
-    sigaction(signal, nullptr, &before);
-    if (before.sa_handler == SIG_DFL) sigaction(signal, &note, nullptr);
-  }
-}
-
-HX_Output::HeldSignals::~HeldSignals() {
-  for (const auto& [signal, before] : m_Before)
-    sigaction(signal, &before, nullptr);
-  if (s_Signal != 0) std::raise(s_Signal);
-}
 
 HX_Output::HX_Output(const fs::path& folder)
     : m_Folder(folder),
@@ -107,7 +87,7 @@ std::size_t HX_Output::finish() {
   return m_Changed.size();
 }
 
-// What was in the way is in m_Old then.
+// Afterwards m_Old has the file that was in the way.
 std::error_code HX_Output::replace(const std::string& name) {
   const fs::path path = m_Folder / name;
   std::error_code error;
@@ -120,7 +100,7 @@ std::error_code HX_Output::replace(const std::string& name) {
   return error;
 }
 
-// Undoes replace() as far as it came; what it has not placed is not removed.
+// Undoes replace(); a file that replace() did not place is not removed.
 void HX_Output::putBack(const std::string& name, bool isPlaced) {
   std::error_code error;
   if (fs::exists(m_Old / name, error)) {

@@ -58,7 +58,7 @@ void HX_Document::fail(const HX_Json& value,
                          ": expected " + expectation);
 }
 
-const HX_Json& HX_FieldOf(const HX_Json& node, const char* field) {
+const HX_Json& HX_FieldOrEmpty(const HX_Json& node, const char* field) {
   static const HX_Json none = HX_Json::object();
   const auto found = node.find(field);
   return found == node.end() ? none : *found;

@@ -1,7 +1,7 @@
 // A model document: JSON in the form that host/model.schema.json describes.
 //
 //   HX_Document document("cruise_control.json", folder);
-//   for (const HX_Json& name : HX_FieldOf(document.root, "names"))
+//   for (const HX_Json& name : HX_FieldOrEmpty(document.root, "names"))
 //     if (isTaken(name["id"])) document.fail(name["id"], "another id");
 //
 // What a schema cannot tell (ids that repeat or lead nowhere) is up to the
@@ -39,6 +39,6 @@ struct HX_Document {
 };
 
 /// A field of an object; an empty object if it is missing.
-const HX_Json& HX_FieldOf(const HX_Json& node, const char* field);
+const HX_Json& HX_FieldOrEmpty(const HX_Json& node, const char* field);
 
 #endif  // HOST_MODEL_HX_DOCUMENT_H

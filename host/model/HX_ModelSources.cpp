@@ -1,6 +1,6 @@
 // What names come from: blocks, charts and the data dictionary.
 #include "host/base/HX_Text.h"
-#include "host/model/HX_ModelParts.h"
+#include "host/model/HX_ModelReaders.h"
 #include "platform/datadictionary/HX_DdTree.h"
 #include "platform/model/HX_StateflowBlock.h"
 
@@ -29,7 +29,7 @@ class SourceReader {
     m_Ids.enter(node, block.getSrcRef());
     if (HX_StateflowBlock* chart = block.isStateflowBlock())
       readChart(node["chart"], *chart);
-    for (Json inner : HX_FieldOf(node, "blocks")) readBlock(inner, &block);
+    for (Json inner : HX_FieldOrEmpty(node, "blocks")) readBlock(inner, &block);
   }
 
   void readChart(Json node, HX_StateflowBlock& block) {
@@ -41,7 +41,7 @@ class SourceReader {
     state.setContainingBlock(&block);
     SC_ModelAccess::setChartState(&state, &state);
     block.setChartState(&state);
-    for (Json object : HX_FieldOf(node, "objects"))
+    for (Json object : HX_FieldOrEmpty(node, "objects"))
       readChartObject(object, state, path, block.getName());
   }
 
@@ -56,7 +56,7 @@ class SourceReader {
     object.setContainingBlock(chart.getContainingBlock());
     SC_ModelAccess::setChartState(&object, &chart);
     m_Ids.enter(node, object.getStateflowSrcRef());
-    for (Json inner : HX_FieldOf(node, "objects"))
+    for (Json inner : HX_FieldOrEmpty(node, "objects"))
       readChartObject(inner, chart, ownPath, hierarchy + "_" + name);
   }
 
@@ -94,7 +94,7 @@ class SourceReader {
           "/Pool/Autosar/SoftwareComponents/" + HX_Utf8ToLatin1(name);
       tree.add(path, HX_DdTree::kSoftwareComponent);
       const unsigned long related = tree.add(path + "/RelatedVariables");
-      for (Json entry : HX_FieldOf(*component, "related"))
+      for (Json entry : HX_FieldOrEmpty(*component, "related"))
         tree.addReference(related, HX_Utf8ToLatin1(entry["property"]),
                           HX_Utf8ToLatin1(entry["path"]));
     }
@@ -109,9 +109,9 @@ class SourceReader {
 
 void HX_ReadSources(const HX_Json& root, HX_Model& model, HX_SourceIds& ids) {
   SourceReader reader(model, ids);
-  for (Json block : HX_FieldOf(root, "blocks"))
+  for (Json block : HX_FieldOrEmpty(root, "blocks"))
     reader.readBlock(block, nullptr);
-  Json dictionary = HX_FieldOf(root, "dataDictionary");
-  reader.readDdObjects(HX_FieldOf(dictionary, "objects"));
-  reader.readComponents(HX_FieldOf(dictionary, "components"));
+  Json dictionary = HX_FieldOrEmpty(root, "dataDictionary");
+  reader.readDdObjects(HX_FieldOrEmpty(dictionary, "objects"));
+  reader.readComponents(HX_FieldOrEmpty(dictionary, "components"));
 }

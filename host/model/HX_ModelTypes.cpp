@@ -4,48 +4,57 @@
 #include <set>
 
 #include "host/base/HX_Text.h"
-#include "host/model/HX_ModelParts.h"
+#include "host/model/HX_ModelReaders.h"
 
 namespace {
 
-// The arithmetic types of C as two's complement machines have them.
-const std::map<std::string, HX_NumericalType> kCTypes = {
-    {"signed char", {-128, 127, 8, true}},
-    {"unsigned char", {0, 255, 8, false}},
-    {"short", {-32768, 32767, 16, true}},
-    {"unsigned short", {0, 65535, 16, false}},
-    {"int", {-2147483648.0, 2147483647, 32, true}},
-    {"unsigned int", {0, 4294967295.0, 32, false}},
-    {"float", {-FLT_MAX, FLT_MAX, 32, true}},
-    {"double", {-DBL_MAX, DBL_MAX, 64, true}},
+// Ranges of the arithmetic types on two's complement machines.
+const std::map<HX_CType, HX_NumericalType> kCTypeRanges = {
+    {HX_CType::eSignedChar, {-128, 127, 8, true}},
+    {HX_CType::eUnsignedChar, {0, 255, 8, false}},
+    {HX_CType::eShort, {-32768, 32767, 16, true}},
+    {HX_CType::eUnsignedShort, {0, 65535, 16, false}},
+    {HX_CType::eInt, {-2147483648.0, 2147483647, 32, true}},
+    {HX_CType::eUnsignedInt, {0, 4294967295.0, 32, false}},
+    {HX_CType::eFloat, {-FLT_MAX, FLT_MAX, 32, true}},
+    {HX_CType::eDouble, {-DBL_MAX, DBL_MAX, 64, true}},
 };
 
-// What the library is told of a type depends on its kind.
+// Tells the library the properties that follow from the kind.
 void completeKind(const HX_Json& node, HX_TypeItem& item) {
   HX_DataType& type = item.type;
   HX_DataType* of = item.of != nullptr ? &item.of->type : nullptr;
-  if (item.kind == "base") {
-    type.setBase();
-    item.numerical = kCTypes.at(item.cType);
-  } else if (item.kind == "derived") {
-    type.setDerivedFrom(of);
-  } else if (item.kind == "numerical") {
-    type.setOrigin(of).setUnderlyingType(of);
-  } else if (item.kind == "array") {
-    type.setElement(of);
-  } else if (item.kind == "struct") {
-    type.setUnnamed(HX_DataType::eUnnamedStruct, !item.isNameless);
-  } else if (item.kind == "enum") {
-    type.setUnnamed(HX_DataType::eUnnamedEnum, !item.isNameless);
-  } else if (item.kind == "bitField") {
-    type.setBitfield();
-    item.numerical.emplace(0, std::ldexp(1, item.bits) - 1, item.bits, false);
-  } else if (node.value("signed", true)) {
-    type.set64BitInteger();
-    item.numerical.emplace(-0x1p63, 0x1p63, 64, true);
-  } else {
-    type.set64BitInteger();
-    item.numerical.emplace(0, 0x1p64, 64, false);
+  switch (item.kind) {
+    case HX_TypeKind::eBase:
+      type.setBase();
+      item.numerical = kCTypeRanges.at(*item.cType);
+      break;
+    case HX_TypeKind::eDerived:
+      type.setDerivedFrom(of);
+      break;
+    case HX_TypeKind::eNumerical:
+      type.setOrigin(of).setUnderlyingType(of);
+      break;
+    case HX_TypeKind::eArray:
+      type.setElement(of);
+      break;
+    case HX_TypeKind::eStruct:
+      type.setUnnamed(HX_DataType::eUnnamedStruct, !item.isNameless);
+      break;
+    case HX_TypeKind::eEnum:
+      type.setUnnamed(HX_DataType::eUnnamedEnum, !item.isNameless);
+      break;
+    case HX_TypeKind::eBitField:
+      type.setBitfield();
+      item.numerical.emplace(0, std::ldexp(1, item.bits) - 1, item.bits, false);
+      break;
+    case HX_TypeKind::eInteger64:
+      type.set64BitInteger();
+      if (node.value("signed", true))
+        item.numerical.emplace(-0x1p63, 0x1p63, 64, true);
+      else
+        item.numerical.emplace(0, 0x1p64, 64, false);
+      break;
   }
 }
 
@@ -57,8 +66,11 @@ class TypeReader {
     HX_TypeItem& item = m_Model.types.emplace_back(HX_FromUtf8(node["name"]));
     item.id = node["id"];
     item.name = node["name"];
-    item.kind = node["kind"];
-    item.cType = node.value("c", "");
+    item.kind =
+        HX_ValueOf(kHxTypeKinds, node["kind"].get_ref<const std::string&>());
+    if (node.contains("c"))
+      item.cType =
+          HX_ValueOf(kHxCTypes, node["c"].get_ref<const std::string&>());
     item.bits = node.value("bits", 0);
     item.length = node.value("length", 0);
     item.isNameless = node.value("nameless", false);
@@ -69,20 +81,20 @@ class TypeReader {
 
   // A type may stand on a later one.
   void complete(const HX_Json& node, HX_TypeItem& item) {
-    if (node.contains("of")) item.of = HX_FindNamedType(m_Ids, node["of"]);
-    if (item.kind == "derived" &&
+    if (node.contains("of")) item.of = HX_FindDeclarableType(m_Ids, node["of"]);
+    if (item.kind == HX_TypeKind::eDerived &&
         item.of->type.getBaseTypeProperties() == nullptr)
       m_Ids.document.fail(node["of"], "the id of a type with a cut");
     completeKind(node, item);
-    for (const HX_Json& field : HX_FieldOf(node, "fields")) {
+    for (const HX_Json& field : HX_FieldOrEmpty(node, "fields")) {
       HX_TypeItem* type = m_Ids.find(field["type"]);
-      if (type->kind != "bitField")
-        type = HX_FindNamedType(m_Ids, field["type"]);
-      item.fields.emplace_back(field["name"], type);
+      if (type->kind != HX_TypeKind::eBitField)
+        type = HX_FindDeclarableType(m_Ids, field["type"]);
+      item.fields.push_back({field["name"], type});
     }
-    for (const HX_Json& value : HX_FieldOf(node, "values")) {
+    for (const HX_Json& value : HX_FieldOrEmpty(node, "values")) {
       takeCodeName(value["name"]);
-      item.values.emplace_back(value["name"], value["value"].get<int>());
+      item.values.push_back({value["name"], value["value"]});
     }
   }
 
@@ -103,18 +115,18 @@ class TypeReader {
 
 const HX_TypeItem* HX_TypeItem::scalar() const {
   const HX_TypeItem* item = this;
-  const HX_TypeItem* late = this;  // walks at half the speed
-  for (bool isLateDue = false; item->of != nullptr; isLateDue = !isLateDue) {
+  const HX_TypeItem* slow = this;  // one step for two steps of item
+  for (bool isSlowDue = false; item->of != nullptr; isSlowDue = !isSlowDue) {
     item = item->of;
-    if (isLateDue) late = late->of;
-    if (item == late) return nullptr;
+    if (isSlowDue) slow = slow->of;
+    if (item == slow) return nullptr;
   }
   return item;
 }
 
-HX_TypeItem* HX_FindNamedType(const HX_TypeIds& ids, const HX_Json& id) {
+HX_TypeItem* HX_FindDeclarableType(const HX_TypeIds& ids, const HX_Json& id) {
   HX_TypeItem* type = ids.find(id);
-  if (type->isNameless || type->kind == "bitField")
+  if (type->isNameless || type->kind == HX_TypeKind::eBitField)
     ids.document.fail(id, "the id of a type with a name, no bit field");
   return type;
 }
@@ -125,13 +137,14 @@ void HX_ReadTypes(const HX_Json& types, HX_Model& model, HX_TypeIds& ids) {
   std::size_t index = 0;
   for (const HX_Json& node : types) reader.complete(node, model.types[index++]);
 
-  HX_TypeItem* bitFieldBase = nullptr;  // that with the least id
+  HX_TypeItem* bitFieldBase = nullptr;  // least id
   for (HX_TypeItem& item : model.types) {
-    const bool isBase = item.cType == "unsigned int";
+    const bool isBase = item.cType == HX_CType::eUnsignedInt;
     if (isBase && (bitFieldBase == nullptr || item.id < bitFieldBase->id))
       bitFieldBase = &item;
     const HX_TypeItem* scalar = item.scalar();
-    if (scalar == nullptr || !scalar->numerical || item.kind == "array")
+    if (scalar == nullptr || !scalar->numerical ||
+        item.kind == HX_TypeKind::eArray)
       continue;
     item.type.setNumerical(const_cast<HX_NumericalType*>(&*scalar->numerical));
   }

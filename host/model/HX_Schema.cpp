@@ -103,7 +103,7 @@ bool fits(Json value, Json schema) {
 }
 
 void checkObject(Json object, Json schema) {
-  Json properties = HX_FieldOf(schema, "properties");
+  Json properties = HX_FieldOrEmpty(schema, "properties");
   for (auto it = object.begin(); it != object.end(); ++it) {
     const auto property = properties.find(it.key());
     if (property != properties.end()) {
@@ -114,11 +114,11 @@ void checkObject(Json object, Json schema) {
       throw Misfit{*it, "one of the fields " + shown(keys)};
     }
   }
-  for (Json field : HX_FieldOf(schema, "required")) {
+  for (Json field : HX_FieldOrEmpty(schema, "required")) {
     if (!object.contains(field))
       throw Misfit{object, "a field " + field.dump()};
   }
-  for (Json rule : HX_FieldOf(schema, "allOf")) {
+  for (Json rule : HX_FieldOrEmpty(schema, "allOf")) {
     if (fits(object, rule["if"])) check(object, rule["then"]);
   }
 }
@@ -139,7 +139,7 @@ void check(Json value, Json schema) {
   }
   if (value.is_object()) checkObject(value, schema);
   if (!value.is_array()) return;
-  for (Json element : value) check(element, HX_FieldOf(schema, "items"));
+  for (Json element : value) check(element, HX_FieldOrEmpty(schema, "items"));
 }
 
 }  // namespace

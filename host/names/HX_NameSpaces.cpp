@@ -1,21 +1,14 @@
 #include "host/names/HX_NameSpaces.h"
 
-#include "platform/messages/HX_MessageHandler.h"
-
-namespace {
-
-// Messages 408 to 410 report a reserved word of one of these kinds.
-constexpr int kFirstMessage = 408;
-constexpr const char* kWordKinds[] = {"keyword", "base type name", "type name"};
-
-}  // namespace
+#include "host/base/HX_Text.h"
 
 HX_NameSpaces::HX_NameSpaces(const HX_Model& model,
                              const std::vector<const HX_TypeItem*>& types) {
   m_Ids.boot();
   for (const HX_ScopeItem& item : model.scopes) {
     Space& space = m_Spaces.try_emplace(&item, &m_Ids).first->second;
-    if (item.kind == "file") space.scoped.setScope(m_File.newEnv());
+    if (item.kind == HX_ScopeKind::eFile)
+      space.scoped.setScope(m_File.newEnv());
     if (item.parent != nullptr)
       space.scoped.newScope(m_Spaces.at(item.parent).scoped.getScope());
   }
@@ -31,15 +24,15 @@ HX_NameSpaces::~HX_NameSpaces() {
   m_Ids.shutdown();
 }
 
-// The names of types are not formed but given; each is checked before it
-// becomes a reserved word itself.
+// Names of types are given, not formed. Each name is checked before the name
+// becomes a reserved word.
 void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
   for (const HX_TypeItem* type : types) {
-    for (const auto& [field, fieldType] : type->fields)
-      m_Names.isStringValidCVariableName(field.c_str());
-    for (const auto& [constant, value] : type->values) {
-      m_Names.isStringValidCVariableName(constant.c_str());
-      m_File.defineString(constant.c_str());
+    for (const HX_TypeItem::Field& field : type->fields)
+      m_Names.isStringValidCVariableName(field.name.c_str());
+    for (const HX_TypeItem::Constant& constant : type->values) {
+      m_Names.isStringValidCVariableName(constant.name.c_str());
+      m_File.defineString(constant.name.c_str());
     }
     if (!type->isNameless)
       m_Names.isStringValidCVariableName(type->name.c_str());
@@ -47,20 +40,22 @@ void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
   for (const HX_TypeItem* type : types) {
     if (!type->isNameless)
       m_Names.addToKeywordDict(type->name.c_str(),
-                               type->kind == "base"
+                               type->kind == HX_TypeKind::eBase
                                    ? HxCNames::eDictBaseTypeName
                                    : HxCNames::eDictUserTypeName);
   }
 }
 
-std::string HX_NameSpaces::define(HX_Name& name, KyCXString& text,
-                                  bool changeable) {
+HX_Change HX_NameSpaces::define(const HX_WantedName& name, KyCXString& text,
+                                bool changeable) {
   Space& space = m_Spaces.at(name.scope);
-  std::string conflict = conflictOf(space, text);
-  name.isDefined = conflict.empty() || changeable;
-  if (!name.isDefined) return conflict;
-
-  if (!conflict.empty()) deriveFreeName(space, text);
+  const HX_Change conflict = conflictOf(space, text);
+  const bool isFree = conflict.reason == HX_Change::eNone;
+  if (!isFree && !changeable) {
+    if (isReported(conflict)) m_Names.isStringValidCVariableName(text);
+    return conflict;
+  }
+  if (!isFree) deriveFreeName(space, text);
   if (space.scoped.getScope() == nullptr) {
     space.flat.add(text);
     space.owners.emplace(text.cstring(), &name);
@@ -74,41 +69,52 @@ std::string HX_NameSpaces::define(HX_Name& name, KyCXString& text,
   return conflict;
 }
 
-// Empty for a free name. The library reports reserved words and nothing else.
-std::string HX_NameSpaces::conflictOf(Space& space, const KyCXString& text) {
-  const auto& messages = HX_MessageHandler::instance().messages();
-  const std::size_t before = messages.size();
-  m_Names.isStringValidCVariableName(text);
-  if (messages.size() > before)
-    return kWordKinds[messages.back().row - kFirstMessage];
+bool HX_NameSpaces::isReported(const HX_Change& conflict) {
+  return conflict.reason == HX_Change::eKeyword ||
+         conflict.reason == HX_Change::eBaseType ||
+         conflict.reason == HX_Change::eType;
+}
 
-  const HX_Name* owner = nullptr;
+HX_Change HX_NameSpaces::conflictOf(Space& space, const KyCXString& text) {
+  const HX_Change::HxEReasonTag reserved = reservedAs(text);
+  if (reserved != HX_Change::eNone) return {reserved};
   if (space.scoped.getScope() == nullptr) {
     const auto found = space.owners.find(text.cstring());
     if (found == space.owners.end()) return {};
-    owner = found->second;
-  } else {
-    if (!space.scoped.stringInEnv(text)) return {};
-    HxCSymbol* symbol = nullptr;
-    if (!space.scoped.stringInEnv(text, symbol)) return "taken by a constant";
-    owner = static_cast<Symbol*>(symbol)->owner;
+    return {HX_Change::eTakenByName, found->second};
   }
-  return "taken by '" + owner->id + "'";
+  if (!space.scoped.stringInEnv(text)) return {};
+  HxCSymbol* symbol = nullptr;
+  if (!space.scoped.stringInEnv(text, symbol))
+    return {HX_Change::eTakenByConstant};
+  return {HX_Change::eTakenByName, static_cast<Symbol*>(symbol)->owner};
 }
 
-// A flat set derives variants by itself; scopes say only whether one is free.
-// What was reported about reserved words has no object any more.
+HX_Change::HxEReasonTag HX_NameSpaces::reservedAs(const KyCXString& text) {
+  constexpr int kFirstMessage = 17056;  // the next two have the next numbers
+  constexpr HX_Change::HxEReasonTag kReasons[] = {
+      HX_Change::eKeyword, HX_Change::eBaseType, HX_Change::eType};
+  std::vector<HX_Finding> reported;
+  {
+    const HX_MessageCollector collector(reported);
+    m_Names.isStringValidCVariableName(text);
+  }
+  if (reported.empty()) return HX_Change::eNone;
+  return kReasons[reported[0].id - kFirstMessage];
+}
+
+// A flat set derives variants on its own. Scopes only tell whether a variant is
+// free.
 void HX_NameSpaces::deriveFreeName(Space& space, KyCXString& text) {
   KyCXString base = text;
   int& suffix = space.nextSuffix[base.cstring()];
   do {
     text = base;
     if (space.scoped.getScope() == nullptr) {
-      space.flat.add(base);  // a reserved word is not there yet
+      space.flat.add(base);  // absent so far if the text is a reserved word
       space.flat.addUnique(text);
     } else {
       m_Names.appendSuffix(text, suffix++);
     }
-  } while (!conflictOf(space, text).empty());
-  HX_MessageHandler::instance().clear();
+  } while (conflictOf(space, text).reason != HX_Change::eNone);
 }

@@ -7,29 +7,28 @@
 #include "DependencySorting/HxCDepSortComp.h"
 #include "DependencySorting/HxCDepSortNode.h"
 #include "DependencySorting/HxCDependencySorting.h"
-#include "host/base/HX_Text.h"
 
 namespace {
 
-/// What both kinds of nodes have.
+/// The common part of both kinds of nodes.
 class Node : public HxCDepSortNode {
  public:
-  Node(const std::string& name, const std::string& id, const HX_TypeItem& type)
-      : m_Name(HX_FromUtf8(name)), m_Id(id) {
+  Node(const KyCXString& name, const std::string& id, const HX_TypeItem& type)
+      : m_Name(name), m_Id(id) {
     const HX_TypeItem* scalar = type.scalar();
     if (scalar != nullptr && scalar->numerical)
       m_Width = scalar->numerical->getBitWidth();
   }
   const KyCXString& getName() override { return m_Name; }
   int width() const { return m_Width; }
-  /// Names repeat in scopes beside each other, ids do not.
+  /// Ids decide between equal names of different scopes.
   int compareNames(const Node& other) const {
     const int order = leda::compare(m_Name, other.m_Name);
     return order != 0 ? order : m_Id.compare(other.m_Id);
   }
 
  private:
-  KyCXString m_Name;
+  const KyCXString& m_Name;
   const std::string& m_Id;
   int m_Width = 0;  // bits
 };
@@ -48,21 +47,21 @@ struct ByName : HxCDepSortComp {
 
 }  // namespace
 
-// The library tells the two apart in what it reports.
+// The library tells types from variables in message 403.
 class HxCSdtNode : public Node {
  public:
   explicit HxCSdtNode(const HX_TypeItem& type)
-      : Node(type.name, type.id, type), item(type) {}
+      : Node(type.type.getNameInCode(), type.id, type), item(type) {}
   HxCSdtNode* isSdtNode() override { return this; }
   const HX_TypeItem& item;
 };
 
 class HxCSsNode : public Node {
  public:
-  explicit HxCSsNode(const HX_Name& name)
-      : Node(name.actual, name.id, *name.type), item(name) {}
+  explicit HxCSsNode(const HX_FormedName& name)
+      : Node(name.actual, name.wanted->id, *name.wanted->type), item(name) {}
   HxCSsNode* isSsNode() override { return this; }
-  const HX_Name& item;
+  const HX_FormedName& item;
 };
 
 namespace {
@@ -76,7 +75,7 @@ std::vector<const Item*> order(const std::vector<const Item*>& items,
   byName.reserve(items.size());
   for (const Item* item : items)
     byName.push_back(nodeOf[item] = &nodes.emplace_back(*item));
-  // Ties fall the same way whatever the order of the document.
+  // The order of the document does not decide between equal nodes.
   std::sort(byName.begin(), byName.end(),
             [](NodeType* a, NodeType* b) { return a->compareNames(*b) < 0; });
 
@@ -110,18 +109,28 @@ std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model) {
   for (const HX_TypeItem& type : model.types) types.push_back(&type);
   return order<HxCSdtNode>(types, [](const HX_TypeItem& type) {
     std::vector<const HX_TypeItem*> before{type.of};
-    for (const auto& [name, field] : type.fields) before.push_back(field);
+    for (const HX_TypeItem::Field& field : type.fields)
+      before.push_back(field.type);
     return before;
   });
 }
 
-std::vector<const HX_Name*> HX_OrderVariables(const HX_Model& model) {
-  std::vector<const HX_Name*> variables;
-  for (const HX_Name& name : model.names) {
-    if (name.kind == "variable" && name.isDefined) variables.push_back(&name);
+std::vector<const HX_FormedName*> HX_OrderVariables(
+    const std::deque<HX_FormedName>& names) {
+  std::vector<const HX_FormedName*> variables;
+  std::unordered_map<const HX_WantedName*, const HX_FormedName*> formedOf;
+  for (const HX_FormedName& name : names) {
+    if (name.wanted->kind != HX_NameKind::eVariable || !name.isDefined)
+      continue;
+    variables.push_back(&name);
+    formedOf.emplace(name.wanted, &name);
   }
-  return order<HxCSsNode>(
-      variables, [](const HX_Name& name) -> const std::vector<const HX_Name*>& {
-        return name.dependsOn;
-      });
+  return order<HxCSsNode>(variables, [&](const HX_FormedName& name) {
+    std::vector<const HX_FormedName*> before;
+    for (const HX_WantedName* wanted : name.wanted->dependsOn) {
+      const auto found = formedOf.find(wanted);
+      if (found != formedOf.end()) before.push_back(found->second);
+    }
+    return before;
+  });
 }

@@ -1,24 +1,25 @@
-// Orders data types and variables so that each comes after those it depends
-// on.
+// Orders data types and variables: definitions before their uses.
 //
 //   std::vector<const HX_TypeItem*> types = HX_OrderTypes(model);
 
 #ifndef HOST_NAMES_HX_ORDERING_H
 #define HOST_NAMES_HX_ORDERING_H
 
+#include <deque>
 #include <vector>
 
 #include "host/model/HX_Model.h"
+#include "host/names/HX_FormedName.h"
 
-/// A type depends on its element type, the type it is derived from and the
-/// types of its fields; a variable on those that the document names. What
-/// depends on nothing and nothing depends on comes last: the widest first, the
-/// same width by name. The order does not depend on that of the document.
+/// A type depends on the element type, the type under a derived type, and the
+/// types of fields; a variable depends on the variables in `dependsOn`. Items
+/// without any dependency come last: the widest first, equal widths by name.
+/// The order of the document has no influence.
 ///
-/// A cycle is reported to the message handler (message 403); the result is then
-/// empty.
+/// The library reports a cycle (message 403); the result is then empty.
 std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model);
-/// The variables that are defined.
-std::vector<const HX_Name*> HX_OrderVariables(const HX_Model& model);
+/// The defined variables among \p names.
+std::vector<const HX_FormedName*> HX_OrderVariables(
+    const std::deque<HX_FormedName>& names);
 
 #endif  // HOST_NAMES_HX_ORDERING_H

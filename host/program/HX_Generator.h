@@ -1,5 +1,4 @@
-// One run over a model: everything between a document and what is printed or
-// written.
+// One run over a model, from the document to the result.
 //
 //   HX_Profile profile("");
 //   HX_Generator generator(profile, "cruise_control.json", "data/keywords");
@@ -13,27 +12,31 @@
 #include <string>
 
 #include "host/base/HX_Output.h"
+#include "host/model/HX_Model.h"
+#include "host/names/HX_FormedName.h"
+#include "host/names/HX_NameForming.h"
+#include "host/names/HX_NameSpaces.h"
 #include "host/program/HX_Profile.h"
-#include "host/write/HX_NameReport.h"
 
 struct HX_Generator {
   /// Throws HX_DocumentError. Paths count from the start of \p profile.
   HX_Generator(HX_Profile& profile, const std::string& document,
                const std::string& keywordFolder);
 
-  /// Orders types, forms names, orders variables. After a cycle among the types
-  /// no names are formed.
-  void run(const HX_NameRun::Progress& progress);
+  /// Orders types, forms names, orders variables. A circle of types ends the
+  /// run without names.
+  void run(const HX_NameForming::Progress& progress);
 
-  /// Writes the C code and the name map, the latter by id.
-  /// \return the number of files that change when \p output is committed
+  /// Writes the C code, and the name map by id.
+  /// \return the number of files that the commit of \p output changes
   std::size_t write(HX_Output& output);
 
   HX_Profile& profile;
-  std::optional<HX_Model> model;
-  HX_RunResult result;  // names are in the order of the document
+  HX_RunResult result;
+  const HX_MessageCollector collector{result.findings};
+  std::optional<const HX_Model> model;
   std::optional<HX_NameSpaces> spaces;
-  std::optional<HX_NameRun> nameRun;
+  std::optional<HX_NameForming> forming;
 };
 
 #endif  // HOST_PROGRAM_HX_GENERATOR_H

@@ -11,8 +11,6 @@
 
 namespace {
 
-constexpr int kWarning = 1;
-
 // A comment must not end early, nor upset a compiler.
 std::string commentText(const std::string& text) {
   std::string safe;
@@ -26,10 +24,10 @@ std::string commentText(const std::string& text) {
   return safe;
 }
 
-std::string comment(const HX_Name& name) {
+std::string comment(const HX_FormedName& name) {
+  const std::string path = name.sourcePath();
   return "/* " +
-         commentText(name.sourcePath.empty() ? "name '" + name.id + "'"
-                                             : name.sourcePath) +
+         commentText(path.empty() ? "name '" + name.wanted->id + "'" : path) +
          " */\n";
 }
 
@@ -47,7 +45,7 @@ std::string guardOf(const std::string& fileName) {
   return guard;
 }
 
-// The shortest decimal that gives the value back, in any locale.
+// The shortest decimal with exactly this value, in any locale.
 template <class Float>
 std::string floatText(Float value, const char* suffix) {
   char text[64];
@@ -57,7 +55,7 @@ std::string floatText(Float value, const char* suffix) {
   return number + suffix;
 }
 
-// The smallest integer has no literal of its own in C.
+// C has no literal for the smallest integer.
 std::string signedText(std::int64_t value) {
   if (value == INT32_MIN) return "(-2147483647 - 1)";
   return std::to_string(value);
@@ -72,7 +70,7 @@ std::string wordsText(std::uint64_t bits, bool isSigned) {
          "}";
 }
 
-// A double of up to 2^64; 2^64 itself comes as the largest integer below.
+// Of doubles up to 2^64; 2^64 itself gives the largest integer below.
 std::uint64_t bitsOf64(double value, bool isSigned) {
   if (isSigned || value < 9223372036854775808.0)
     return static_cast<std::uint64_t>(FPS_SatCastToInt64(value));
@@ -80,30 +78,47 @@ std::uint64_t bitsOf64(double value, bool isSigned) {
                                          : static_cast<std::uint64_t>(value);
 }
 
+std::string structBody(const HX_TypeItem& type) {
+  std::string fields;
+  for (const auto& [name, field] : type.fields)
+    fields += field->kind == HX_TypeKind::eBitField
+                  ? "  unsigned int " + name + " : " +
+                        std::to_string(field->bits) + ";\n"
+                  : "  " + field->name + " " + name + ";\n";
+  return "struct {\n" + fields + "}";
+}
+
+std::string enumBody(const HX_TypeItem& type) {
+  std::string values;
+  for (const auto& [name, value] : type.values)
+    values += (values.empty() ? "  " : ",\n  ") + name + " = " +
+              std::to_string(value);
+  return "enum {\n" + values + "\n}";
+}
+
+// The definition of a type without the name.
 std::string typeBody(const HX_TypeItem& type) {
-  if (type.kind == "struct") {
-    std::string fields;
-    for (const auto& [name, field] : type.fields)
-      fields += field->kind == "bitField"
-                    ? "  unsigned int " + name + " : " +
-                          std::to_string(field->bits) + ";\n"
-                    : "  " + field->name + " " + name + ";\n";
-    return "struct {\n" + fields + "} " + type.name;
+  switch (type.kind) {
+    case HX_TypeKind::eStruct:
+      return structBody(type);
+    case HX_TypeKind::eEnum:
+      return enumBody(type);
+    case HX_TypeKind::eInteger64:
+      return std::string("struct {\n  unsigned int low;\n  ") +
+             (type.numerical->isSigned() ? "int" : "unsigned int") +
+             " high;\n}";
+    case HX_TypeKind::eBase:
+      return std::string(HX_WordOf(kHxCTypes, *type.cType));
+    default:
+      return type.of->name;
   }
-  if (type.kind == "enum") {
-    std::string values;
-    for (const auto& [name, value] : type.values)
-      values += (values.empty() ? "  " : ",\n  ") + name + " = " +
-                std::to_string(value);
-    return "enum {\n" + values + "\n} " + type.name;
-  }
-  if (type.kind == "integer64")
-    return std::string("struct {\n  unsigned int low;\n  ") +
-           (type.numerical->isSigned() ? "int" : "unsigned int") +
-           " high;\n} " + type.name;
-  if (type.kind == "base") return type.cType + " " + type.name;
-  return type.of->name + " " + type.name +
-         (type.kind == "array" ? "[" + std::to_string(type.length) + "]" : "");
+}
+
+std::string typeDefinition(const HX_TypeItem& type) {
+  const std::string length = type.kind == HX_TypeKind::eArray
+                                 ? "[" + std::to_string(type.length) + "]"
+                                 : "";
+  return "typedef " + typeBody(type) + " " + type.name + length + ";\n";
 }
 
 // A file name as the naming engine gives it.
@@ -121,14 +136,16 @@ HX_CWriter::HX_CWriter(const HX_Model& model, HX_RunResult& result)
       m_Result(result),
       m_TypesFile(fileName("$M_types")),
       m_CodeFile(fileName("$M")) {
-  for (const HX_Name* name : result.names) {
-    if (name->isDefined && name->isFunction()) m_Functions.push_back(name);
+  for (const HX_FormedName* name : result.names) {
+    if (name->isDefined && name->wanted->isFunction())
+      m_Functions.push_back(name);
   }
-  std::sort(
-      m_Functions.begin(), m_Functions.end(),
-      [](const HX_Name* a, const HX_Name* b) { return a->actual < b->actual; });
-  for (const HX_Name* name : result.variables)
-    m_VariablesIn[name->scope].push_back(name);
+  std::sort(m_Functions.begin(), m_Functions.end(),
+            [](const HX_FormedName* a, const HX_FormedName* b) {
+              return a->actual < b->actual;
+            });
+  for (const HX_FormedName* name : result.variables)
+    m_VariablesIn[name->wanted->scope].push_back(name);
 }
 
 void HX_CWriter::write(HX_Output& output) {
@@ -142,8 +159,8 @@ void HX_CWriter::writeTypes(std::ostream& out) const {
   out << fileHead("Types", m_Model.name) << "#ifndef " << guard << "\n#define "
       << guard << "\n\n";
   for (const HX_TypeItem* type : m_Result.types) {
-    if (type->kind != "bitField" && !type->isNameless)
-      out << "typedef " << typeBody(*type) << ";\n";
+    if (type->kind != HX_TypeKind::eBitField && !type->isNameless)
+      out << typeDefinition(*type);
   }
   out << "\n#endif /* " << guard << " */\n";
 }
@@ -152,34 +169,37 @@ void HX_CWriter::writeDeclarations(std::ostream& out) {
   const std::string guard = guardOf(m_CodeFile);
   out << fileHead("Declarations", m_Model.name) << "#ifndef " << guard
       << "\n#define " << guard << "\n\n#include \"" << m_TypesFile << ".h\"\n";
-  for (const HX_Name* name : m_VariablesIn[m_Model.fileScope])
+  for (const HX_FormedName* name : m_VariablesIn[m_Model.fileScope])
     out << '\n'
-        << comment(*name) << "extern " << name->type->name << ' '
-        << name->actual << ";\n";
-  for (const HX_Name* name : m_Functions)
-    out << '\n' << comment(*name) << "void " << name->actual << "(void);\n";
+        << comment(*name) << "extern " << name->wanted->type->name << ' '
+        << name->actual.cstring() << ";\n";
+  for (const HX_FormedName* name : m_Functions)
+    out << '\n'
+        << comment(*name) << "void " << name->actual.cstring() << "(void);\n";
   out << "\n#endif /* " << guard << " */\n";
 }
 
 void HX_CWriter::writeDefinitions(std::ostream& out) {
   out << fileHead("Definitions", m_Model.name) << "#include \"" << m_CodeFile
       << ".h\"\n";
-  for (const HX_Name* name : m_VariablesIn[m_Model.fileScope])
+  for (const HX_FormedName* name : m_VariablesIn[m_Model.fileScope])
     out << '\n' << comment(*name) << definition(*name);
-  for (const HX_Name* name : m_Functions) {
-    out << '\n' << comment(*name) << "void " << name->actual << "(void) {\n";
-    if (name->body != nullptr) writeLocals(out, *name->body, "  ");
+  for (const HX_FormedName* name : m_Functions) {
+    out << '\n'
+        << comment(*name) << "void " << name->actual.cstring() << "(void) {\n";
+    if (name->wanted->body != nullptr)
+      writeLocals(out, *name->wanted->body, "  ");
     out << "}\n";
   }
 }
 
-// The variables of a scope, then the blocks in it by id.
+// The variables of a scope, then the inner blocks by id.
 void HX_CWriter::writeLocals(std::ostream& out, const HX_ScopeItem& scope,
                              const std::string& indent) {
-  for (const HX_Name* name : m_VariablesIn[&scope])
+  for (const HX_FormedName* name : m_VariablesIn[&scope])
     out << indent << comment(*name) << indent << definition(*name);
-  for (const HX_Name* name : m_VariablesIn[&scope])
-    out << indent << "(void)" << name->actual << ";\n";
+  for (const HX_FormedName* name : m_VariablesIn[&scope])
+    out << indent << "(void)" << name->actual.cstring() << ";\n";
   for (const auto& [id, block] : scope.blocks) {
     out << indent << "{\n";
     writeLocals(out, *block, indent + "  ");
@@ -187,48 +207,53 @@ void HX_CWriter::writeLocals(std::ostream& out, const HX_ScopeItem& scope,
   }
 }
 
-std::string HX_CWriter::definition(const HX_Name& name) {
+std::string HX_CWriter::definition(const HX_FormedName& name) {
   std::size_t at = 0;
-  return name.type->name + " " + name.actual +
-         (name.initial.empty() ? ""
-                               : " = " + initializer(name, *name.type, at)) +
-         ";\n";
+  const HX_TypeItem& type = *name.wanted->type;
+  const std::string value = name.wanted->initial.empty()
+                                ? std::string()
+                                : " = " + initializer(name, type, at);
+  return type.name + " " + name.actual.cstring() + value + ";\n";
 }
 
-// The value of one element or, for an array, the list of those of its elements
-// that have a value; \p at moves over them.
-std::string HX_CWriter::initializer(const HX_Name& name,
+// The value of one element or, for an array, the list of the elements with a
+// value; \p at moves over the values.
+std::string HX_CWriter::initializer(const HX_FormedName& name,
                                     const HX_TypeItem& type, std::size_t& at) {
-  if (type.kind != "array") {
+  if (type.kind != HX_TypeKind::eArray) {
     if (type.of != nullptr) return initializer(name, *type.of, at);
-    return elementValue(name, type, name.initial[at++]);
+    return elementValue(name, type, name.wanted->initial[at++]);
   }
   std::string list;
-  for (int i = 0; i < type.length && at < name.initial.size(); ++i)
+  for (int i = 0; i < type.length && at < name.wanted->initial.size(); ++i)
     list += (i == 0 ? "" : ", ") + initializer(name, *type.of, at);
   return "{" + list + "}";
 }
 
-std::string HX_CWriter::elementValue(const HX_Name& name,
+std::string HX_CWriter::elementValue(const HX_FormedName& name,
                                      const HX_TypeItem& type, double physical) {
   const HX_NumericalType& range = *type.numerical;
-  const double steps = (physical - name.zero) / name.lsb;
+  const double steps = (physical - name.wanted->zero) / name.wanted->lsb;
   // From 2^53 on every double is an integer.
   const bool isRounded = !type.isFloating() && std::fabs(steps) < 0x1p53;
   const double wanted = isRounded ? FPS_Round(steps) : steps;
   const double value =
       std::clamp(wanted, range.getMinimum(), range.getMaximum());
-  if (value != wanted)
-    m_Result.findings.push_back(
-        {0, kWarning,
-         "The initial value " + floatText(physical, "") + " of " + name.actual +
-             " does not fit the type " + name.type->name +
-             "; the nearest value that fits is used.",
-         name.sourcePath});
-  if (type.cType == "float") return floatText(static_cast<float>(value), "F");
+  if (value != wanted) warnOfSaturation(name, physical);
+  if (type.cType == HX_CType::eFloat)
+    return floatText(static_cast<float>(value), "F");
   if (type.isFloating()) return floatText(value, "");
-  if (type.kind == "integer64")
+  if (type.kind == HX_TypeKind::eInteger64)
     return wordsText(bitsOf64(value, range.isSigned()), range.isSigned());
   if (range.isSigned()) return signedText(FPS_SatCastToInt(value));
   return std::to_string(FPS_SatCastToULong(value)) + "U";
+}
+
+void HX_CWriter::warnOfSaturation(const HX_FormedName& name, double physical) {
+  m_Result.findings.push_back(
+      {0, HX_Finding::eWarning,
+       "The initial value " + floatText(physical, "") + " of " +
+           name.actual.cstring() + " does not fit the type " +
+           name.wanted->type->name + "; the nearest value that fits is used.",
+       name.sourcePath()});
 }

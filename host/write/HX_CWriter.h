@@ -1,5 +1,5 @@
-// Writes C90: a header with the types, one with the declarations, and a source
-// with the definitions.
+// Writes C90: a header with the types, a header with the declarations, and a
+// source with the definitions.
 //
 //   HX_CWriter writer(model, result);
 //   writer.write(output);
@@ -13,16 +13,17 @@
 #include <vector>
 
 #include "host/base/HX_Output.h"
-#include "host/write/HX_NameReport.h"
+#include "host/model/HX_Model.h"
+#include "host/names/HX_FormedName.h"
 
-/// C90 has no integer of 64 bits: one is written as a structure of two words,
-/// the low one first.
+/// C90 has no integer of 64 bits: a structure of two words, low word first,
+/// stands for the integer.
 ///
-/// Initial values are scaled to steps of the type, rounded and saturated as the
-/// simulation does; a value that had to be saturated is remarked on.
+/// Initial values are scaled to steps of the type, rounded and saturated as in
+/// the simulation. A saturated value is a warning.
 class HX_CWriter {
  public:
-  /// \p result gets the remarks.
+  /// Warnings go to \p result.
   HX_CWriter(const HX_Model& model, HX_RunResult& result);
 
   void write(HX_Output& output);
@@ -33,19 +34,21 @@ class HX_CWriter {
   void writeDefinitions(std::ostream& out);
   void writeLocals(std::ostream& out, const HX_ScopeItem& scope,
                    const std::string& indent);
-  std::string definition(const HX_Name& name);
-  std::string initializer(const HX_Name& name, const HX_TypeItem& type,
+  std::string definition(const HX_FormedName& name);
+  std::string initializer(const HX_FormedName& name, const HX_TypeItem& type,
                           std::size_t& at);
-  std::string elementValue(const HX_Name& name, const HX_TypeItem& type,
+  std::string elementValue(const HX_FormedName& name, const HX_TypeItem& type,
                            double physical);
+  void warnOfSaturation(const HX_FormedName& name, double physical);
 
   const HX_Model& m_Model;
   HX_RunResult& m_Result;
-  std::string m_TypesFile;                  // without extension, as below
-  std::string m_CodeFile;                   // header and source
-  std::vector<const HX_Name*> m_Functions;  // by C name
-  // Looked up, never walked.
-  std::map<const HX_ScopeItem*, std::vector<const HX_Name*>> m_VariablesIn;
+  std::string m_TypesFile;                        // without extension, as below
+  std::string m_CodeFile;                         // header and source
+  std::vector<const HX_FormedName*> m_Functions;  // by C name
+  // Looked up by scope, never walked.
+  std::map<const HX_ScopeItem*, std::vector<const HX_FormedName*>>
+      m_VariablesIn;
 };
 
 #endif  // HOST_WRITE_HX_CWRITER_H

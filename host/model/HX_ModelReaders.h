@@ -1,7 +1,7 @@
 // The steps of reading a model; private to the sources of HX_Model.
 
-#ifndef HOST_MODEL_HX_MODELPARTS_H
-#define HOST_MODEL_HX_MODELPARTS_H
+#ifndef HOST_MODEL_HX_MODELREADERS_H
+#define HOST_MODEL_HX_MODELREADERS_H
 
 #include <string>
 #include <unordered_map>
@@ -46,6 +46,6 @@ void HX_ReadSources(const HX_Json& root, HX_Model& model, HX_SourceIds& ids);
 
 void HX_ReadTypes(const HX_Json& types, HX_Model& model, HX_TypeIds& ids);
 /// The type of \p id, if the code can declare something with it.
-HX_TypeItem* HX_FindNamedType(const HX_TypeIds& ids, const HX_Json& id);
+HX_TypeItem* HX_FindDeclarableType(const HX_TypeIds& ids, const HX_Json& id);
 
-#endif  // HOST_MODEL_HX_MODELPARTS_H
+#endif  // HOST_MODEL_HX_MODELREADERS_H

@@ -1,36 +1,38 @@
-// HX_NameRun::explain(): what each macro of a template gives.
+// HX_NameForming::explain(): the value of each macro of a template.
 #include <algorithm>
 #include <cstring>
 
 #include "host/base/HX_Text.h"
-#include "host/names/HX_NameRun.h"
-#include "platform/messages/HX_MessageHandler.h"
+#include "host/names/HX_NameForming.h"
 
 namespace {
 
-std::string fromSource(const HX_Name& name) {
+std::string fromSource(const HX_WantedName& name) {
   return name.source != nullptr ? HX_PathOf(name.source) : "no source";
 }
 
-std::string fromDictionary(const HX_Name& name) {
+std::string fromDictionary(const HX_WantedName& name) {
   return name.dd != nullptr ? HX_PathOf(name.dd) : fromSource(name);
 }
 
-std::string fromType(const HX_Name& name) {
+std::string fromType(const HX_WantedName& name) {
   return name.type != nullptr ? "type '" + name.type->id + "'" : "no type";
 }
 
-std::string fromTask(const HX_Name& name) {
-  const HX_Name* timed = name.timed();
-  return timed != nullptr ? timed->kind + " '" + timed->id + "'" : "no task";
+std::string fromTask(const HX_WantedName& name) {
+  const HX_WantedName* timed = name.timed();
+  if (timed == nullptr) return "no task";
+  return std::string(HX_WordOf(kHxNameKinds, timed->kind)) + " '" + timed->id +
+         "'";
 }
 
-std::string fromModel(const HX_Name&) { return "the model"; }
+std::string fromModel(const HX_WantedName&) { return "the model"; }
 
 struct MeaningRow {
   const char* macro;  // the beginning of the macro
   const char* meaning;
-  std::string (*origin)(const HX_Name& name);  // null: given with the name
+  std::string (*origin)(
+      const HX_WantedName& name);  // null: given with the name
 };
 
 // The first row that fits counts.
@@ -69,7 +71,7 @@ constexpr MeaningRow kMeanings[] = {
     {"", "as written", nullptr},
 };
 
-std::string meaningOf(const HX_Name& name, const std::string& macro) {
+std::string meaningOf(const HX_WantedName& name, const std::string& macro) {
   const MeaningRow* row = kMeanings;
   while (macro.compare(0, std::strlen(row->macro), row->macro) != 0) ++row;
   if (row->origin == nullptr) return row->meaning;
@@ -88,9 +90,12 @@ std::size_t endOfToken(const std::string& text, std::size_t from) {
 
 }  // namespace
 
-std::vector<HX_ExplainedMacro> HX_NameRun::explain(const HX_Name& name) {
+std::vector<HX_ExplainedMacro> HX_NameForming::explain(
+    const HX_WantedName& name) {
   std::vector<HX_ExplainedMacro> steps;
-  const std::string& text = name.nameTemplate;
+  std::vector<HX_Finding> unseen;
+  const HX_MessageCollector collector(unseen);
+  const std::string text = HX_ToUtf8(name.nameTemplate);
   for (std::size_t from = 0; from < text.size();) {
     const std::size_t end = endOfToken(text, from);
     const std::string token = text.substr(from, end - from);
@@ -105,6 +110,5 @@ std::vector<HX_ExplainedMacro> HX_NameRun::explain(const HX_Name& name) {
                      HX_ToUtf8(id.getCookedName(HxCCIdentifier::eFormalName)),
                      meaningOf(name, token)});
   }
-  HX_MessageHandler::instance().clear();
   return steps;
 }

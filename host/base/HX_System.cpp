@@ -1,0 +1,53 @@
+#include "host/base/HX_System.h"
+
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <csignal>
+#include <iterator>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+constexpr int kEndSignals[] = {SIGHUP, SIGINT, SIGTERM};
+constexpr int kEndSignalCount = static_cast<int>(std::size(kEndSignals));
+
+struct sigaction s_Before[kEndSignalCount];
+volatile std::sig_atomic_t s_Waiting = 0;  // last delayed signal
+
+}  // namespace
+
+void HX_PrepareProcess() {
+  std::signal(SIGPIPE, SIG_IGN);
+  std::signal(SIGXFSZ, SIG_IGN);
+  int file = 0;
+  while (file >= 0 && file <= STDERR_FILENO) file = open("/dev/null", O_RDONLY);
+  close(file);
+}
+
+bool HX_IsErrorOutputTerminal() { return isatty(STDERR_FILENO) != 0; }
+
+fs::path HX_ProgramFolder() {
+  return fs::read_symlink("/proc/self/exe").parent_path();
+}
+
+std::string HX_ProcessNumber() { return std::to_string(getpid()); }
+
+HX_DelayedSignals::HX_DelayedSignals() {
+  struct sigaction note = {};
+  note.sa_handler = [](int signal) { s_Waiting = signal; };
+  for (int i = 0; i < kEndSignalCount; ++i) {
+    sigaction(kEndSignals[i], nullptr, &s_Before[i]);
+    if (s_Before[i].sa_handler == SIG_DFL)
+      sigaction(kEndSignals[i], &note, nullptr);
+  }
+}
+
+HX_DelayedSignals::~HX_DelayedSignals() {
+  for (int i = 0; i < kEndSignalCount; ++i)
+    sigaction(kEndSignals[i], &s_Before[i], nullptr);
+  if (s_Waiting != 0) std::raise(s_Waiting);
+}
+
+bool HX_DelayedSignals::isEndRequested() { return s_Waiting != 0; }

@@ -1,0 +1,39 @@
+// The calls of the operating system that the C++ library does not have. Every
+// such call of the program stands in HX_System.cpp.
+
+#ifndef HOST_BASE_HX_SYSTEM_H
+#define HOST_BASE_HX_SYSTEM_H
+
+#include <filesystem>
+#include <string>
+
+/// Makes failed writes return errors instead of signals, and opens the standard
+/// streams that the process was started without: a file that is opened later
+/// never becomes the standard output.
+void HX_PrepareProcess();
+
+/// Whether a person may read the standard error output.
+bool HX_IsErrorOutputTerminal();
+
+/// The folder of the program file.
+std::filesystem::path HX_ProgramFolder();
+
+/// The number of this process, in decimal digits.
+std::string HX_ProcessNumber();
+
+/// Delays the signals that ask the program to end (SIGHUP, SIGINT, SIGTERM)
+/// until the end of the object; blocking calls are interrupted. At most one
+/// object lives at a time.
+class HX_DelayedSignals {
+ public:
+  HX_DelayedSignals();
+  HX_DelayedSignals(const HX_DelayedSignals&) = delete;
+  HX_DelayedSignals& operator=(const HX_DelayedSignals&) = delete;
+  /// Raises the last signal that came, if any.
+  ~HX_DelayedSignals();
+
+  /// Whether a signal waits.
+  static bool isEndRequested();
+};
+
+#endif  // HOST_BASE_HX_SYSTEM_H

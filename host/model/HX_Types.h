@@ -1,0 +1,48 @@
+// A data type of the generated code, as the document describes the type.
+
+#ifndef HOST_MODEL_HX_TYPES_H
+#define HOST_MODEL_HX_TYPES_H
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "host/model/HX_Kinds.h"
+#include "platform/datatypes/HX_DataType.h"
+#include "platform/datatypes/HX_NumericalType.h"
+
+/// Fields without a comment mean what the schema says.
+struct HX_TypeItem {
+  struct Field {
+    std::string name;
+    HX_TypeItem* type;
+  };
+  struct Constant {
+    std::string name;
+    int value;
+  };
+
+  explicit HX_TypeItem(const KyCXString& nameInCode) : type(nameInCode) {}
+
+  std::string id;
+  std::string name;
+  HX_TypeKind kind = HX_TypeKind::eBase;
+  std::optional<HX_CType> cType;
+  int bits = 0;
+  int length = 0;
+  bool isNameless = false;
+  HX_TypeItem* of = nullptr;
+  std::vector<Field> fields;
+  std::vector<Constant> values;
+  std::optional<HX_NumericalType> numerical;  // range of the kinds without `of`
+  HX_DataType type;                           // as the library sees the type
+
+  /// RETURNS: the last type of the chain of `of`, the storage of one value or
+  /// of one array element. Null if the chain closes a circle.
+  const HX_TypeItem* scalar() const;
+  bool isFloating() const {
+    return cType == HX_CType::eFloat || cType == HX_CType::eDouble;
+  }
+};
+
+#endif  // HOST_MODEL_HX_TYPES_H

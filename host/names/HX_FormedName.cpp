@@ -1,0 +1,56 @@
+#include "host/names/HX_FormedName.h"
+
+#include <algorithm>
+
+#include "SourceRef/HxCSrcRefServer.h"
+#include "host/base/HX_Text.h"
+
+namespace {
+
+// In the order of HX_Change::HxEReasonTag.
+constexpr const char* kReasons[] = {
+    "",          "made an identifier", "shortened", "keyword", "base type name",
+    "type name", "taken by a constant"};
+
+bool hasError(const std::vector<HX_Finding>& findings) {
+  return std::any_of(findings.begin(), findings.end(),
+                     [](const HX_Finding& each) { return each.isError(); });
+}
+
+}  // namespace
+
+std::string HX_Change::text() const {
+  if (reason == eTakenByName) return "taken by '" + owner->id + "'";
+  return kReasons[reason];
+}
+
+std::string HX_FormedName::sourcePath() const {
+  const HxCSrcRef* block = nullptr;
+  const HxCSrcRef* dd = nullptr;
+  const HxCSrcRef* other = nullptr;
+  HxCSrcRefServer::getSpecificSrcRefFromSet(&wanted->sources, &block, &dd,
+                                            &other);
+  if (block != nullptr) return HX_PathOf(block);
+  return HX_PathOf(dd != nullptr ? dd : other);
+}
+
+std::string HX_JoinedChanges(const HX_FormedName& name, const char* separator) {
+  std::string all;
+  for (const HX_Change& change : name.changes)
+    all += (all.empty() ? "" : separator) + change.text();
+  return all;
+}
+
+std::string HX_PathOf(const HxCSrcRef* srcRef) {
+  if (srcRef == nullptr) return {};
+  KyCXString text;
+  srcRef->toString(text);
+  return HX_ToUtf8(text);
+}
+
+bool HX_RunResult::hasErrors() const {
+  return hasError(findings) || std::any_of(formed.begin(), formed.end(),
+                                           [](const HX_FormedName& name) {
+                                             return hasError(name.findings);
+                                           });
+}

@@ -1,0 +1,66 @@
+// What became of a wanted name, and the results of a run.
+
+#ifndef HOST_NAMES_HX_FORMEDNAME_H
+#define HOST_NAMES_HX_FORMEDNAME_H
+
+#include <deque>
+#include <string>
+#include <vector>
+
+#include "host/model/HX_WantedName.h"
+#include "host/names/HX_Findings.h"
+
+/// Why a name differs from the expanded template.
+struct HX_Change {
+  enum HxEReasonTag {
+    eNone,  ///< no change
+    eMadeIdentifier,
+    eShortened,
+    eKeyword,   ///< also a word of a word list
+    eBaseType,  ///< the name of a base type
+    eType,      ///< the name of any other type
+    eTakenByConstant,
+    eTakenByName
+  };
+
+  HxEReasonTag reason = eNone;
+  const HX_WantedName* owner = nullptr;  // for eTakenByName
+
+  /// Empty for eNone. \return for example "shortened", "taken by 'gain'"
+  std::string text() const;
+};
+
+struct HX_FormedName {
+  explicit HX_FormedName(const HX_WantedName& name) : wanted(&name) {}
+
+  const HX_WantedName* wanted;
+  KyCXString formal;
+  KyCXString actual;
+  bool isComplete = false;
+  bool isDefined = false;  // stands in a scope and may be written into code
+  std::vector<HX_Change> changes;
+  std::vector<HX_Finding> findings;
+
+  /// RETURNS: the path of the last block of the sources, else of the last
+  /// dictionary object, else of the last other source; empty without a source.
+  std::string sourcePath() const;
+};
+
+/// The texts of \p name.changes in their order.
+std::string HX_JoinedChanges(const HX_FormedName& name, const char* separator);
+
+/// The text of a source reference in UTF-8; empty for null.
+std::string HX_PathOf(const HxCSrcRef* srcRef);
+
+struct HX_RunResult {
+  std::vector<const HX_TypeItem*> types;  // in the order of definition
+  std::deque<HX_FormedName> formed;
+  std::vector<const HX_FormedName*> names;      // in the order of the report
+  std::vector<const HX_FormedName*> variables;  // in the order of definition
+  std::vector<HX_Finding> findings;             // about no single name
+
+  /// Whether any finding is an error.
+  bool hasErrors() const;
+};
+
+#endif  // HOST_NAMES_HX_FORMEDNAME_H

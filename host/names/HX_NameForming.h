@@ -1,0 +1,56 @@
+// Takes the names of a model the whole road from template to C name.
+//
+//   HX_NameForming forming(spaces);
+//   std::deque<HX_FormedName> names = forming.formAll(model.names, progress);
+//   print(names.front().actual);
+
+#ifndef HOST_NAMES_HX_NAMEFORMING_H
+#define HOST_NAMES_HX_NAMEFORMING_H
+
+#include <deque>
+#include <functional>
+#include <map>
+#include <string>
+#include <vector>
+
+#include "Naming/HxCCIdentifier.h"
+#include "host/names/HX_FormedName.h"
+#include "host/names/HX_NameSpaces.h"
+
+/// One step of an expansion, for the user to read.
+struct HX_ExplainedMacro {
+  std::string macro;  ///< or literal text
+  std::string value;
+  std::string origin;
+};
+
+class HX_NameForming {
+ public:
+  using Progress = std::function<void(std::size_t done, std::size_t all)>;
+
+  explicit HX_NameForming(HX_NameSpaces& spaces) : m_Spaces(spaces) {}
+
+  /// Forms names by ascending id, tasks first, because other names contain the
+  /// names of tasks. The order of \p names has no influence.
+  /// RETURNS: one formed name per wanted name, in the order of \p names.
+  std::deque<HX_FormedName> formAll(const std::deque<HX_WantedName>& names,
+                                    const Progress& progress);
+
+  /// The value of each macro of the template. Reports nothing.
+  std::vector<HX_ExplainedMacro> explain(const HX_WantedName& name);
+
+ private:
+  void form(HX_FormedName& name);
+  bool expand(const HX_WantedName& name, HxCCIdentifier& id,
+              bool suppressMessages);
+  void substitute(const HX_WantedName& name, HxCCIdentifier& id);
+  void replaceMultirate(const HX_WantedName& name, HxCCIdentifier& id);
+  void makeCName(HxCCIdentifier& id, HX_FormedName& name);
+  void define(HxCCIdentifier& id, HX_FormedName& name);
+
+  HX_NameSpaces& m_Spaces;
+  HxCNames m_Names;
+  std::map<const HX_WantedName*, HxCCIdentifier> m_TaskNames;  // null: empty
+};
+
+#endif  // HOST_NAMES_HX_NAMEFORMING_H

@@ -1,0 +1,97 @@
+#include "host/program/HX_Commands.h"
+
+#include <iostream>
+
+#include "host/base/HX_System.h"
+#include "host/model/HX_Document.h"
+#include "host/model/HX_Synthesis.h"
+#include "host/program/HX_Generator.h"
+#include "host/write/HX_NameMap.h"
+#include "host/write/HX_NameTable.h"
+
+namespace {
+
+HX_NameForming::Progress progressOf(const HX_Arguments& arguments) {
+  if (arguments.quiet || !HX_IsErrorOutputTerminal())
+    return [](std::size_t, std::size_t) {};
+  return [](std::size_t done, std::size_t all) {
+    if (all < 5000) return;
+    if (done % 1000 == 0)
+      std::cerr << "\rnames: " << done << " of " << all << std::flush;
+    if (done == all) std::cerr << '\r' << std::string(40, ' ') << '\r';
+  };
+}
+
+void showNames(const HX_Arguments& arguments, HX_Generator& generator) {
+  const HX_Profile::Phase phase(generator.profile, "Print");
+  if (arguments.json)
+    HX_WriteJson(std::cout, generator.result);
+  else
+    HX_WriteTable(std::cout, generator.result);
+}
+
+void explainName(const HX_Arguments& arguments, HX_Generator& generator) {
+  if (!generator.forming)  // a circle of types
+    return HX_WriteFindings(std::cerr, generator.result);
+  for (const HX_FormedName* name : generator.result.names) {
+    if (name->wanted->id == arguments.name)
+      return HX_WriteExplanation(std::cout, *name,
+                                 generator.forming->explain(*name->wanted));
+  }
+  throw HX_DocumentError(arguments.model +
+                         ": /names: expected a name with the id \"" +
+                         arguments.name + "\"");
+}
+
+void generateCode(const HX_Arguments& arguments, HX_Generator& generator) {
+  const HX_RunResult& result = generator.result;
+  if (result.hasErrors()) return HX_WriteFindings(std::cerr, result);
+  HX_Output output(generator.profile.start / arguments.out);
+  const std::size_t changed = generator.write(output);
+  HX_WriteFindings(std::cerr, result);
+  if (arguments.json)
+    HX_WriteJson(std::cout, result);
+  else if (!arguments.quiet)
+    std::cout << result.names.size() << " names, " << result.variables.size()
+              << " variables; " << changed << " files written to "
+              << arguments.out << '\n';
+  // If a report cannot be written, no file of the code changes.
+  generator.profile.finish();
+  HX_FlushOutput();
+  output.commit();
+}
+
+using Command = void (*)(const HX_Arguments&, HX_Generator&);
+
+HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command) {
+  HX_Profile profile(arguments.profile);
+  HX_Generator generator(profile, arguments.model, arguments.keywords);
+  generator.run(progressOf(arguments));
+  command(arguments, generator);
+  profile.finish();
+  return generator.result.hasErrors() ? kHxErrorsFound : kHxDone;
+}
+
+}  // namespace
+
+HX_ExitCode HX_ShowNames(const HX_Arguments& arguments) {
+  return runOverModel(arguments, showNames);
+}
+
+HX_ExitCode HX_ExplainName(const HX_Arguments& arguments) {
+  return runOverModel(arguments, explainName);
+}
+
+HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments) {
+  return runOverModel(arguments, generateCode);
+}
+
+HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments) {
+  std::cout << HX_Synthesize(arguments.blocks, arguments.seed);
+  return kHxDone;
+}
+
+void HX_FlushOutput() {
+  if (!std::cout.flush())
+    throw HX_OutputError("standard output: cannot be written");
+}

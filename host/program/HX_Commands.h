@@ -1,0 +1,34 @@
+// The commands of hx_codegen.
+
+#ifndef HOST_PROGRAM_HX_COMMANDS_H
+#define HOST_PROGRAM_HX_COMMANDS_H
+
+#include <cstdint>
+#include <string>
+
+enum HX_ExitCode { kHxDone = 0, kHxErrorsFound = 1, kHxRefused = 2 };
+
+/// The command line.
+struct HX_Arguments {
+  std::string model;
+  std::string name;
+  std::string keywords;
+  std::string out;
+  std::string profile;
+  bool json = false;
+  bool quiet = false;
+  int blocks = 1000;
+  std::uint64_t seed = 1;
+};
+
+// Every command throws HX_DocumentError and HX_OutputError.
+
+HX_ExitCode HX_ShowNames(const HX_Arguments& arguments);
+HX_ExitCode HX_ExplainName(const HX_Arguments& arguments);
+HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments);
+HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments);
+
+/// Throws HX_OutputError if the standard output cannot be written.
+void HX_FlushOutput();
+
+#endif  // HOST_PROGRAM_HX_COMMANDS_H

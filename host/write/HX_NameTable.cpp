@@ -1,0 +1,124 @@
+#include "host/write/HX_NameTable.h"
+
+#include <algorithm>
+#include <ostream>
+
+#include "host/base/HX_Text.h"
+#include "platform/messages/HX_MessageHandler.h"
+
+namespace {
+
+using Row = std::vector<std::string>;
+
+std::string orDash(const std::string& text) {
+  return text.empty() ? "-" : text;
+}
+
+// Columns of a terminal: continuation bytes of UTF-8 have no column.
+std::size_t widthOf(const std::string& text) {
+  return static_cast<std::size_t>(std::count_if(
+      text.begin(), text.end(), [](char c) { return (c & '\xC0') != '\x80'; }));
+}
+
+std::string padded(const std::string& text, std::size_t width) {
+  return text +
+         std::string(std::max(width, widthOf(text)) - widthOf(text), ' ');
+}
+
+// The lines of a table; the last column is not padded.
+std::vector<std::string> aligned(const std::vector<Row>& rows) {
+  std::vector<std::size_t> widths(rows.front().size() - 1, 0);
+  for (const Row& row : rows) {
+    for (std::size_t i = 0; i < widths.size(); ++i)
+      widths[i] = std::max(widths[i], widthOf(row[i]));
+  }
+  std::vector<std::string> lines(rows.size());
+  for (std::size_t line = 0; line < rows.size(); ++line) {
+    for (std::size_t i = 0; i < widths.size(); ++i)
+      lines[line] += padded(rows[line][i], widths[i]) + "  ";
+    lines[line] += rows[line].back();
+  }
+  return lines;
+}
+
+// The end of a path tells more than its beginning.
+std::string shortPath(const std::string& path) {
+  constexpr int kWidth = 40;
+  KyCXString text = HX_FromUtf8(path);
+  if (text.length() <= kWidth) return orDash(path);
+  return "..." + HX_ToUtf8(text.sub(text.length() - kWidth + 3, text.length()));
+}
+
+// "error   17056  C keyword int used as identifier.  [path]"
+std::string lineOf(const HX_Finding& finding, const std::string& knownSource) {
+  const std::string id =
+      finding.id != 0 ? std::to_string(finding.id) : std::string("host");
+  const bool isKnown = finding.source.empty() || finding.source == knownSource;
+  return padded(HX_MessageHandler::severityName(finding.severity), 8) +
+         padded(id, 7) + finding.text +
+         (isKnown ? "" : "  [" + finding.source + "]");
+}
+
+template <class Item, class TextOf>
+void writeOrder(std::ostream& out, const char* what,
+                const std::vector<const Item*>& items, TextOf textOf) {
+  if (items.empty()) return;
+  out << '\n' << what << " in the order of their definition:\n";
+  for (const Item* item : items) out << "  " << textOf(*item) << '\n';
+}
+
+}  // namespace
+
+void HX_WriteTable(std::ostream& out, const HX_RunResult& result) {
+  std::vector<Row> rows{
+      {"name", "source", "template", "formal", "actual", "complete"}};
+  for (const HX_FormedName* name : result.names)
+    rows.push_back({name->wanted->id, shortPath(name->sourcePath()),
+                    orDash(HX_ToUtf8(name->wanted->nameTemplate)),
+                    orDash(HX_ToUtf8(name->formal)),
+                    orDash(HX_ToUtf8(name->actual)),
+                    name->isComplete ? "yes" : "no"});
+  const std::vector<std::string> lines = aligned(rows);
+  out << lines[0] << '\n' << std::string(widthOf(lines[0]), '-') << '\n';
+  for (std::size_t i = 0; i < result.names.size(); ++i) {
+    const HX_FormedName& name = *result.names[i];
+    out << lines[i + 1] << '\n';
+    if (!name.changes.empty())
+      out << "    changed: " << HX_JoinedChanges(name, ", ") << '\n';
+    for (const HX_Finding& finding : name.findings)
+      out << "    " << lineOf(finding, name.sourcePath()) << '\n';
+  }
+  writeOrder(out, "Types", result.types,
+             [](const HX_TypeItem& type) { return type.name; });
+  writeOrder(out, "Variables", result.variables,
+             [](const HX_FormedName& name) { return HX_ToUtf8(name.actual); });
+  for (const HX_Finding& finding : result.findings)
+    out << '\n' << lineOf(finding, "") << '\n';
+}
+
+void HX_WriteExplanation(std::ostream& out, const HX_FormedName& name,
+                         const std::vector<HX_ExplainedMacro>& steps) {
+  out << "name      " << name.wanted->id << "\ntemplate  "
+      << orDash(HX_ToUtf8(name.wanted->nameTemplate)) << "\nsource    "
+      << orDash(name.sourcePath()) << "\n\n";
+  std::vector<Row> rows{{"macro", "gives", "which is"}};
+  for (const HX_ExplainedMacro& step : steps)
+    rows.push_back({step.macro, orDash(step.value), step.origin});
+  for (const std::string& line : aligned(rows)) out << "  " << line << '\n';
+  out << "\nformal    " << orDash(HX_ToUtf8(name.formal)) << "\nactual    "
+      << orDash(HX_ToUtf8(name.actual)) << '\n';
+  for (const HX_Change& change : name.changes)
+    out << "changed   " << change.text() << '\n';
+  out << "complete  " << (name.isComplete ? "yes" : "no") << '\n';
+  for (const HX_Finding& finding : name.findings)
+    out << lineOf(finding, "") << '\n';
+}
+
+void HX_WriteFindings(std::ostream& out, const HX_RunResult& result) {
+  for (const HX_FormedName* name : result.names) {
+    for (const HX_Finding& finding : name->findings)
+      out << name->wanted->id << ": " << lineOf(finding, "") << '\n';
+  }
+  for (const HX_Finding& finding : result.findings)
+    out << lineOf(finding, "") << '\n';
+}
