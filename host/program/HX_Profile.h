@@ -1,6 +1,6 @@
-// What took how long in a run, and the files that tell it.
+// Times of the phases of a run, and reports about the times.
 //
-//   HX_Profile profile("profile");   // "" measures, but writes nothing
+//   HX_Profile profile("profile");   // "" measures without writing
 //   {
 //     HX_Profile::Phase phase(profile, "Form names");
 //     ...
@@ -20,11 +20,10 @@
 #include "Diagnostics/HX_TimingListener.h"
 #include "Diagnostics/HxCDebugServer.h"
 
-/// One per process. With a folder it makes that folder the working directory,
-/// where the library's servers write their files: HX_StopWatch.html,
-/// HX_DebugLog.txt, HX_DebugProtocol.txt and HX_Transformations.txt. Beside
-/// them stands HX_Trace.json, complete events of the trace-event format, in
-/// microseconds.
+/// One per process. A folder becomes the working directory, because the servers
+/// of the library write their files there: HX_StopWatch.html, HX_DebugLog.txt,
+/// HX_DebugProtocol.txt and HX_Transformations.txt. HX_Trace.json has complete
+/// events of the trace-event format, in microseconds.
 class HX_Profile : private HX_TimingListener {
  public:
   /// Throws std::filesystem::filesystem_error for a folder that cannot be made
@@ -34,17 +33,17 @@ class HX_Profile : private HX_TimingListener {
   HX_Profile& operator=(const HX_Profile&) = delete;
   ~HX_Profile() override;
 
-  /// The working directory at the start, where the user's paths count from.
+  /// The working directory at the start; paths of the user count from here.
   const std::filesystem::path start = std::filesystem::current_path();
 
   void setModel(const std::string& name);
   /// A line of the protocol.
   void note(const std::string& text);
-  /// Writes what the servers still hold, and the trace; further calls do
+  /// Writes the reports of the servers and the trace; further calls do
   /// nothing. Throws HX_OutputError.
   void finish();
 
-  /// Measures while it lives.
+  /// Measures the time of its life.
   class Phase {
    public:
     Phase(HX_Profile& profile, const char* name);
