@@ -1,5 +1,6 @@
 #include "DependencySorting/HxCDependencySorting.h"
 
+#include "Control/HX_Memory.h"
 #include "DependencySorting/implDependencySorting/HxCDepSortingGraph.h"
 
 HxCDependencySorting::HxCDependencySorting()
@@ -9,29 +10,33 @@ HxCDependencySorting::~HxCDependencySorting() = default;
 
 void HxCDependencySorting::setSortingCriteriaAndInit(
     const leda::array<HxCDepSortComp*>& criteria) {
-  m_Criteria = criteria;
+  m_LacksCriteria = !HX_WithinMemory([&] { m_Criteria = criteria; });
   forgetPending();
 }
 
 void HxCDependencySorting::add(HxCDepSortNode* node) {
-  m_Nodes.push_back(node);
+  if (!HX_WithinMemory([&] { m_Nodes.push_back(node); })) m_LacksInput = true;
 }
 
 void HxCDependencySorting::addDependency(HxCDepSortNode* first,
                                          HxCDepSortNode* second) {
-  m_Dependencies.emplace_back(first, second);
+  if (!HX_WithinMemory([&] { m_Dependencies.emplace_back(first, second); }))
+    m_LacksInput = true;
 }
 
 bool HxCDependencySorting::sort() {
-  if (m_Graph == nullptr) return false;
-  m_Graph->setCriteria(m_Criteria);
-  m_Graph->append(m_Nodes, m_Dependencies);
-  m_Dependencies.clear();
-  return m_Graph->sort(m_Result);
+  if (m_Graph == nullptr || m_LacksInput || m_LacksCriteria) return false;
+  return HX_WithinMemory(false, [&] {
+    const bool sorted =
+        m_Graph->sort(m_Nodes, m_Dependencies, m_Criteria, m_Result);
+    m_Dependencies.clear();
+    return sorted;
+  });
 }
 
 leda::array<HxCDepSortNode*> HxCDependencySorting::getNodes() {
-  return m_Result;
+  using Result = leda::array<HxCDepSortNode*>;
+  return HX_WithinMemory(Result(), [&] { return Result(m_Result); });
 }
 
 void HxCDependencySorting::reinit() {
@@ -42,4 +47,5 @@ void HxCDependencySorting::reinit() {
 void HxCDependencySorting::forgetPending() {
   m_Nodes.clear();
   m_Dependencies.clear();
+  m_LacksInput = false;
 }

@@ -1,56 +1,88 @@
+// Problem: find the first free name among name + "_" + letter code of c, c + 1,
+// ... With the length limit on, appendSuffix() cuts a long name to make room,
+// so thousands of long names share one head and compete for the variants of
+// that head, although the counter of every name starts at 0.
+//
+// Plain form: try every index. n names with one head take n^2 / 2 lookups, 200
+// million for 20000 names.
+//
+// Idea: remember per head the indices found taken, as intervals (m_Names holds
+// heads beside names), and jump over an interval at once.
+//
+// Example, limit of 8 characters, names abcdefg1, abcdefg2, abcdefg3 in the
+// set, each derived once by addUnique():
+//   abcdefg1 -> abcdef_a               head abcdef: {}     -> {0}
+//   abcdefg2 -> abcdef_a is taken; note 0, jump to 1
+//               abcdef_b               head abcdef: {0}    -> {0, 1}
+//   abcdefg3 -> abcdef_a is taken; note 0, jump to 2
+//               abcdef_c               head abcdef: {0, 1} -> {0, 1, 2}
+//
+// Invariants:
+// 1. Every index in head.taken belongs to a name of the set: head + "_" + code.
+//    The reverse need not hold, because notes only save time. A note may fail
+//    for want of memory.
+// 2. A jump stays among codes of one length, because a longer code cuts the
+//    name to another head.
+// 3. A name too short to be cut by any suffix is the head of its own variants.
+// 4. An entry is in the set or has notes, unless memory ran out.
+//
+// Test: LimitedNameSpaceTest.AgreesWithTryingEachSuffix.
+
 #include "NameSpace/HX_LimitedNameSpace.h"
 
 #include <algorithm>
-#include <cstddef>
-#include <cstdint>
-#include <limits>
+#include <cstring>
+#include <iterator>
+#include <new>
 #include <optional>
+#include <utility>
 
-#include "NameSpace/implNameSpace/HX_IndexRuns.h"
-#include "NameSpace/implNameSpace/HX_TextHash.h"
+#include "Control/HX_Memory.h"
+#include "implContainers/HX_IntervalSet.h"
+#include "implContainers/HX_LetterCode.h"
+#include "implContainers/HX_TextHash.h"
 #include "platform/model/HxCSymbol.h"
 
 namespace {
 
-constexpr int kLetters = 26;
-// Enough for the code of every int.
-constexpr int kLongestCode = 7;
-
-// A name read as "<head>_<letter code>".
+// A name read as head, '_' and letter code.
 struct Variant {
   int headLength;
   int index;              // of the letter code
-  int firstOfNextLength;  // the first index with a longer code
+  int firstOfNextLength;  // smallest index with a longer code
 };
 
-// Nothing if the name does not read so. A letter code is a bijective numeral of
-// base 26, lowest letter first.
+// Nothing if the name does not end in '_' and a letter code.
 std::optional<Variant> readVariant(const KyCXString& name) {
-  const int last = name.length() - 1;
-  int from = last;
-  while (from >= 0 && last - from < kLongestCode && name[from] >= 'a' &&
-         name[from] <= 'z')
-    --from;
-  if (from < 0 || from == last || name[from] != '_') return std::nullopt;
-  std::int64_t value = 0;
-  std::int64_t smallestLonger = 1;
-  for (int at = last; at > from; --at) {
-    value = value * kLetters + (name[at] - 'a' + 1);
-    smallestLonger = smallestLonger * kLetters + 1;
-  }
-  constexpr std::int64_t kMaximum = std::numeric_limits<int>::max();
-  if (value > kMaximum) return std::nullopt;
-  return Variant{from, static_cast<int>(value - 1),
-                 static_cast<int>(std::min(smallestLonger - 1, kMaximum))};
+  char letters[HX_LetterCode::kLongest];
+  char* const end = std::end(letters);
+  char* code = end;
+  int from = name.length() - 1;
+  for (; from >= 0 && code != letters && name[from] >= 'a' && name[from] <= 'z';
+       --from)
+    *--code = static_cast<char>(name[from]);
+  const int length = static_cast<int>(end - code);
+  if (from < 0 || length == 0 || name[from] != '_') return std::nullopt;
+  const int index = HX_LetterCode::indexOf(code, length);
+  if (index < 0) return std::nullopt;
+  return Variant{from, index, HX_LetterCode::firstOfLength(length + 1)};
 }
 
+bool isVariant(const KyCXString& name, int index) {
+  const auto variant = readVariant(name);
+  return variant && variant->index == index;
+}
+
+// Over the 8-bit form, whose length may differ from that of the text.
 int hashOf(const KyCXString& text) {
-  return HX_TextHash(text.cstring(), static_cast<std::size_t>(text.length()));
+  const char* const bytes = text.cstring();
+  return HX_TextHash(bytes, std::strlen(bytes));
 }
 
-// Whether no suffix makes a name so long that it would be cut or shortened.
+// True if no suffix makes the name so long that the name would be cut.
 bool isNeverCut(const KyCXString& name) {
-  return name.length() + 1 + kLongestCode <= HxCSymbol::sm_MaxNameLength;
+  return name.length() + 1 + HX_LetterCode::kLongest <=
+         HxCSymbol::sm_MaxNameLength;
 }
 
 }  // namespace
@@ -58,11 +90,10 @@ bool isNeverCut(const KyCXString& name) {
 struct HX_LimitedNameSpace::Name : HX_Allocated {
   explicit Name(const KyCXString& name) : text(name) {}
 
-  bool isDefined = false;  // in the set; else only the head of variants
+  bool isDefined = false;  // in the set; false for a mere head of variants
   int counter = 0;
   KyCXString text;
-  // Suffix indices whose variants of this text are known to be in the set.
-  HX_IndexRuns taken;
+  HX_IntervalSet taken;  // indices of variants of this text in the set
 };
 
 HX_LimitedNameSpace::HX_LimitedNameSpace(const HX_LimitedNameSpace& other)
@@ -72,43 +103,36 @@ HX_LimitedNameSpace::HX_LimitedNameSpace(const HX_LimitedNameSpace& other)
 
 HX_LimitedNameSpace& HX_LimitedNameSpace::operator=(
     const HX_LimitedNameSpace& other) {
-  if (this == &other) return *this;
-  clear();
-  m_Naming = other.m_Naming;
-  other.m_Names.forEach([this](const auto& slot) {
-    if (!slot.value->isDefined) return;
-    Name* const name = findOrMake(slot.value->text);
-    if (name == nullptr) return;
-    name->isDefined = true;
-    name->counter = slot.value->counter;
+  HX_WithinMemory([&] {
+    HX_LimitedNameSpace copy;
+    copy.copyNames(other);
+    m_Naming = other.m_Naming;
+    m_Names.swap(copy.m_Names);
   });
   return *this;
 }
 
-HX_LimitedNameSpace::~HX_LimitedNameSpace() { clear(); }
+HX_LimitedNameSpace::~HX_LimitedNameSpace() {
+  m_Names.forEach([](const auto& slot) { delete slot.value; });
+}
 
-void HX_LimitedNameSpace::add(KyCXString& s) { enter(s); }
+void HX_LimitedNameSpace::add(KyCXString& s) {
+  HX_WithinMemory([&] { findOrMake(s)->isDefined = true; });
+}
 
 void HX_LimitedNameSpace::remove(const KyCXString& s) {
   Name* const name = findDefined(s);
   if (name == nullptr) return;
+  if (!HX_WithinMemory([&] { forgetTaken(s); }))
+    m_Names.forEach([](const auto& slot) { slot.value->taken.clear(); });
   name->isDefined = false;
   name->counter = 0;
-  if (const auto variant = readVariant(s)) {
-    Name* const head = find(s.head(variant->headLength));
-    if (head != nullptr) {
-      head->taken.remove(variant->index);
-      dropIfUnused(head);
-    }
-  }
   dropIfUnused(name);
 }
 
 void HX_LimitedNameSpace::addUnique(KyCXString& s) {
-  KyCXString out;
   bool derived = false;
-  deriveUniqueString(s, out, derived, true, false);
-  s = out;
+  derive(s, derived, true, false);
 }
 
 void HX_LimitedNameSpace::deriveUniqueString(KyCXString& s) {
@@ -117,9 +141,7 @@ void HX_LimitedNameSpace::deriveUniqueString(KyCXString& s) {
 }
 
 void HX_LimitedNameSpace::deriveUniqueString(KyCXString& s, bool& derived) {
-  KyCXString out;
-  deriveUniqueString(s, out, derived, false, false);
-  s = out;
+  derive(s, derived, false, false);
 }
 
 void HX_LimitedNameSpace::deriveUniqueStringAdaptLength(KyCXString& s) {
@@ -129,9 +151,19 @@ void HX_LimitedNameSpace::deriveUniqueStringAdaptLength(KyCXString& s) {
 
 void HX_LimitedNameSpace::deriveUniqueStringAdaptLength(KyCXString& s,
                                                         bool& derived) {
-  KyCXString out;
-  deriveUniqueString(s, out, derived, false, true);
-  s = out;
+  derive(s, derived, false, true);
+}
+
+void HX_LimitedNameSpace::derive(KyCXString& s, bool& derived, bool addResult,
+                                 bool adaptLength) {
+  derived = false;
+  HX_WithinMemory([&] {
+    KyCXString out;
+    bool isDerived = false;
+    deriveUniqueString(s, out, isDerived, addResult, adaptLength);
+    s = std::move(out);
+    derived = isDerived;
+  });
 }
 
 bool HX_LimitedNameSpace::deriveUniqueString(const KyCXString& in,
@@ -141,44 +173,61 @@ bool HX_LimitedNameSpace::deriveUniqueString(const KyCXString& in,
   if (adaptLength) adaptStringLength(out);
   Name* const base = findDefined(out);
   derived = base != nullptr;
-  if (derived) base->counter = searchVariant(*base, in, out, adaptLength);
-  if (!addResult || !enter(out) || !derived) return true;
+  const int index = derived ? searchVariant(*base, in, out, adaptLength) : 0;
+  Name* const result = addResult ? findOrMake(out) : nullptr;
+  // From here on nothing fails but notes.
+  if (derived) base->counter = index;
+  if (result == nullptr) return true;
+  result->isDefined = true;
+  if (!derived) return true;
   if (isNeverCut(in))
-    base->taken.add(base->counter);
+    HX_WithinMemory([&] { base->taken.add(index); });
   else
-    noteTaken(out, base->counter);
+    noteTaken(out, index);
   return true;
 }
 
 // \p out holds the text of \p base and becomes its first free variant.
-// \return the index of the variant's suffix
+// RETURNS: the index of the suffix.
 int HX_LimitedNameSpace::searchVariant(const Name& base, const KyCXString& in,
                                        KyCXString& out, bool adaptLength) {
   int index = base.counter;
   if (isNeverCut(in)) index = base.taken.firstMissing(index);
-  // The variants of a shortened name tell nothing about those of the name.
+  // Variants of a shortened name tell nothing about variants of the name.
   bool isOfInput = out.length() == in.length();
   for (;;) {
     m_Naming.appendSuffix(out, index);
     if (adaptLength) adaptStringLength(out);
-    if (findDefined(out) == nullptr) return index;
+    const Name* const taken = findDefined(out);
+    if (taken == nullptr) return index;
+    // The suffix is missing, so appendSuffix() ran out of memory.
+    if (taken == &base && !isVariant(out, index)) throw std::bad_alloc();
     index = isOfInput ? noteTaken(out, index) : index + 1;
     isOfInput = true;
     out = in;
   }
 }
 
-// Notes that a variant with the suffix \p index is in the set.
-// \return the next index to try for the name it was derived from: as long as
-//         the letter codes have one length, its variants have one head, and
-//         those known to be taken are passed over
-int HX_LimitedNameSpace::noteTaken(const KyCXString& name, int index) {
-  const auto variant = readVariant(name);
-  if (!variant || variant->index != index) return index + 1;
-  Name* const head = findOrMake(name.head(variant->headLength));
-  if (head == nullptr) return index + 1;
-  head->taken.add(index);
-  return std::min(head->taken.firstMissing(index), variant->firstOfNextLength);
+// Notes that \p variant, which has the suffix \p index, is in the set.
+// RETURNS: the next index to try (invariant 2).
+int HX_LimitedNameSpace::noteTaken(const KyCXString& variant, int index) {
+  const auto read = readVariant(variant);
+  if (!read || read->index != index) return index + 1;
+  return HX_WithinMemory(index + 1, [&] {
+    Name* const head = findOrMake(variant.head(read->headLength));
+    head->taken.add(index);
+    return std::min(head->taken.firstMissing(index), read->firstOfNextLength);
+  });
+}
+
+// Throws std::bad_alloc, with nothing changed.
+void HX_LimitedNameSpace::forgetTaken(const KyCXString& variant) {
+  const auto read = readVariant(variant);
+  if (!read) return;
+  Name* const head = find(variant.head(read->headLength));
+  if (head == nullptr) return;
+  head->taken.remove(read->index);
+  dropIfUnused(head);
 }
 
 void HX_LimitedNameSpace::adaptStringLength(KyCXString& s) {
@@ -199,23 +248,26 @@ HX_LimitedNameSpace::Name* HX_LimitedNameSpace::findDefined(
   return name != nullptr && name->isDefined ? name : nullptr;
 }
 
-// Null if there is no memory.
+// Throws std::bad_alloc, with nothing changed.
 HX_LimitedNameSpace::Name* HX_LimitedNameSpace::findOrMake(
     const KyCXString& text) {
   Name* name = find(text);
   if (name != nullptr) return name;
   name = new Name(text);
-  if (name == nullptr) return nullptr;
+  if (name == nullptr) throw std::bad_alloc();
   if (m_Names.add(hashOf(text), name) != nullptr) return name;
   delete name;
-  return nullptr;
+  throw std::bad_alloc();
 }
 
-// False if there is no memory.
-bool HX_LimitedNameSpace::enter(const KyCXString& text) {
-  Name* const name = findOrMake(text);
-  if (name != nullptr) name->isDefined = true;
-  return name != nullptr;
+// Throws std::bad_alloc. Copies start without notes.
+void HX_LimitedNameSpace::copyNames(const HX_LimitedNameSpace& other) {
+  other.m_Names.forEach([this](const auto& slot) {
+    if (!slot.value->isDefined) return;
+    Name* const name = findOrMake(slot.value->text);
+    name->isDefined = true;
+    name->counter = slot.value->counter;
+  });
 }
 
 void HX_LimitedNameSpace::dropIfUnused(Name* name) {
@@ -223,9 +275,4 @@ void HX_LimitedNameSpace::dropIfUnused(Name* name) {
   m_Names.erase(m_Names.find(hashOf(name->text),
                              [=](const Name* other) { return other == name; }));
   delete name;
-}
-
-void HX_LimitedNameSpace::clear() {
-  m_Names.forEach([](const auto& slot) { delete slot.value; });
-  m_Names.clear();
 }

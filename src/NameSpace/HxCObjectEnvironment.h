@@ -21,9 +21,9 @@
 #include <type_traits>
 
 #include "Control/HX_Allocated.h"
-#include "NameSpace/HX_KeyFilter.h"
-#include "NameSpace/HX_KeyTable.h"
-#include "NameSpace/HX_PlainArray.h"
+#include "implContainers/HX_BloomFilter.h"
+#include "implContainers/HX_HashTable.h"
+#include "implContainers/HX_PlainArray.h"
 
 /// \tparam T  pointer to the values, which are created with new; null stands
 ///            for a key without a value.
@@ -112,11 +112,11 @@ class HxCObjectEnvironment : public HX_Allocated {
 
   HxCObjectEnvironment* m_pParent;
   HX_PlainArray<Child> m_Children;  // in the order of addChild()
-  HX_KeyTable<T> m_Entries;
+  HX_HashTable<int, T> m_Entries;
   // The definitions of a key in all scopes below, while counted. A count
   // travels up only along parents that list their child.
-  HX_KeyTable<Nothing> m_Below;
-  HX_KeyFilter m_BelowFilter;
+  HX_HashTable<int, Nothing> m_Below;
+  HX_BloomFilter m_BelowFilter;
   int m_Level = 0;  // listing parents above
   bool m_IsListedByParent = false;
   bool m_HasExactCounts = true;  // false here: false in all listing parents

@@ -3,7 +3,9 @@
 #include <cstring>
 
 #include "Control/HX_SelfCheck.h"
-#include "NameSpace/implNameSpace/HX_TextHash.h"
+#include "implContainers/HX_HashTable.h"
+#include "implContainers/HX_TextArena.h"
+#include "implContainers/HX_TextHash.h"
 #include "platform/strings/KyCXString.h"
 
 namespace {
@@ -12,13 +14,18 @@ constexpr char kErrorCode[] = __FILE__ "_";
 
 }  // namespace
 
+struct HxCXStringIdServer::Table : Buckets {
+  HX_HashTable<int, int> index;  // ids by the hash of the text
+  HX_TextArena texts;
+};
+
 bool HxCXStringIdServer::boot() {
   if (m_pTable == nullptr) m_pTable = new Table;
   return true;
 }
 
 bool HxCXStringIdServer::shutdown() {
-  delete m_pTable;
+  if (m_pTable != nullptr) delete &table();
   m_pTable = nullptr;
   return true;
 }
@@ -42,12 +49,16 @@ bool HxCXStringIdServer::findOrAdd(const KyCXString& s, int& id) {
   const char* const text = s.cstring();
   const std::size_t length = std::strlen(text);
   const int hash = HX_TextHash(text, length);
-  const auto* slot = m_pTable->index.find(hash, [=, this](int known) {
+  const auto* slot = table().index.find(hash, [=, this](int known) {
     return std::strcmp(getString(known), text) == 0;
   });
   if (slot == nullptr) return add(hash, text, length, id);
   id = slot->value;
   return true;
+}
+
+HxCXStringIdServer::Table& HxCXStringIdServer::table() const {
+  return *static_cast<Table*>(m_pTable);
 }
 
 unsigned HxCXStringIdServer::bucketOf(const char* text, std::size_t length) {
@@ -63,16 +74,16 @@ bool HxCXStringIdServer::add(int hash, const char* text, std::size_t length,
   const unsigned number = bucketOf(text, length);
   Bucket& bucket = m_pTable->buckets[number];
   const int newId = static_cast<int>(number + bucket.size() * kBucketCount);
-  const char* const kept = m_pTable->texts.add(text, length);
+  const char* const kept = table().texts.add(text, length);
   if (kept == nullptr) return false;
   if (bucket.append(kept)) {
-    if (m_pTable->index.add(hash, newId) != nullptr) {
+    if (table().index.add(hash, newId) != nullptr) {
       id = newId;
       return true;
     }
     bucket.dropLast();
   }
-  m_pTable->texts.dropLast(length);
+  table().texts.dropLast(length);
   return false;
 }
 

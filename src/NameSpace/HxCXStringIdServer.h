@@ -18,9 +18,7 @@
 
 #include "Control/HX_Allocated.h"
 #include "HX_Export.h"
-#include "NameSpace/HX_KeyTable.h"
-#include "NameSpace/HX_PlainArray.h"
-#include "NameSpace/HX_TextArena.h"
+#include "implContainers/HX_PlainArray.h"
 
 class KyCXString;
 
@@ -75,17 +73,18 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
 
   using Bucket = HX_PlainArray<const char*>;  // in the order of arrival
 
-  struct Table : HX_Allocated {
-    HX_KeyTable<int> index;  // the ids, by the hash of the text
-    HX_TextArena texts;
+  // The part of the table that getString() reads.
+  struct Buckets : HX_Allocated {
     Bucket buckets[kBucketCount];
   };
+  struct Table;
 
+  Table& table() const;
   static unsigned bucketOf(const char* text, std::size_t length);
   bool add(int hash, const char* text, std::size_t length, int& id);
   static const char* refuseText();
 
-  Table* m_pTable = nullptr;  // null while down
+  Buckets* m_pTable = nullptr;  // a Table; null while down
 };
 
 #endif  // NAMESPACE_HXCXSTRINGIDSERVER_H

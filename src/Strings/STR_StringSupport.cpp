@@ -1,12 +1,12 @@
 #include "Strings/STR_StringSupport.h"
 
-#include <charconv>
 #include <cstdarg>
 #include <cstddef>
 #include <cstdio>
 #include <cstring>
 #include <limits>
 
+#include "implContainers/HX_Number.h"
 #include "platform/memory/HxCMemController.h"
 
 namespace {
@@ -78,9 +78,8 @@ char* STR_ConcatenateNStrings(const char* first, ...) {
 }
 
 char* STR_IntToString(int value) {
-  char digits[std::numeric_limits<int>::digits10 + 2];  // one more, and '-'
-  const char* end = std::to_chars(digits, digits + sizeof digits, value).ptr;
-  return duplicate(digits, static_cast<std::size_t>(end - digits));
+  char digits[std::numeric_limits<int>::digits10 + 3];  // one more, '-', 0
+  return duplicate(digits, HX_WriteInt(digits, sizeof digits, value));
 }
 
 char* STR_DoubleToString(double value, int precision) {
@@ -91,10 +90,7 @@ char* STR_DoubleToString(double value, int precision) {
   if (length <= 0) return nullptr;
   char* result = allocate(static_cast<std::size_t>(length) + 1);
   if (result == nullptr) return nullptr;
-  // Not printf(), which would write the decimal point of the locale.
-  *std::to_chars(result, result + length, value, std::chars_format::fixed,
-                 digits)
-       .ptr = 0;
+  HX_WriteFixed(result, static_cast<std::size_t>(length) + 1, value, digits);
   return result;
 }
 

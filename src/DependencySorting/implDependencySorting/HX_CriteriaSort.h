@@ -3,47 +3,35 @@
 #ifndef DEPENDENCYSORTING_IMPLDEPENDENCYSORTING_HX_CRITERIASORT_H
 #define DEPENDENCYSORTING_IMPLDEPENDENCYSORTING_HX_CRITERIASORT_H
 
-#include <cstddef>
-#include <span>
-#include <vector>
-
+#include "implContainers/HX_Vector.h"
 #include "platform/containers/array.h"
 
 class HxCDepSortComp;
 class HxCDepSortNode;
 
-/// Gives the order of a Quicksort by each criterion in turn, applied to the
-/// runs of equals that the one before left.
-///
-/// The Quicksort takes the last element as its pivot, which costs n^2 steps on
-/// input that is nearly sorted. So it gets a budget; when that is spent, the
-/// parts that are left are sorted in another way, which also ranks their nodes.
-/// Only equals can tell one way from another: where there are any, the
-/// Quicksort is replayed on the ranks (HX_RankReplay).
+/// Gives the order of a Quicksort by the first criterion, followed by a
+/// Quicksort of every group of equals by the next criterion, and so on.
 class HX_CriteriaSort {
  public:
-  /// Sorts \p nodes, none null. Sets the current criterion whenever it goes
-  /// over to another one.
-  void sort(std::span<HxCDepSortNode*> nodes,
+  /// Sorts [nodes, nodes + count), none null. Sets the current criterion
+  /// whenever the sort goes over to another criterion. A criterion that
+  /// contradicts itself gives some order of the same nodes.
+  /// COST: about n log2 n comparisons per criterion, for every input.
+  /// Throws std::bad_alloc; the nodes are then in some order.
+  void sort(HxCDepSortNode** nodes, int count,
             const leda::array<HxCDepSortComp*>& criteria);
 
  private:
-  using Nodes = std::span<HxCDepSortNode*>;
   struct Range {
-    std::size_t first;
-    std::size_t count;
+    int first;
+    int count;
     int level;  // index of the criterion to sort by
   };
-  struct Entry {
-    HxCDepSortNode* node;
-    std::size_t position;
-  };
 
-  static bool sortBy(HxCDepSortComp& comp, Nodes nodes);
-  static bool sortWithoutBudget(HxCDepSortComp& comp, Nodes nodes);
-  void pushRuns(HxCDepSortComp& comp, Nodes nodes, const Range& range);
+  void pushTies(HxCDepSortComp& comp, HxCDepSortNode** nodes,
+                const Range& range);
 
-  std::vector<Range> m_Open;  // ranges still to sort, the next one at the back
+  HX_Vector<Range> m_Open;  // ranges still to sort, the next range at the back
 };
 
 #endif  // DEPENDENCYSORTING_IMPLDEPENDENCYSORTING_HX_CRITERIASORT_H

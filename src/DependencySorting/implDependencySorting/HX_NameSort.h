@@ -5,23 +5,25 @@
 
 #include <cstddef>
 #include <span>
-#include <vector>
+
+#include "implContainers/HX_Vector.h"
 
 class HxCDepSortNode;
 class KyCXString;
 
-/// The name of \p node; empty for null.
+/// RETURNS: the name of \p node; empty for null.
 const KyCXString& HX_NameOfNode(HxCDepSortNode* node);
 
 /// Gives the order of a selection sort that swaps the first of the smallest
-/// names to the front, in about n log n steps. The object keeps its memory from
-/// batch to batch.
+/// names to the front. The object keeps its memory from batch to batch.
+/// COST: about n log2 n steps.
 class HX_NameSort {
  public:
-  /// \p nodes must outlive the object; batches are numbers of its elements.
-  explicit HX_NameSort(const std::vector<HxCDepSortNode*>& nodes)
+  /// \p nodes must outlive the object; a batch consists of indices of \p nodes.
+  explicit HX_NameSort(const HX_Vector<HxCDepSortNode*>& nodes)
       : m_Nodes(nodes) {}
 
+  /// Throws std::bad_alloc, with \p batch unchanged.
   void sort(std::span<int> batch);
 
  private:
@@ -36,14 +38,16 @@ class HX_NameSort {
   void formGroups();
   const KyCXString& nameOf(int number) const;
 
-  const std::vector<HxCDepSortNode*>& m_Nodes;
-  std::vector<Entry> m_Entries;  // ascending by name
-  // Entries with one name form a group, known by the index of its first entry.
-  std::vector<int> m_GroupOfEntry;
-  std::vector<int> m_GroupAt;    // by position in the batch, moves along
-  std::vector<int> m_Positions;  // per group a heap, the smallest at its front
-  std::vector<int> m_HeapEnd;    // by group
-  std::vector<int> m_Batch;      // copy of the batch
+  const HX_Vector<HxCDepSortNode*>& m_Nodes;
+  HX_Vector<Entry> m_Entries;  // ascending by name
+  HX_Vector<Entry> m_Buffer;   // of the merge sort
+  // Entries with equal names form a group, whose number is the index of its
+  // first entry.
+  HX_Vector<int> m_GroupOfEntry;
+  HX_Vector<int> m_GroupAt;    // by position in the batch; moves along
+  HX_Vector<int> m_Positions;  // one heap per group, smallest position in front
+  HX_Vector<int> m_HeapEnd;    // by group
+  HX_Vector<int> m_Batch;      // copy of the batch
 };
 
 #endif  // DEPENDENCYSORTING_IMPLDEPENDENCYSORTING_HX_NAMESORT_H

@@ -4,8 +4,8 @@
 #include <bit>
 #include <limits>
 
-HX_RankTree::HX_RankTree(std::size_t count)
-    : m_Leaves(std::bit_ceil(count)),
+HX_RankTree::HX_RankTree(int count)
+    : m_Leaves(std::bit_ceil(HX_ToSize(count))),
       m_Largest(2 * m_Leaves, std::numeric_limits<int>::min()) {}
 
 void HX_RankTree::build() {
@@ -13,8 +13,8 @@ void HX_RankTree::build() {
     m_Largest[node] = std::max(m_Largest[2 * node], m_Largest[2 * node + 1]);
 }
 
-void HX_RankTree::set(std::size_t place, int rank) {
-  std::size_t node = m_Leaves + place;
+void HX_RankTree::set(int place, int rank) {
+  std::size_t node = leafOf(place);
   m_Largest[node] = rank;
   while (node > 1) {
     node /= 2;
@@ -24,16 +24,18 @@ void HX_RankTree::set(std::size_t place, int rank) {
   }
 }
 
-std::size_t HX_RankTree::findFrom(std::size_t from, int rank) const {
-  std::size_t node = m_Leaves + from;
+int HX_RankTree::findFrom(int from, int rank) const {
+  std::size_t node = leafOf(from);
+  // Upward to the nearest subtree on the right with a number large enough.
   while (m_Largest[node] < rank) {
-    while (node % 2 == 1) node /= 2;  // the root, 1, leads to 0
-    if (node == 0) return m_Leaves;
+    while (node % 2 == 1) node /= 2;  // from the root, 1, to 0
+    if (node == 0) return static_cast<int>(m_Leaves);
     ++node;
   }
+  // Downward to its first leaf with such a number.
   while (node < m_Leaves) {
     node *= 2;
     if (m_Largest[node] < rank) ++node;
   }
-  return node - m_Leaves;
+  return static_cast<int>(node - m_Leaves);
 }

@@ -1,7 +1,7 @@
-// The hash of a text, for the tables of names.
+// Hash of a text, for tables of names in memory.
 
-#ifndef NAMESPACE_IMPLNAMESPACE_HX_TEXTHASH_H
-#define NAMESPACE_IMPLNAMESPACE_HX_TEXTHASH_H
+#ifndef IMPLCONTAINERS_HX_TEXTHASH_H
+#define IMPLCONTAINERS_HX_TEXTHASH_H
 
 #include <cstddef>
 #include <cstdint>
@@ -23,8 +23,9 @@ inline std::uint64_t mixed(std::uint64_t hash, std::uint64_t word) {
 
 }  // namespace hx_detail
 
-/// Takes eight characters a step; the last step may look at some of them again.
-/// Depends on the byte order of the machine: only for tables in memory.
+/// COST: one multiplication per eight characters. The last step may read
+/// characters of the step before once more. The result depends on the byte
+/// order of the machine.
 inline int HX_TextHash(const char* text, std::size_t length) {
   using hx_detail::mixed;
   using hx_detail::wordAt;
@@ -45,4 +46,4 @@ inline int HX_TextHash(const char* text, std::size_t length) {
   return static_cast<int>(mixed(hash, 0) >> 32);
 }
 
-#endif  // NAMESPACE_IMPLNAMESPACE_HX_TEXTHASH_H
+#endif  // IMPLCONTAINERS_HX_TEXTHASH_H

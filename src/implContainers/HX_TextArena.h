@@ -1,13 +1,13 @@
-// Memory for many texts that live and go together.
+// Arena of texts: all texts die with the arena.
 //
 //   HX_TextArena texts;
-//   const char* kept = texts.add("speed", 5);   // null if there is no memory
+//   const char* kept = texts.add("speed", 5);   // null without memory
 //
-// A text costs its characters and a zero, and the memory controller is asked
-// once for some hundreds of them.
+// COST: length + 1 bytes per text, one block of the memory controller per 16000
+// bytes, some hundreds of names.
 
-#ifndef NAMESPACE_HX_TEXTARENA_H
-#define NAMESPACE_HX_TEXTARENA_H
+#ifndef IMPLCONTAINERS_HX_TEXTARENA_H
+#define IMPLCONTAINERS_HX_TEXTARENA_H
 
 #include <algorithm>
 #include <cstddef>
@@ -15,7 +15,7 @@
 
 #include "Control/HX_Allocated.h"
 
-/// Not copied: an arena belongs to one owner.
+/// OWNERSHIP: not copied, an arena belongs to one owner.
 class HX_TextArena {
  public:
   HX_TextArena() = default;
@@ -29,9 +29,9 @@ class HX_TextArena {
     }
   }
 
-  /// A copy of the \p length characters at \p text, with a zero behind them,
-  /// which stays in its place until the arena goes; null, with nothing
-  /// changed, if there is no memory.
+  /// Copies \p length characters of \p text and appends a zero.
+  /// RETURNS: the copy, valid until the arena dies; null, with nothing changed,
+  /// without memory.
   const char* add(const char* text, std::size_t length) {
     if (length >= m_Left && !addChunk(length + 1)) return nullptr;
     char* const kept = m_Next;
@@ -42,7 +42,7 @@ class HX_TextArena {
     return kept;
   }
 
-  /// Takes back the text that add() gave last, with its \p length.
+  /// Removes the text of the last add(), which had \p length characters.
   void dropLast(std::size_t length) {
     m_Next -= length + 1;
     m_Left += length + 1;
@@ -54,7 +54,7 @@ class HX_TextArena {
   };
   static constexpr std::size_t kChunkSize = 16000;  // characters
 
-  // What is left of the chunk before stays unused.
+  // The rest of the chunk before stays unused.
   bool addChunk(std::size_t wanted) {
     const std::size_t size = std::max(wanted, kChunkSize);
     void* const room = HX_Allocate(sizeof(Chunk) + size);
@@ -69,7 +69,7 @@ class HX_TextArena {
 
   Chunk* m_Newest = nullptr;
   char* m_Next = nullptr;  // in the newest chunk
-  std::size_t m_Left = 0;  // characters, from there
+  std::size_t m_Left = 0;  // characters from m_Next on
 };
 
-#endif  // NAMESPACE_HX_TEXTARENA_H
+#endif  // IMPLCONTAINERS_HX_TEXTARENA_H

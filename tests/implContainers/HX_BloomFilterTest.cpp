@@ -1,4 +1,4 @@
-#include "NameSpace/HX_KeyFilter.h"
+#include "implContainers/HX_BloomFilter.h"
 
 #include <gtest/gtest.h>
 
@@ -7,9 +7,9 @@
 
 namespace {
 
-TEST(KeyFilterTest, PassesEveryKeyOfTheTableAndFewOthers) {
-  HX_KeyTable<int> table;
-  HX_KeyFilter filter;
+TEST(BloomFilterTest, PassesEveryKeyOfTheTableAndFewOthers) {
+  HX_HashTable<int, int> table;
+  HX_BloomFilter filter;
   std::unordered_set<int> keys;
   std::mt19937 random(1);
   const auto draw = [&] { return static_cast<int>(random()); };
@@ -20,7 +20,7 @@ TEST(KeyFilterTest, PassesEveryKeyOfTheTableAndFewOthers) {
     filter.noteAdded(key, table);
     if (keys.size() % 1000 != 0) continue;
     for (int held : keys) ASSERT_TRUE(filter.mayHold(held));
-    if (keys.size() == 1000) continue;  // it has no bits yet
+    if (keys.size() == 1000) continue;  // no bits yet
     int passed = 0;
     constexpr int kTries = 16000;
     for (int i = 0; i < kTries; ++i) passed += filter.mayHold(draw()) ? 1 : 0;

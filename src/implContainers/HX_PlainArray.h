@@ -1,20 +1,19 @@
-// A growing array of plain values whose memory may run out.
+// Growing array of plain values. Unlike std::vector, append() returns false
+// without memory instead of throwing; blocks come from HX_Allocate().
 //
 //   HX_PlainArray<Entry*> entries;
 //   if (!entries.append(entry)) return nullptr;   // unchanged
-//
-// Unlike std::vector it asks the library's allocation functions and says no
-// instead of throwing.
 
-#ifndef NAMESPACE_HX_PLAINARRAY_H
-#define NAMESPACE_HX_PLAINARRAY_H
+#ifndef IMPLCONTAINERS_HX_PLAINARRAY_H
+#define IMPLCONTAINERS_HX_PLAINARRAY_H
 
 #include <cstring>
 #include <type_traits>
 
 #include "Control/HX_Allocated.h"
 
-/// Not copied: an array belongs to one owner. Indices are not checked.
+/// OWNERSHIP: not copied, an array belongs to one owner. Indices are not
+/// checked.
 template <class Value>
 class HX_PlainArray {
   static_assert(std::is_trivially_copyable_v<Value>);
@@ -25,7 +24,7 @@ class HX_PlainArray {
   HX_PlainArray& operator=(const HX_PlainArray&) = delete;
   ~HX_PlainArray() { HX_Free(m_Values); }
 
-  /// The number of values.
+  /// Number of values.
   unsigned size() const { return m_Size; }
   /// Valid until the next append().
   const Value& operator[](unsigned index) const { return m_Values[index]; }
@@ -33,17 +32,17 @@ class HX_PlainArray {
   const Value* begin() const { return m_Values; }
   const Value* end() const { return m_Values + m_Size; }
 
-  /// \return false, with nothing changed, if there is no memory
+  /// RETURNS: false, with nothing changed, without memory.
   bool append(const Value& value) {
     if (m_Size == m_Capacity && !grow()) return false;
     m_Values[m_Size++] = value;
     return true;
   }
-  /// Takes the last value away; the array must not be empty.
+  /// Removes the last value. REQUIRES: size() > 0.
   void dropLast() { --m_Size; }
 
  private:
-  // The values may be pointers: their own size is meant.
+  // sizeof a pointer is meant where Value is a pointer.
   // NOLINTBEGIN(bugprone-sizeof-expression)
   bool grow() {
     const unsigned capacity = m_Capacity == 0 ? 4 : m_Capacity * 2;
@@ -62,4 +61,4 @@ class HX_PlainArray {
   unsigned m_Capacity = 0;
 };
 
-#endif  // NAMESPACE_HX_PLAINARRAY_H
+#endif  // IMPLCONTAINERS_HX_PLAINARRAY_H
