@@ -1,16 +1,16 @@
 // Walks the elements of a collection, one at a time.
 //
-//   HX_Iterator<const HxCSrcRef*>* it = set.createIterator();
+//   std::unique_ptr<HX_Iterator<const HxCSrcRef*>> it(set.createIterator());
+//   if (it == nullptr) return;   // no memory
 //   for (; !it->isDone(); it->next()) use(it->currentItem());
-//   delete it;
 
 #ifndef SOURCEREF_HX_ITERATOR_H
 #define SOURCEREF_HX_ITERATOR_H
 
 #include "Control/HX_Allocated.h"
 
-/// Stands at the first element from its creation. It looks into the collection
-/// and is valid only while that is neither changed nor destroyed.
+/// An iterator starts at the first element. The iterator is valid while the
+/// collection is neither changed nor destroyed.
 template <class T>
 class HX_Iterator : public HX_Allocated {
  public:
@@ -21,12 +21,13 @@ class HX_Iterator : public HX_Allocated {
 
   /// Goes back to the first element.
   virtual void first() = 0;
-  /// Does nothing behind the last element.
+  /// Goes to the next element; does nothing behind the last element.
   virtual void next() = 0;
   /// True behind the last element.
   virtual bool isDone() const = 0;
-  /// The current element. Behind the last one it throws the int -1, the only
-  /// exception of the library: ask isDone() first.
+  /// RETURNS: the current element.
+  /// REQUIRES: isDone() is false. Behind the last element the operation throws
+  /// the int -1, the only exception of the library.
   virtual T currentItem() const = 0;
 };
 

@@ -1,5 +1,8 @@
 #include "SourceRef/HxCBlockSrcRef.h"
 
+#include <utility>
+
+#include "Control/HX_Memory.h"
 #include "platform/matlab/HX_SimulinkInterface.h"
 #include "platform/model/HX_Block.h"
 #include "platform/model/HX_SlBlockHandlesDB.h"
@@ -7,7 +10,7 @@
 
 HxCBlockSrcRef::HxCBlockSrcRef(HX_Block* block) : m_pBlock(block) {}
 
-// Not the base's copy: each block reference has a number of its own.
+// Base by default construction, because a copy draws a new number.
 HxCBlockSrcRef::HxCBlockSrcRef(const HxCBlockSrcRef& other)
     : HxCSrcRef(), m_pBlock(other.m_pBlock) {}
 
@@ -20,8 +23,12 @@ void HxCBlockSrcRef::toString(KyCXString& text) const {
     text = "";
     return;
   }
-  m_pBlock->getFullPathName(text, false, false);
-  text.replaceWhiteSpace(' ', false);
+  HX_WithinMemory([&] {
+    KyCXString path;
+    m_pBlock->getFullPathName(path, false, false);
+    path.replaceWhiteSpace(' ', false);
+    text = std::move(path);
+  });
 }
 
 double HxCBlockSrcRef::getBlockHandle() const {

@@ -7,8 +7,10 @@
 
 class HX_Block;
 
-/// Created and owned by the block model alone; the block is not owned and may
-/// be null.
+/// OWNERSHIP: the block model alone creates and owns block references. The
+/// block may be null; a reference never owns the block.
+/// The copy constructor and clone() draw a new number; assignment takes over
+/// the number.
 class HX_UTILS_API HxCBlockSrcRef : public HxCSrcRef {
  public:
   ~HxCBlockSrcRef() override;
@@ -16,24 +18,25 @@ class HX_UTILS_API HxCBlockSrcRef : public HxCSrcRef {
   HxCBlockSrcRef& operator=(const HxCBlockSrcRef&) = default;
 
   const HxCBlockSrcRef* isBlock() const override;
-  /// The block's full path with blanks for white space; empty without a block.
+  /// Replaces \p text by the full path of the block, with blanks for white
+  /// space; by the empty text without a block.
   void toString(KyCXString& text) const override;
 
-  /// The block; null if there is none.
+  /// The block; null if the reference has no block.
   HX_Block* getBlock() const { return m_pBlock; }
   void setBlock(HX_Block* block) { m_pBlock = block; }
 
-  /// The handle of the block in the model; HX_SimulinkInterface's invalid
-  /// handle without a block.
+  /// The handle of the block in the model. Without a block: the invalid handle
+  /// of HX_SimulinkInterface.
   double getBlockHandle() const;
 
  private:
   friend class HX_Block;
 
-  explicit HxCBlockSrcRef(HX_Block* block);
-  /// A reference to the same block with a number of its own.
+  HxCBlockSrcRef(HX_Block* block);
+  /// A reference to the same block with a new number.
   HxCBlockSrcRef(const HxCBlockSrcRef& other);
-  /// The same; a plain reference if there is no block.
+  /// As the copy constructor; without a block a plain HxCSrcRef.
   HxCSrcRef* clone() const override;
 
   HX_Block* m_pBlock;

@@ -2,8 +2,19 @@
 
 #include <utility>
 
+#include "Control/HX_Memory.h"
 #include "Strings/HX_StringParser.h"
 #include "platform/datadictionary/HX_DataDictionary.h"
+
+namespace {
+
+KyCXString pathOf(unsigned long handle) {
+  KyCXString path;
+  if (HX_DataDictionary::getObjectFullPathName(handle, path)) return path;
+  return "Handle: " + KyCXString(handle, false, true);
+}
+
+}  // namespace
 
 HxCDdSrcRef::HxCDdSrcRef(unsigned long handle) : m_Handle(handle) {}
 
@@ -12,17 +23,15 @@ HxCDdSrcRef::~HxCDdSrcRef() = default;
 const HxCDdSrcRef* HxCDdSrcRef::isDd() const { return this; }
 
 void HxCDdSrcRef::toString(KyCXString& text) const {
-  KyCXString path;
-  getDdPath(path);
-  HX_StringParser().processDDPath(path, text);
+  HX_WithinMemory([&] {
+    KyCXString readable;
+    HX_StringParser().processDDPath(pathOf(m_Handle), readable);
+    text = std::move(readable);
+  });
 }
 
 HxCSrcRef* HxCDdSrcRef::clone() const { return new HxCDdSrcRef(*this); }
 
 void HxCDdSrcRef::getDdPath(KyCXString& path) const {
-  KyCXString found;
-  if (HX_DataDictionary::getObjectFullPathName(m_Handle, found))
-    path = std::move(found);
-  else
-    path = "Handle: " + KyCXString(m_Handle, false, true);
+  HX_WithinMemory([&] { path = pathOf(m_Handle); });
 }

@@ -4,8 +4,10 @@
 #include <bit>
 #include <cstdint>
 #include <memory>
+#include <utility>
 #include <vector>
 
+#include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
 #include "platform/matlab/HX_MxArrayConverter.h"
 #include "platform/matlab/HX_SimulinkInterface.h"
@@ -34,20 +36,24 @@ bool readHandle(mxArray* object, double& handle) {
   return HX_MxArrayConverter().mxArrayToDouble(value.get(), handle);
 }
 
-// The handles met on a climb, as bit patterns: even a NaN is met only once.
+// Handle of the object that the latest getBlockName() read.
+double s_ObjectHandle = 0.0;
+
+// Handles met on a climb, as bit patterns, so that NaN equals NaN.
 class MetHandles {
  public:
   /// False if \p handle was entered before.
   bool enter(double handle) {
     const auto bits = std::bit_cast<std::uint64_t>(handle);
-    if (std::find(m_Met.begin(), m_Met.end(), bits) != m_Met.end())
+    if (std::find(m_Handles.begin(), m_Handles.end(), bits) != m_Handles.end())
       return false;
-    m_Met.push_back(bits);
+    m_Handles.push_back(bits);
     return true;
   }
 
  private:
-  std::vector<std::uint64_t> m_Met;  // few: one per level of the model
+  // Few: one per level of the model.
+  std::vector<std::uint64_t, HX_ControllerAllocator<std::uint64_t>> m_Handles;
 };
 
 }  // namespace
@@ -62,33 +68,37 @@ const HxCInputBlockSrcRef* HxCInputBlockSrcRef::isInputBlock() const {
 }
 
 void HxCInputBlockSrcRef::toString(KyCXString& text) const {
-  MetHandles met;
-  OwnedArray object(mxCreateScalarDouble(getBlockHandle()));
-  bool isFirst = true;
-  for (bool atRoot = false; !atRoot; isFirst = false) {
-    KyCXString name;
-    mxArray* parent = nullptr;
-    double handle = HX_SimulinkInterface::s_invalidHandle;
-    const bool success =
-        getBlockName(object.get(), name, handle, parent, atRoot);
-    object.reset(parent);
-    if (!success) break;
-    const bool isNew = met.enter(handle);
-    if (!HX_DebugCheck(isNew, "isNew")) break;
-    text = isFirst ? name : name + "/" + text;
-  }
-  text.replaceWhiteSpace(' ', false);
+  HX_WithinMemory([&] {
+    KyCXString path(text);
+    MetHandles met;
+    OwnedArray object(mxCreateScalarDouble(getBlockHandle()));
+    bool isFirst = true;
+    for (bool atRoot = false; !atRoot; isFirst = false) {
+      KyCXString name;
+      mxArray* parent = nullptr;
+      const bool success = getBlockName(object.get(), name, parent, atRoot);
+      object.reset(parent);
+      if (!success) break;
+      const bool isNew = met.enter(s_ObjectHandle);
+      if (!HX_DebugCheck(isNew, "isNew")) break;
+      path = isFirst ? name : name + "/" + path;
+    }
+    path.replaceWhiteSpace(' ', false);
+    text = std::move(path);
+  });
 }
 
 bool HxCInputBlockSrcRef::getBlockName(mxArray* object, KyCXString& name,
-                                       double& handle, mxArray*& parent,
-                                       bool& atRoot) const {
+                                       mxArray*& parent, bool& atRoot) const {
+  atRoot = false;
+  name = "";
+  parent = nullptr;
   const bool hasName = readName(object, name);
   const OwnedArray root(mxCreateString(GLB_GetFullSystemPath().cstring()));
   double rootHandle = HX_SimulinkInterface::s_invalidHandle;
   const bool hasRoot = readHandle(root.get(), rootHandle);
-  const bool hasHandle = readHandle(object, handle);
-  atRoot = hasRoot && hasHandle && handle == rootHandle;
+  const bool hasHandle = readHandle(object, s_ObjectHandle);
+  atRoot = hasRoot && hasHandle && s_ObjectHandle == rootHandle;
   parent = read(object, "Parent").release();
   const bool success = hasName && hasRoot && hasHandle && parent != nullptr;
   return HX_DebugCheck(success, "success");

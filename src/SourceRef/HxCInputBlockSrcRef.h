@@ -13,42 +13,47 @@
 
 class HX_InputBlockId;
 
-/// Created and owned by the model reader. The identifier is not owned; it must
-/// outlive the reference, its copies and its clones. Copies keep the number.
+/// OWNERSHIP: the model reader creates and owns input block references. The
+/// identifier is not owned and must outlive the reference, copies and clones.
+/// Copies keep the number.
 class HX_UTILS_API HxCInputBlockSrcRef : public HxCSrcRef {
  public:
   /// A reference to the block that \p id names.
-  explicit HxCInputBlockSrcRef(const HX_InputBlockId& id);
+  HxCInputBlockSrcRef(const HX_InputBlockId& id);
   HxCInputBlockSrcRef(const HxCInputBlockSrcRef&) = default;
   HxCInputBlockSrcRef& operator=(const HxCInputBlockSrcRef&) = default;
   ~HxCInputBlockSrcRef() override;
 
   const HxCInputBlockSrcRef* isInputBlock() const override;
 
-  /// The names from the generated system down to the block, both included, with
-  /// '/' between them and a blank for each white space character.
+  /// Replaces \p text by the names from the generated system down to the block,
+  /// both included, with '/' between names and blanks for white space.
   ///
-  /// The path is read from the model on each call, four parameters per level. A
-  /// block outside the generated system shows the names from its model down.
-  /// The climb ends, with the names found so far, at an object that cannot be
-  /// read (a failed debug check "success") or that was met before, as in a
-  /// damaged model whose parents form a loop (a failed debug check "isNew").
-  /// If already the block itself or the generated system cannot be read, \p
-  /// text keeps its characters but for the white space.
+  /// Climbs from the block through the parents. A block outside the generated
+  /// system gives the names from its model down. The climb ends early, with the
+  /// names found so far:
+  ///   - at an object that cannot be read: failed debug check "success";
+  ///   - at an object met before, in a damaged model whose parents form a loop:
+  ///     failed debug check "isNew".
+  /// If the first step fails, \p text changes only in white space.
+  /// COST: four parameters of the model per level, read on each call.
   void toString(KyCXString& text) const override;
 
-  /// A reference to the same block with a number of its own.
+  /// A reference to the same block with a new number.
   HxCSrcRef* clone() const override;
 
-  /// The block's handle in the model.
+  /// The handle of the block in the model.
   double getBlockHandle() const;
 
  private:
-  // One step of the climb: reads \p object's name and handle, and whether it is
-  // the generated system. The caller owns \p parent, the array that names the
-  // parent, whatever the result; false if something could not be read.
-  bool getBlockName(mxArray* object, KyCXString& name, double& handle,
-                    mxArray*& parent, bool& atRoot) const;
+  /// One step of the climb.
+  /// \param[out] name  name of \p object; empty if the name cannot be read
+  /// \param[out] parent  array that names the parent, or null
+  /// \param[out] atRoot  \p object is the generated system
+  /// OWNERSHIP: the caller owns \p parent, also if the result is false.
+  /// RETURNS: false if a parameter could not be read.
+  bool getBlockName(mxArray* object, KyCXString& name, mxArray*& parent,
+                    bool& atRoot) const;
 
   const HX_InputBlockId* m_pInputBlock;
 };

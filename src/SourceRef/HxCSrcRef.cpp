@@ -4,6 +4,7 @@
 #include <istream>
 #include <ostream>
 
+#include "Control/HX_Memory.h"
 #include "platform/dump/HX_Dump.h"
 
 int HxCSrcRef::m_sSrcRefCounter = 0;
@@ -13,10 +14,18 @@ HxCSrcRef::HxCSrcRef() : m_Id(m_sSrcRefCounter++) {}
 HxCSrcRef::~HxCSrcRef() = default;
 
 HX_Dump* HxCSrcRef::dump(HX_Dump* dumper, bool) {
-  dumper->openObject(this, "HxCSrcRef");
+  // All texts before the section, because an open section has to be closed.
+  KyCXString className;
+  KyCXString label;
   KyCXString text;
-  toString(text);
-  dumper->writeEntry("Source:", text, 0);
+  const bool hasTexts = HX_WithinMemory([&] {
+    className = "HxCSrcRef";
+    label = "Source:";
+    toString(text);
+  });
+  if (!hasTexts) return dumper;
+  dumper->openObject(this, className);
+  dumper->writeEntry(label, text, 0);
   dumper->closeObject(this);
   return dumper;
 }
@@ -35,7 +44,9 @@ const HxCInternalSrcRef* HxCSrcRef::isInternal() const { return nullptr; }
 
 const HxCInputBlockSrcRef* HxCSrcRef::isInputBlock() const { return nullptr; }
 
-void HxCSrcRef::toString(KyCXString& text) const { text += "Unknown source"; }
+void HxCSrcRef::toString(KyCXString& text) const {
+  HX_WithinMemory([&] { text += "Unknown source"; });
+}
 
 HxCSrcRef* HxCSrcRef::clone() const { return new HxCSrcRef(*this); }
 

@@ -1,5 +1,6 @@
 #include "SourceRef/HxCSrcRefCompare.h"
 
+#include "Control/HX_Memory.h"
 #include "SourceRef/HxCDdSrcRef.h"
 #include "platform/strings/KyCXString.h"
 
@@ -11,10 +12,16 @@ bool isFromDD(const HxCSrcRef* srcRef) {
   return srcRef != nullptr && srcRef->isDd() != nullptr;
 }
 
-bool isFromUserScript(const HxCSrcRef* ddSrcRef) {
-  KyCXString path;
-  ddSrcRef->isDd()->getDdPath(path);
-  return path.contains(kUserScriptFolder);
+enum Origin { eUnknown, eUserScript, eOther };
+
+// eUnknown: memory ran out; a path is never empty.
+Origin originOf(const HxCSrcRef* ddSrcRef) {
+  return HX_WithinMemory(eUnknown, [&] {
+    KyCXString path;
+    ddSrcRef->isDd()->getDdPath(path);
+    if (path.isEmpty()) return eUnknown;
+    return path.contains(kUserScriptFolder) ? eUserScript : eOther;
+  });
 }
 
 }  // namespace
@@ -41,11 +48,12 @@ bool HxCSrcRefCompare::onlyOneFromDD(const HxCSrcRef* a, const HxCSrcRef* b,
 
 bool HxCSrcRefCompare::bothFromUserScript(const HxCSrcRef* a,
                                           const HxCSrcRef* b) const {
-  return bothFromDD(a, b) && isFromUserScript(a) && isFromUserScript(b);
+  return bothFromDD(a, b) && originOf(a) == eUserScript &&
+         originOf(b) == eUserScript;
 }
 
 bool HxCSrcRefCompare::differentDdSrcRefNotFromUserScript(
     const HxCSrcRef* a, const HxCSrcRef* b) const {
-  return bothFromDDButDifferent(a, b) && !isFromUserScript(a) &&
-         !isFromUserScript(b);
+  return bothFromDDButDifferent(a, b) && originOf(a) == eOther &&
+         originOf(b) == eOther;
 }

@@ -1,5 +1,5 @@
-// How two source references relate: do they stem from the data dictionary, and
-// did a user script make the objects?
+// Relation of two source references: are both from the data dictionary, and did
+// a user script make the objects?
 //
 //   int which = 0;
 //   if (HxCSrcRefCompare().onlyOneFromDD(a, b, which)) use(which == 0 ? a : b);
@@ -12,25 +12,26 @@
 
 class HxCSrcRef;
 
-/// Holds no data. Every reference may be null, which stems from nowhere. An
-/// object of the data dictionary counts as made by a user script if its path
-/// contains "CGTmpData", in this case of letters.
+/// Class without data. Every reference may be null; null is not from the data
+/// dictionary. A user script made an object if the path of the object contains
+/// "CGTmpData", in this case of letters. The two questions about user scripts
+/// answer false if memory runs out.
 class HX_UTILS_API HxCSrcRefCompare : public HX_Allocated {
  public:
   HxCSrcRefCompare() = default;
 
-  /// Both stem from the data dictionary.
+  /// Both are from the data dictionary.
   bool bothFromDD(const HxCSrcRef* a, const HxCSrcRef* b) const;
 
-  /// Both stem from the data dictionary, from objects with different handles.
+  /// Both are from the data dictionary, from objects with different handles.
   bool bothFromDDButDifferent(const HxCSrcRef* a, const HxCSrcRef* b) const;
 
-  /// Exactly one stems from the data dictionary.
+  /// Exactly one reference is from the data dictionary.
   /// \param[out] which  0 for \p a, 1 for \p b, -1 for neither; not written
-  ///   if both do
+  ///   if both are
   bool onlyOneFromDD(const HxCSrcRef* a, const HxCSrcRef* b, int& which) const;
 
-  /// Both stem from the data dictionary, from objects of user scripts.
+  /// Both are from the data dictionary, from objects of user scripts.
   bool bothFromUserScript(const HxCSrcRef* a, const HxCSrcRef* b) const;
 
   /// bothFromDDButDifferent(), and neither object is from a user script.

@@ -1,5 +1,7 @@
 #include "SourceRef/HxCSrcRefServer.h"
 
+#include <memory>
+
 #include "SourceRef/HxCInternalSrcRef.h"
 
 HxCSrcRefServer::~HxCSrcRefServer() {
@@ -7,10 +9,11 @@ HxCSrcRefServer::~HxCSrcRefServer() {
 }
 
 HxCInternalSrcRef* HxCSrcRefServer::getSrcRef() {
-  auto* srcRef = new HxCInternalSrcRef;
-  // A search for what was just made would make a long run quadratic.
-  if (srcRef != nullptr) m_SrcRefs.appendNew(srcRef);
-  return srcRef;
+  std::unique_ptr<HxCInternalSrcRef> srcRef(new HxCInternalSrcRef);
+  // Without a search, because a search for every reference makes a long run
+  // quadratic.
+  if (srcRef == nullptr || !m_SrcRefs.appendNew(srcRef.get())) return nullptr;
+  return srcRef.release();
 }
 
 int HxCSrcRefServer::getSpecificSrcRefFromSet(const HxCSrcRefSet* set,

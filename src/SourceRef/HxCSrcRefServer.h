@@ -1,8 +1,9 @@
-// Hands out references to places in the generator's own code, and sorts the
-// references of an item by what a message can say about them.
+// Hands out references to places in the code of the generator, and sorts the
+// references of an item by kind.
 //
 //   HxCSrcRefServer server;
-//   server.getSrcRef()->setLocation("reader.cpp", 12);
+//   if (HxCInternalSrcRef* here = server.getSrcRef())   // null: no memory
+//     here->setLocation("reader.cpp", 12);
 //
 //   const HxCSrcRef* block = nullptr;
 //   HxCSrcRefServer::getSpecificSrcRefFromSet(&set, &block, nullptr, nullptr);
@@ -16,31 +17,31 @@
 
 class HxCInternalSrcRef;
 
-/// One per run, created by the host. Not copied: two servers would delete the
-/// same references.
+/// One server per run, created by the host. Not copied, because two servers
+/// would delete the same references.
 class HX_UTILS_API HxCSrcRefServer : public HX_Allocated {
  public:
   HxCSrcRefServer() = default;
   HxCSrcRefServer(const HxCSrcRefServer&) = delete;
   HxCSrcRefServer& operator=(const HxCSrcRefServer&) = delete;
-  /// Deletes every reference it handed out.
+  /// Deletes every reference of getSrcRef().
   ~HxCSrcRefServer();
 
-  /// \return true; there is nothing to do
+  /// \return true; the operation does nothing else
   bool boot() { return true; }
-  /// \return true; the references live on until the server is destroyed
+  /// \return true; all references stay until the server is destroyed
   bool shutdown() { return true; }
 
-  /// A new reference with file "file unknown!", line -1 and cause "cause
-  /// unknown!", owned by the server; the caller may set all three. Null if
-  /// there is no memory.
+  /// RETURNS: a new reference with file "file unknown!", line -1 and cause
+  /// "cause unknown!"; the caller may set all three. Null if memory runs out.
+  /// OWNERSHIP: the server owns the reference.
   HxCInternalSrcRef* getSrcRef();
 
   /// Sorts the references of \p set into blocks (input blocks included), data
-  /// dictionary objects and all others, and stores the last one of each sort;
-  /// null where there is none, and everywhere for a null \p set.
+  /// dictionary objects and all others, and stores the last reference of every
+  /// kind. Stores null for a kind without a reference; \p set may be null.
   /// \param[out] blockRef, ddRef, otherRef  null for a result not wanted
-  /// \return 0, which tells nothing
+  /// \return 0, without meaning
   static int getSpecificSrcRefFromSet(const HxCSrcRefSet* set,
                                       const HxCSrcRef** blockRef,
                                       const HxCSrcRef** ddRef,

@@ -8,7 +8,7 @@ namespace {
 using SrcRefIterator = HX_Iterator<const HxCSrcRef*>;
 
 constexpr int kBehindTheEnd = -1;          // thrown by currentItem()
-constexpr std::size_t kFirstCapacity = 4;  // few items have more sources
+constexpr std::size_t kFirstCapacity = 4;  // few items have more references
 
 class EmptyIterator : public SrcRefIterator {
  public:
@@ -35,10 +35,10 @@ class SingleIterator : public SrcRefIterator {
   bool m_IsDone = false;
 };
 
+template <class List>
 class ListIterator : public SrcRefIterator {
  public:
-  explicit ListIterator(const std::vector<const HxCSrcRef*>& list)
-      : m_List(list) {}
+  explicit ListIterator(const List& list) : m_List(list) {}
 
   void first() override { m_Index = 0; }
   void next() override {
@@ -51,7 +51,7 @@ class ListIterator : public SrcRefIterator {
   }
 
  private:
-  const std::vector<const HxCSrcRef*>& m_List;  // of the set
+  const List& m_List;  // of the set
   std::size_t m_Index = 0;
 };
 
@@ -59,59 +59,82 @@ class ListIterator : public SrcRefIterator {
 
 HxCSrcRefSet& HxCSrcRefSet::operator=(const HxCSrcRefSet& other) {
   if (this == &other) return *this;
-  clear();
   if (other.getSrcRefCnt() < 2) {
-    m_Content.one = other.getASrcRef();
+    const HxCSrcRef* const one = other.getASrcRef();
+    clear();
+    m_Content.one = one;
     return *this;
   }
-  m_Content.list = new List(*other.m_Content.list);
+  List* const copy = HX_WithinMemory<List*>(
+      nullptr, [&] { return new List(*other.m_Content.list); });
+  if (copy == nullptr) return *this;
+  clear();
+  m_Content.list = copy;
   m_IsSingle = false;
   return *this;
 }
 
 void HxCSrcRefSet::addSrcRef(const HxCSrcRefSet& other) {
   if (this == &other) return;
-  other.forEach([this](const HxCSrcRef* srcRef) { addSrcRef(srcRef); });
+  const int count = getSrcRefCnt();
+  bool isComplete = true;
+  other.forEach([&](const HxCSrcRef* srcRef) {
+    if (m_IsSingle && m_Content.one == nullptr)
+      m_Content.one = srcRef;
+    else
+      isComplete = isComplete && addToNonEmpty(srcRef);
+  });
+  if (!isComplete) keepFirst(count);
 }
 
-void HxCSrcRefSet::addToNonEmpty(const HxCSrcRef* srcRef) {
-  if (srcRef != nullptr && !contains(srcRef)) appendNew(srcRef);
+bool HxCSrcRefSet::addToNonEmpty(const HxCSrcRef* srcRef) {
+  return srcRef == nullptr || contains(srcRef) || appendNew(srcRef);
 }
 
-void HxCSrcRefSet::appendNew(const HxCSrcRef* srcRef) {
-  if (m_IsSingle && m_Content.one == nullptr) {
+bool HxCSrcRefSet::appendNew(const HxCSrcRef* srcRef) {
+  if (!m_IsSingle)
+    return HX_WithinMemory([&] { m_Content.list->refs.push_back(srcRef); });
+  if (m_Content.one == nullptr) {
     m_Content.one = srcRef;
-    return;
+    return true;
   }
-  if (m_IsSingle) changeToList();
-  m_Content.list->push_back(srcRef);
+  List* const list = new List;
+  if (list == nullptr) return false;
+  if (!HX_WithinMemory([&] { list->refs.reserve(kFirstCapacity); })) {
+    delete list;
+    return false;
+  }
+  list->refs.push_back(m_Content.one);
+  list->refs.push_back(srcRef);
+  m_Content.list = list;
+  m_IsSingle = false;
+  return true;
 }
 
 bool HxCSrcRefSet::contains(const HxCSrcRef* srcRef) const {
   if (m_IsSingle) return m_Content.one == srcRef;
-  const auto end = m_Content.list->end();
-  return std::find(m_Content.list->begin(), end, srcRef) != end;
+  const auto& refs = m_Content.list->refs;
+  return std::find(refs.begin(), refs.end(), srcRef) != refs.end();
 }
 
-void HxCSrcRefSet::changeToList() {
-  auto* list = new List;
-  list->reserve(kFirstCapacity);
-  list->push_back(m_Content.one);
-  m_Content.list = list;
-  m_IsSingle = false;
+void HxCSrcRefSet::keepFirst(int count) {
+  if (count == 0)
+    clear();
+  else if (!m_IsSingle)
+    m_Content.list->refs.resize(static_cast<std::size_t>(count));
 }
 
 int HxCSrcRefSet::getSrcRefCnt() const {
-  if (!m_IsSingle) return static_cast<int>(m_Content.list->size());
+  if (!m_IsSingle) return static_cast<int>(m_Content.list->refs.size());
   return m_Content.one != nullptr ? 1 : 0;
 }
 
 const HxCSrcRef* HxCSrcRefSet::getASrcRef() const {
-  return m_IsSingle ? m_Content.one : m_Content.list->front();
+  return m_IsSingle ? m_Content.one : m_Content.list->refs.front();
 }
 
 SrcRefIterator* HxCSrcRefSet::createIterator() const {
-  if (!m_IsSingle) return new ListIterator(*m_Content.list);
+  if (!m_IsSingle) return new ListIterator(m_Content.list->refs);
   if (m_Content.one != nullptr) return new SingleIterator(m_Content.one);
   return new EmptyIterator;
 }

@@ -4,8 +4,8 @@
 //   sources.addSrcRef(variable.getDdSrcRef());
 //   sources.forEach([](const HxCSrcRef* ref) { print(ref); });
 //
-// Nearly every item stems from one object, so a set is a single pointer until a
-// second, different reference arrives; only then it asks for memory.
+// Nearly every item stems from one object. A set is a single pointer until a
+// second, different reference arrives, and takes memory only then.
 
 #ifndef SOURCEREF_HXCSRCREFSET_H
 #define SOURCEREF_HXCSRCREFSET_H
@@ -13,58 +13,65 @@
 #include <vector>
 
 #include "Control/HX_Allocated.h"
+#include "Control/HX_Memory.h"
 #include "HX_Export.h"
 #include "SourceRef/HX_Iterator.h"
 #include "SourceRef/HxCSrcRef.h"
 
-/// Each reference is in it once, in the order of insertion; two references are
-/// the same if they are the same object. References are neither copied nor
-/// owned, and null is never an element. Copying copies the pointers.
+/// Set of references in the order of insertion. Two references are equal if
+/// both are the same object. Null is never an element.
+///
+/// OWNERSHIP: a set neither copies nor owns references; copying a set copies
+/// pointers.
+/// If memory runs out, the set keeps the references from before the call; a
+/// copy constructor leaves the empty set.
 class HX_UTILS_API HxCSrcRefSet : public HX_Allocated {
  public:
   HxCSrcRefSet() = default;
   /// The set of \p srcRef; the empty set for null.
   HxCSrcRefSet(const HxCSrcRef* srcRef) : m_Content{srcRef} {}
-  HxCSrcRefSet(const HxCSrcRefSet& other) { *this = other; }
+  HxCSrcRefSet(const HxCSrcRefSet& other) : HX_Allocated() { *this = other; }
   virtual ~HxCSrcRefSet() { clear(); }
 
-  /// A copy of a set with one reference or none holds no memory.
+  /// A copy of a set with at most one reference takes no memory.
   HxCSrcRefSet& operator=(const HxCSrcRefSet& other);
 
-  /// Adds \p srcRef unless it is null or already there. Cost: linear in the
-  /// size of the set.
+  /// Adds \p srcRef unless \p srcRef is null or in the set.
+  /// COST: linear in the size of the set.
   void addSrcRef(const HxCSrcRef* srcRef) {
     if (m_IsSingle && m_Content.one == nullptr)
       m_Content.one = srcRef;
     else
       addToNonEmpty(srcRef);
   }
-  /// Adds what is new in \p other, in its order. Adding a set to itself
-  /// changes nothing.
+  /// Adds the references of \p other that are new, in the order of \p other:
+  /// all of them, or none if memory runs out. \p other may be this set.
   void addSrcRef(const HxCSrcRefSet& other);
 
-  /// Forgets all references and gives the memory back.
+  /// Removes all references and returns the memory.
   void clear() {
     if (!m_IsSingle) delete m_Content.list;
     m_IsSingle = true;
     m_Content.one = nullptr;
   }
 
-  /// The number of different references.
+  /// The number of references.
   int getSrcRefCnt() const;
 
-  /// The first reference; null if there is none.
+  /// The first reference; null if the set is empty.
   const HxCSrcRef* getASrcRef() const;
 
-  /// A new iterator over this set, owned by the caller. \see HX_Iterator
+  /// RETURNS: a new iterator over this set; null if memory runs out.
+  /// OWNERSHIP: the caller owns the iterator. \see HX_Iterator
   HX_Iterator<const HxCSrcRef*>* createIterator() const;
 
-  /// Calls \p visit with each reference, in the order of insertion. It needs no
-  /// memory; \p visit must not change the set.
+  /// Calls \p visit with each reference, in the order of insertion.
+  /// REQUIRES: \p visit does not change the set.
+  /// COST: no memory.
   template <class Visit>
   void forEach(Visit visit) const {
     if (!m_IsSingle) {
-      for (const HxCSrcRef* srcRef : *m_Content.list) visit(srcRef);
+      for (const HxCSrcRef* srcRef : m_Content.list->refs) visit(srcRef);
     } else if (m_Content.one != nullptr) {
       visit(m_Content.one);
     }
@@ -72,15 +79,19 @@ class HX_UTILS_API HxCSrcRefSet : public HX_Allocated {
 
  private:
   friend class HxCSrcRefServer;
-  // Consecutive in memory: a search through linked items takes five times as
-  // long for 64 references.
-  using List = std::vector<const HxCSrcRef*>;
+  // Consecutive in memory, because a search through linked items takes five
+  // times as long for 64 references. Never empty.
+  struct List : HX_Allocated {
+    std::vector<const HxCSrcRef*, HX_ControllerAllocator<const HxCSrcRef*>>
+        refs;
+  };
 
-  void addToNonEmpty(const HxCSrcRef* srcRef);
-  /// Adds a reference that is not null and known not to be there.
-  void appendNew(const HxCSrcRef* srcRef);
+  // Both return false, with the set unchanged, if memory runs out.
+  bool addToNonEmpty(const HxCSrcRef* srcRef);
+  // REQUIRES: srcRef is not null and not in the set.
+  bool appendNew(const HxCSrcRef* srcRef);
   bool contains(const HxCSrcRef* srcRef) const;
-  void changeToList();
+  void keepFirst(int count);
 
   bool m_IsSingle = true;
   union {

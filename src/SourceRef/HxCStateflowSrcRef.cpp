@@ -1,5 +1,6 @@
 #include "SourceRef/HxCStateflowSrcRef.h"
 
+#include "Control/HX_Memory.h"
 #include "platform/model/SC_Model.h"
 
 HxCStateflowSrcRef::HxCStateflowSrcRef(SC_Model* object) : m_pObject(object) {}
@@ -11,7 +12,9 @@ const HxCStateflowSrcRef* HxCStateflowSrcRef::isStateflow() const {
 }
 
 void HxCStateflowSrcRef::toString(KyCXString& text) const {
-  text = m_pObject != nullptr ? m_pObject->getSFName() : KyCXString();
+  HX_WithinMemory([&] {
+    text = m_pObject != nullptr ? m_pObject->getSFName() : KyCXString();
+  });
 }
 
 int HxCStateflowSrcRef::getSfObjectId() const {

@@ -7,8 +7,9 @@
 
 class SC_Model;
 
-/// Created and owned by the Stateflow model; the object is not owned. Copies
-/// keep the number, clones take a new one.
+/// OWNERSHIP: the Stateflow model creates and owns Stateflow references; a
+/// reference never owns the object. Copies keep the number, clones draw a new
+/// number.
 class HX_UTILS_API HxCStateflowSrcRef : public HxCSrcRef {
  public:
   /// No object.
@@ -18,17 +19,18 @@ class HX_UTILS_API HxCStateflowSrcRef : public HxCSrcRef {
   ~HxCStateflowSrcRef() override;
 
   const HxCStateflowSrcRef* isStateflow() const override;
-  /// The object's name with its path in the chart; empty without an object.
+  /// Replaces \p text by the name of the object with the path in the chart; by
+  /// the empty text without an object.
   void toString(KyCXString& text) const override;
 
-  /// The object's number in the model; -1 without an object.
+  /// The number of the object in the model; -1 without an object.
   virtual int getSfObjectId() const;
   SC_Model* getSfObject() const { return m_pObject; }
 
  private:
   friend class SC_Model;
 
-  explicit HxCStateflowSrcRef(SC_Model* object);
+  HxCStateflowSrcRef(SC_Model* object);
   HxCSrcRef* clone() const override;
 
   SC_Model* m_pObject = nullptr;

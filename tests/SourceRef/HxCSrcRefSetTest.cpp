@@ -15,7 +15,6 @@
 #include "platform/model/HX_Block.h"
 #include "platform/model/HX_BlockDataBase.h"
 #include "platform/model/HX_InputBlockId.h"
-#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -44,8 +43,10 @@ void expectHolds(const HxCSrcRefSet& set, const SrcRefs& expected) {
   }
 }
 
-// A set of one reference at most needs no memory.
+// Every second step one of the next three blocks is missing. A refused step
+// changes nothing; a set of at most one reference asks for no block.
 TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
+  HX_CountingController memory;
   const unsigned seed = HX_Seed();
   SCOPED_TRACE(seed);
   std::mt19937 random(seed);
@@ -61,7 +62,10 @@ TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
     SrcRefs added;
     if (action > 0) added = action < 3 ? plains[from] : SrcRefs{srcRef};
 
-    const int heapBlocks = HX_HeapBlocks();
+    const int asked = memory.allocated();
+    const int missing =
+        random() % 2 == 0 ? INT_MAX : asked + static_cast<int>(random() % 3);
+    memory.failAt(missing, false);
     if (action == 0)
       sets[to].clear();
     else if (action == 1)
@@ -70,15 +74,18 @@ TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
       sets[to].addSrcRef(sets[from]);
     else
       sets[to].addSrcRef(srcRef);
-    const bool askedForMemory = HX_HeapBlocks() != heapBlocks;
+    memory.failAt(INT_MAX, false);
 
-    SrcRefs& plain = plains[to];
+    SrcRefs plain = plains[to];
     if (action < 2) plain.clear();
     for (const HxCSrcRef* r : added)
       if (r != nullptr && std::count(plain.begin(), plain.end(), r) == 0)
         plain.push_back(r);
-    EXPECT_TRUE(plain.size() > 1 || !askedForMemory);
-    expectHolds(sets[to], plain);
+    if (plain.size() < 2) {
+      EXPECT_EQ(memory.allocated(), asked);
+    }
+    if (memory.allocated() <= missing) plains[to] = plain;
+    expectHolds(sets[to], plains[to]);
     expectHolds(HxCSrcRefSet(sets[from]), plains[from]);
     ASSERT_FALSE(HasFailure()) << "step " << step;
   }
@@ -89,12 +96,29 @@ TEST_F(SrcRefSetTest, WhatIsHandedOutIsOwnedOrNullWithoutMemory) {
     const HX_Block block("b");
     HxCSrcRefServer server;
     HxCSrcRefSet set(block.getSrcRef());
-    for (int i = 0; i < 3; ++i) set.addSrcRef(server.getSrcRef());
+    for (int i = 0; i < 6; ++i) set.addSrcRef(server.getSrcRef());
+    const HxCSrcRefSet copy(set);
     const std::unique_ptr<HxCSrcRef> clone(HxCDdSrcRef(1).clone());
     const IteratorPtr it(set.createIterator());
-    return server.boot() && server.shutdown() && set.getSrcRefCnt() == 4 &&
-           clone && it;
+    return set.getSrcRefCnt() == 7 && copy.getSrcRefCnt() == 7 && clone && it;
   });
+}
+
+TEST_F(SrcRefSetTest, ReferencesOfTheServerOutliveItsShutdown) {
+  HX_CountingController memory;
+  {
+    HxCSrcRefServer server;
+    EXPECT_TRUE(server.boot());
+    HxCInternalSrcRef* const first = server.getSrcRef();
+    HxCInternalSrcRef* const second = server.getSrcRef();
+    first->setLocation("x.cpp", 12);
+    const int held = memory.liveBlocks();
+    EXPECT_TRUE(server.shutdown());
+    EXPECT_EQ(memory.liveBlocks(), held);
+    EXPECT_EQ(first->getLine(), 12);
+    EXPECT_EQ(second->getLine(), -1);
+  }
+  EXPECT_EQ(memory.liveBlocks(), 0);
 }
 
 // References of all kinds, by letter.
