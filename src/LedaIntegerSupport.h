@@ -41,6 +41,7 @@ HX_UTILS_INLINE_API inline leda::integer toInteger(unsigned long long v) {
 /// Before LedaIntegerSupportBoot() the bounds are 0: every positive value gives
 /// the largest, every negative value the smallest result. A debug check
 /// reports values of more than two words, which cannot get past the bounds.
+// NOLINTNEXTLINE(performance-unnecessary-value-param): callers pass a value
 HX_UTILS_INLINE_API inline long long toInt64(leda::integer x) {
   if (x > hx_detail::ledaLargestInt64) {
     return std::numeric_limits<long long>::max();

@@ -64,9 +64,11 @@ struct HX_ControllerAllocator {
   /// Memory for \p count objects. Throws std::bad_alloc if memory runs out.
   T* allocate(std::size_t count) {
     static_assert(alignof(T) <= alignof(std::max_align_t));
-    if (count > std::numeric_limits<std::size_t>::max() / sizeof(T))
+    // NOLINTNEXTLINE(bugprone-sizeof-expression): T may be a pointer
+    constexpr std::size_t kSize = sizeof(T);
+    if (count > std::numeric_limits<std::size_t>::max() / kSize)
       throw std::bad_alloc();
-    void* block = HX_Allocate(count * sizeof(T));
+    void* block = HX_Allocate(count * kSize);
     if (block == nullptr) throw std::bad_alloc();
     return static_cast<T*>(block);
   }

@@ -122,6 +122,7 @@ long long IMS_SimulinkAlikeSqrt(long long v) {
   return FPS_SatCastToInt64(FPS_SimulinkAlikeSqrt(static_cast<double>(v)));
 }
 
+// NOLINTNEXTLINE(readability-non-const-parameter): callers pass long long*
 long long IMS_FindLeastCommonMultiple(int n, long long* values, double limit) {
   const double product =
       static_cast<double>(values[0]) * static_cast<double>(values[1]);

@@ -81,6 +81,7 @@ HX_UTILS_API long long IMS_SimulinkAlikeSqrt(long long v);
 /// leads to. The smallest value is divided like any other, also by -1.
 /// Cost: operands of equal sign take the binary algorithm of J. Stein (J. Comp.
 /// Phys. 1, 1967), with about one subtraction per bit.
+// NOLINTNEXTLINE(readability-non-const-parameter): callers pass long long*
 HX_UTILS_INLINE_API inline long long IMS_FindGreatestCommonDivisor(
     long long* pair) {
   const auto a = static_cast<unsigned long long>(pair[0]);
