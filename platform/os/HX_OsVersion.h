@@ -40,7 +40,8 @@ struct VS_FIXEDFILEINFO {
   std::uint32_t dwFileDateLS;        ///< low word; mostly 0
 };
 
-/// The loaded module \p name, null if there is none. Not to be released.
+/// The loaded module \p name, null if there is none. Letter case does not
+/// matter. Not to be released.
 HX_PLATFORM_API HX_ModuleHandle GetModuleHandleA(const char* name);
 
 /// The full path of the file of \p module, for null of the process's

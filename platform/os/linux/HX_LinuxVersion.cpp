@@ -17,8 +17,22 @@ struct Module {
   std::string versionBlock;
 };
 
-std::map<std::string, Module>& modules() {
-  static HX_NeverDestroyed<std::map<std::string, Module>> s_modules;
+char lower(char c) {
+  return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+}
+
+// Module names differ in more than the case of ASCII letters.
+struct LessWithoutCase {
+  bool operator()(const std::string& a, const std::string& b) const {
+    return std::lexicographical_compare(
+        a.begin(), a.end(), b.begin(), b.end(),
+        [](char x, char y) { return lower(x) < lower(y); });
+  }
+};
+using Modules = std::map<std::string, Module, LessWithoutCase>;
+
+Modules& modules() {
+  static HX_NeverDestroyed<Modules> s_modules;
   return s_modules.value;
 }
 
@@ -72,9 +86,6 @@ class Node {
 
   static std::size_t aligned(std::size_t offset) {
     return (offset + 3) / 4 * 4;
-  }
-  static char lower(char c) {
-    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
   }
   std::size_t word(int index) const {
     std::uint16_t value = 0;
