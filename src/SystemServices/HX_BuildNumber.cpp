@@ -1,11 +1,13 @@
 #include "SystemServices/HX_BuildNumber.h"
 
+#include <utility>
+
+#include "SystemServices/implSystemServices/HX_SharedText.h"
 #include "platform/containers/array.h"
-#include "platform/strings/KyCXString.h"
 
 namespace {
 
-// One row per month name of __DATE__.
+// One row per English month abbreviation.
 struct MonthRow {
   const char* name;
   const char* number;
@@ -14,8 +16,6 @@ constexpr MonthRow kMonths[] = {{"Jan", "01"}, {"Feb", "02"}, {"Mar", "03"},
                                 {"Apr", "04"}, {"May", "05"}, {"Jun", "06"},
                                 {"Jul", "07"}, {"Aug", "08"}, {"Sep", "09"},
                                 {"Oct", "10"}, {"Nov", "11"}, {"Dec", "12"}};
-
-KyCXString decimal(int value) { return KyCXString(value, false, true); }
 
 KyCXString monthNumber(const KyCXString& name) {
   for (const MonthRow& row : kMonths)
@@ -36,15 +36,15 @@ KyCXString standardDate(const KyCXString& date) {
 
 KyCXString versionText(int majorVersion, int minorVersion, int thirdNumber,
                        const KyCXString& buildKind) {
-  KyCXString text = decimal(majorVersion) + "." + decimal(minorVersion);
+  KyCXString text = HX_Decimal(majorVersion) + "." + HX_Decimal(minorVersion);
   if (thirdNumber > 0)
-    text += KyCXString(".") + decimal(thirdNumber) + buildKind;
+    text += KyCXString(".") + HX_Decimal(thirdNumber) + buildKind;
   return text;
 }
 
 KyCXString buildKindText(bool isRelease, bool isFirstKind, int buildCounter) {
   if (isRelease) return "";
-  return KyCXString(isFirstKind ? ".P" : ".B") + decimal(buildCounter);
+  return KyCXString(isFirstKind ? ".P" : ".B") + HX_Decimal(buildCounter);
 }
 
 }  // namespace
@@ -54,22 +54,25 @@ bool HX_BuildNumber::definedBuildNumber(
     const KyCXString& buildId, bool isFirstKind, bool isRelease, int /*unused*/,
     const KyCXString& productVersion, const KyCXString& productReleaseDate,
     const KyCXString& buildDate, const KyCXString& buildTime) {
-  // The arguments may be texts of this object: keep those until the end.
-  const HX_BuildNumber previous(*this);
-  const auto text = [](const KyCXString& value) {
-    return std::make_shared<KyCXString>(value);
-  };
-  m_MajorVersion = majorVersion;
-  m_MinorVersion = minorVersion;
-  m_pProductVersion = text(productVersion);
-  m_pProductReleaseDate = text(productReleaseDate);
-  m_pBuildDate = text(standardDate(buildDate));
-  m_pBuildTime = text(buildTime);
-  m_pBuildDateTime = text(*m_pBuildDate + " " + *m_pBuildTime);
-  m_pBuildId = text(KyCXString("Build Id ") + buildId);
-  m_pVersion =
-      text(versionText(majorVersion, minorVersion, thirdNumber,
-                       buildKindText(isRelease, isFirstKind, buildCounter)));
-  m_pLongVersion = text(*m_pVersion + "\t from " + *m_pBuildDateTime);
-  return true;
+  return HX_WithinMemory([&] {
+    // The new texts come together in a copy: the old texts may be arguments,
+    // and stay if memory runs out.
+    HX_BuildNumber defined(*this);
+    defined.m_MajorVersion = majorVersion;
+    defined.m_MinorVersion = minorVersion;
+    defined.m_pProductVersion = HX_SharedText(productVersion);
+    defined.m_pProductReleaseDate = HX_SharedText(productReleaseDate);
+    const KyCXString date = standardDate(buildDate);
+    const KyCXString dateTime = date + " " + buildTime;
+    defined.m_pBuildDate = HX_SharedText(date);
+    defined.m_pBuildTime = HX_SharedText(buildTime);
+    defined.m_pBuildDateTime = HX_SharedText(dateTime);
+    defined.m_pBuildId = HX_SharedText(KyCXString("Build Id ") + buildId);
+    const KyCXString version =
+        versionText(majorVersion, minorVersion, thirdNumber,
+                    buildKindText(isRelease, isFirstKind, buildCounter));
+    defined.m_pVersion = HX_SharedText(version);
+    defined.m_pLongVersion = HX_SharedText(version + "\t from " + dateTime);
+    *this = std::move(defined);
+  });
 }

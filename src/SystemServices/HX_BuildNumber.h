@@ -1,4 +1,4 @@
-// The numbers and texts of one build of the generator.
+// Numbers and texts of one build of the generator.
 //
 //   HX_BuildNumber build;
 //   build.definedBuildNumber(2, 2, 1, 5, "4711", false, false, 0, "2.2",
@@ -16,25 +16,31 @@
 
 class KyCXString;
 
-/// A copy shares the texts with its original; the last of them that is
-/// destroyed or defined anew releases them.
+/// Copies share the texts. A text is released with the last object that holds
+/// the text.
 class HX_UTILS_API HX_BuildNumber : public HX_Allocated {
  public:
-  /// Sets the version, its texts and the build's texts; replaces what an
-  /// earlier call set. The maintenance version and the beta and release flags
-  /// are not touched.
+  /// Sets the version and the texts; replaces all texts of an earlier call.
+  /// Maintenance version, beta and release flag stay. Arguments may be texts of
+  /// this object.
   ///
-  /// The version text is major.minor; with a third number above 0 it is
-  /// major.minor.third and the build kind: ".P" and the build counter with
-  /// \p isFirstKind, otherwise ".B" and the build counter, and nothing for a
-  /// release.
-  /// \param buildDate  as __DATE__ gives it, "Mmm dd yyyy" with a blank for a
-  ///     leading 0 of the day; stored as year-month-day. The text is divided at
-  ///     each blank: of three parts, the first is the month, then come day and
-  ///     year; of four the second, whatever it holds, is skipped and the day
-  ///     gets a leading 0. A text of any other number of parts is stored as it
-  ///     is, an unknown month name stays.
-  /// \return true
+  /// The version text is major.minor. With \p thirdNumber > 0 the text is
+  /// major.minor.third and the build kind:
+  ///
+  ///     isRelease   isFirstKind   build kind
+  ///     true        any           none
+  ///     false       true          ".P" and the build counter
+  ///     false       false         ".B" and the build counter
+  ///
+  /// \param buildDate  "Mmm dd yyyy", a blank for a leading 0 of the day;
+  ///     stored as year-month-day. The text is divided at each blank:
+  ///
+  ///         3 parts: month, day, year        "Mar 14 2007"   2007-03-14
+  ///         4 parts: month, any, day, year   "Mar  4 2007"   2007-03-04
+  ///         other:   stored unchanged        "2007-03-14"    2007-03-14
+  ///
+  ///     An unknown month name stays.
+  /// RETURNS: true; false without memory, and the object is unchanged.
   bool definedBuildNumber(int majorVersion, int minorVersion, int thirdNumber,
                           int buildCounter, const KyCXString& buildId,
                           bool isFirstKind, bool isRelease, int unused,
@@ -46,13 +52,13 @@ class HX_UTILS_API HX_BuildNumber : public HX_Allocated {
   /// -1 until defined.
   int getMajorVersion() const { return m_MajorVersion; }
   int getMinorVersion() const { return m_MinorVersion; }
-  /// Always -1: the third number only shows in the version text.
+  /// Always -1: only the version text shows the third number.
   int getMaintenanceVersion() const { return m_MaintenanceVersion; }
-  /// Always false: the build kind only shows in the version text.
+  /// Always false: only the version text shows the build kind.
   bool isBetaVersion() const { return m_IsBeta; }
   bool isReleaseVersion() const { return m_IsRelease; }
 
-  // The texts belong to the object and are null until defined.
+  // OWNERSHIP: the object owns the texts. Null until defined.
 
   /// "Build Id " and the id.
   KyCXString* getBuildId() const { return m_pBuildId.get(); }
@@ -62,9 +68,9 @@ class HX_UTILS_API HX_BuildNumber : public HX_Allocated {
   /// Date, a blank and time.
   KyCXString* getBuildDateTime() const { return m_pBuildDateTime.get(); }
   KyCXString* getVersionString() const { return m_pVersion.get(); }
-  /// The version text, a tab, " from " and the build's date and time.
+  /// The version text, a tab, " from ", date and time of the build.
   KyCXString* getLongVersionString() const { return m_pLongVersion.get(); }
-  /// The product's version and release date.
+  /// Version and release date of the product.
   KyCXString* getBrennicVersion() const { return m_pProductVersion.get(); }
   KyCXString* getBrennicReleaseDate() const {
     return m_pProductReleaseDate.get();

@@ -1,21 +1,24 @@
 #include "SystemServices/HX_OfficialVersion.h"
 
 #include <memory>
+#include <utility>
 
+#include "Control/HX_Memory.h"
 #include "platform/matlab/HX_MexInterface.h"
 
 namespace {
 
-constexpr double kVersionRequest = 6.0;  // what "hx_config" is to tell
+constexpr double kVersionRequest = 6.0;  // asks "hx_config" for the version
 
 struct DestroyArray {
   void operator()(mxArray* array) const { MXDestroyArray(array); }
 };
 using OwnedArray = std::unique_ptr<mxArray, DestroyArray>;
 
-// The answer of "hx_config", null if the call failed.
+// Returns the answer of "hx_config", null if the call failed.
 OwnedArray callConfig() {
   OwnedArray input(MXCreateInitializedScalarMxArray(kVersionRequest));
+  if (input == nullptr) return input;
   mxArray* inputs[] = {input.get()};
   mxArray* outputs[] = {nullptr};
   const int status = MEXCallMATLAB(1, outputs, 1, inputs, "hx_config");
@@ -36,13 +39,38 @@ bool readField(mxArray* structure, const char* name, const char* placeholder,
 
 }  // namespace
 
+HX_OfficialVersion::HX_OfficialVersion(const HX_OfficialVersion& other)
+    : HX_Allocated(other) {
+  *this = other;
+}
+
+HX_OfficialVersion& HX_OfficialVersion::operator=(
+    const HX_OfficialVersion& other) {
+  HX_WithinMemory([&] {
+    KyCXString version = other.m_Version;
+    KyCXString releaseDate = other.m_ReleaseDate;
+    m_Version = std::move(version);
+    m_ReleaseDate = std::move(releaseDate);
+    m_IsValid = other.m_IsValid;
+  });
+  return *this;
+}
+
 HX_OfficialVersion::~HX_OfficialVersion() = default;
 
 bool HX_OfficialVersion::evalBrennicVersionAndReleaseDate() {
-  const OwnedArray answer = callConfig();
-  m_IsValid =
-      answer != nullptr &&
-      readField(answer.get(), "Version", "- version -", m_Version) &&
-      readField(answer.get(), "ReleaseDate", "- release date -", m_ReleaseDate);
+  m_IsValid = false;
+  HX_WithinMemory([&] {
+    const OwnedArray answer = callConfig();
+    if (answer == nullptr) return;
+    KyCXString version = m_Version;
+    KyCXString releaseDate = m_ReleaseDate;
+    const bool isComplete =
+        readField(answer.get(), "Version", "- version -", version) &&
+        readField(answer.get(), "ReleaseDate", "- release date -", releaseDate);
+    m_Version = std::move(version);
+    m_ReleaseDate = std::move(releaseDate);
+    m_IsValid = isComplete;
+  });
   return m_IsValid;
 }

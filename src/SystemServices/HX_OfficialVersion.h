@@ -1,4 +1,4 @@
-// The product's official version and release date, as MATLAB knows them.
+// Official version and release date of the product, asked from MATLAB.
 //
 //   HX_OfficialVersion official;
 //   if (official.evalBrennicVersionAndReleaseDate())
@@ -11,21 +11,25 @@
 #include "HX_Export.h"
 #include "platform/strings/KyCXString.h"
 
-/// A value type; both texts are empty until evaluated.
+/// A value type; both texts are empty until evaluated. Without memory the texts
+/// of a copy are empty and an assignment changes nothing.
 class HX_UTILS_API HX_OfficialVersion : public HX_Allocated {
  public:
   HX_OfficialVersion() = default;
-  HX_OfficialVersion(const HX_OfficialVersion&) = default;
-  HX_OfficialVersion& operator=(const HX_OfficialVersion&) = default;
+  HX_OfficialVersion(const HX_OfficialVersion& other);
+  HX_OfficialVersion& operator=(const HX_OfficialVersion& other);
   virtual ~HX_OfficialVersion();
 
   /// Calls the MATLAB function "hx_config" with 6 and reads the fields
-  /// "Version" and "ReleaseDate" of the structure it returns.
+  /// "Version" and "ReleaseDate" of the returned structure.
   ///
-  /// A failed call leaves both texts. A missing field makes its text
-  /// "- version -" or "- release date -", and nothing further is read; a field
-  /// that is no text gives an empty text.
-  /// \return true if both fields were there
+  ///     answer                version         release date         result
+  ///     none, or no memory    stays           stays                false
+  ///     no field "Version"    "- version -"   stays                false
+  ///     no "ReleaseDate"      read            "- release date -"   false
+  ///     both fields           read            read                 true
+  ///
+  /// A field of another type than text gives an empty text.
   bool evalBrennicVersionAndReleaseDate();
 
   /// Valid until the next evaluation or assignment.

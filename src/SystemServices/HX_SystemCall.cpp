@@ -2,7 +2,9 @@
 
 #include <cstdlib>
 #include <ctime>
+#include <utility>
 
+#include "Control/HX_Memory.h"
 #include "platform/os/HX_OsClock.h"
 #include "platform/os/HX_OsThread.h"
 #include "platform/strings/KyCXString.h"
@@ -16,7 +18,8 @@ KyCXString* localTimeText(const char* format) {
   const std::time_t now = std::time(nullptr);
   char buffer[20] = "";
   std::strftime(buffer, sizeof buffer, format, std::localtime(&now));
-  return new KyCXString(buffer);
+  KyCXString* none = nullptr;
+  return HX_WithinMemory(none, [&] { return new KyCXString(buffer); });
 }
 
 }  // namespace
@@ -55,9 +58,10 @@ bool HX_SystemCall::substituteEnvVariable(KyCXString& text) {
   if (open < 0) return true;
   const int close = text.find('%', open + 1);
   if (close < 0) return true;
-  const KyCXString name = text.sub(open + 1, close - 1);
-  const char* value = std::getenv(name.cstring());
-  if (value == nullptr) return true;
-  text = KyCXString(value) + text.sub(close + 1, text.length() - 1);
-  return true;
+  return HX_WithinMemory([&] {
+    const KyCXString name = text.sub(open + 1, close - 1);
+    const char* value = std::getenv(name.cstring());
+    if (value == nullptr) return;
+    text = KyCXString(value) + text.sub(close + 1, text.length() - 1);
+  });
 }

@@ -1,6 +1,7 @@
 #include "SystemServices/HX_SystemFileIo.h"
 
 #include "Control/ERR_Messages.h"
+#include "Control/HX_Memory.h"
 #include "platform/strings/KyCXString.h"
 
 HX_SystemFileIo::~HX_SystemFileIo() {
@@ -9,13 +10,16 @@ HX_SystemFileIo::~HX_SystemFileIo() {
 
 bool HX_SystemFileIo::open(const KyCXString& name, const KyCXString& mode,
                            std::FILE*& file) {
+  // The entry comes first: no file stays open without an entry.
+  leda::list_item<std::FILE*> entry;
+  if (!HX_WithinMemory([&] { entry = m_Files.append(nullptr); })) return false;
   std::FILE* opened = std::fopen(name.cstring(), mode.cstring());
   if (opened == nullptr) {
+    m_Files.del_item(entry);
     ERR_Msg90(name.cstring());
     return false;
   }
-  m_Files.append(opened);
-  file = opened;
+  m_Files[entry] = file = opened;
   return true;
 }
 

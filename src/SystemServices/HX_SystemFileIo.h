@@ -1,4 +1,9 @@
-// A register of open files, which it closes when it is destroyed.
+// Register of open files.
+//
+//   HX_SystemFileIo files;
+//   std::FILE* log = nullptr;
+//   if (files.open("log.txt", "w", log)) std::fputs("begin\n", log);
+//   files.close(log);
 
 #ifndef SYSTEMSERVICES_HX_SYSTEMFILEIO_H
 #define SYSTEMSERVICES_HX_SYSTEMFILEIO_H
@@ -11,8 +16,8 @@
 
 class KyCXString;
 
-/// Destruction closes the files still open, in the order of their opening. Not
-/// copied: two registers would close the same files.
+/// Destruction closes the files still open, in the order of opening. Not
+/// copied, because two registers would close the same files.
 class HX_UTILS_API HX_SystemFileIo : public HX_Allocated {
  public:
   HX_SystemFileIo() = default;
@@ -21,12 +26,14 @@ class HX_UTILS_API HX_SystemFileIo : public HX_Allocated {
   ~HX_SystemFileIo();
 
   /// Opens \p name with the fopen() mode \p mode.
-  /// \param[out] file  the handle, owned by this register; written on success
-  /// \return false after message 90 (fatal error) if the file cannot be opened
+  /// \param[out] file  the handle; written on success
+  /// OWNERSHIP: the register owns the handle.
+  /// RETURNS: false after message 90 (fatal error) if the file cannot be
+  /// opened; false without memory, and no file is opened.
   bool open(const KyCXString& name, const KyCXString& mode, std::FILE*& file);
 
   /// Closes a file of this register.
-  /// \return false, with nothing done, for null and for any other file
+  /// RETURNS: false for null and for any other file; such a file stays open.
   bool close(std::FILE* file);
 
  private:

@@ -9,10 +9,10 @@
 class HX_SystemCall;
 class HX_SystemFileIo;
 
-/// Owns the services until they are released or it is destroyed. Copies share
-/// the services: all but one of them must give them up with disown() before
-/// they are destroyed or the services released. Assignment forgets the target's
-/// own services without releasing them.
+/// OWNERSHIP: the object owns its services until their release or the object's
+/// destruction. Copies share the services: call disown() on all copies but one
+/// before a copy is destroyed or releases a service. Assignment forgets the
+/// services of the target without a release.
 class HX_UTILS_API HX_SystemServiceEnv : public HX_Allocated {
  public:
   HX_SystemServiceEnv() = default;
@@ -20,7 +20,8 @@ class HX_UTILS_API HX_SystemServiceEnv : public HX_Allocated {
   HX_SystemServiceEnv& operator=(const HX_SystemServiceEnv&) = default;
   ~HX_SystemServiceEnv();
 
-  /// The same object on each call until it is released.
+  /// RETURNS: the same object on each call until its release; null without
+  /// memory.
   HX_SystemCall* getSystemCall();
   HX_SystemFileIo* getSystemFileIo();
 
@@ -29,7 +30,7 @@ class HX_UTILS_API HX_SystemServiceEnv : public HX_Allocated {
   /// The same, and closes the files that are still open.
   void releaseSystemFileIo();
 
-  /// Forgets the services without releasing them.
+  /// Forgets the services without a release.
   void disown();
 
  private:

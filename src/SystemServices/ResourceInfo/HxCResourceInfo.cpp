@@ -4,13 +4,15 @@
 #include <cstdio>
 #include <cstring>
 #include <string>
+#include <utility>
 
+#include "SystemServices/implSystemServices/HX_SharedText.h"
 #include "Trace/HxCTraceFallThrough.h"
 #include "platform/os/HX_OsVersion.h"
-#include "platform/strings/KyCXString.h"
 
 namespace {
 
+constexpr char kSourceFile[] = "SystemServices/ResourceInfo/HxCResourceInfo";
 constexpr char kModule[] = "hx_codegen";
 constexpr std::uint32_t kMaxPath = 260;
 
@@ -19,12 +21,10 @@ struct FreeBlock {
 };
 using Block = std::unique_ptr<void, FreeBlock>;
 
-KyCXString decimal(int value) { return KyCXString(value, false, true); }
-
 int highWord(std::uint32_t word) { return static_cast<int>(word >> 16); }
 int lowWord(std::uint32_t word) { return static_cast<int>(word & 0xFFFF); }
 
-// The value at \p path as a T; false if there is none or it is too short.
+// Reads the value at \p path as a T; false for a missing or too short value.
 template <class T>
 bool query(const void* block, const char* path, T& value) {
   void* found = nullptr;
@@ -35,13 +35,13 @@ bool query(const void* block, const char* path, T& value) {
   return true;
 }
 
-// The text at \p path; empty if there is none.
+// Returns the text at \p path up to the first zero; empty for a missing text.
 KyCXString queryText(const void* block, const char* path) {
   void* found = nullptr;
   unsigned int length = 0;
   if (VerQueryValueA(block, path, &found, &length) == 0) return "";
   const std::string text(static_cast<const char*>(found), length);
-  return text.c_str();  // ends at the text's own zero
+  return text.c_str();
 }
 
 }  // namespace
@@ -49,26 +49,33 @@ KyCXString queryText(const void* block, const char* path) {
 bool HxCResourceInfo::retrieveResourceInfo() {
   if (m_IsRetrieved) return true;
   m_IsRetrieved = true;
+  return HX_WithinMemory(false, [this] { return readResource(); });
+}
 
+bool HxCResourceInfo::readResource() {
   char path[kMaxPath] = "";
   GetModuleFileNameA(GetModuleHandleA(kModule), path, sizeof path);
-  m_pModuleName = std::make_shared<KyCXString>(path);
+  m_pModuleName = HX_SharedText(path);
 
+  const HxCTraceFallThrough trace;
   std::uint32_t handle = 0;
   const std::uint32_t size = GetFileVersionInfoSizeA(path, &handle);
-  if (size == 0) return HxCTraceFallThrough().throwError(__FILE__, __LINE__);
+  if (size == 0) return trace.throwError(kSourceFile, __LINE__);
 
   const Block block(HX_Allocate(size));
   if (block == nullptr ||
       GetFileVersionInfoA(path, handle, size, block.get()) == 0)
-    return HxCTraceFallThrough().throwError(__FILE__, __LINE__);
+    return trace.throwError(kSourceFile, __LINE__);
 
   VS_FIXEDFILEINFO info{};
   if (!query(block.get(), "\\", info))
-    return HxCTraceFallThrough().throwError(__FILE__, __LINE__);
+    return trace.throwError(kSourceFile, __LINE__);
 
-  setVersions(info);
-  setTexts(block.get());
+  // All or nothing: a copy takes the numbers and texts first.
+  HxCResourceInfo read(*this);
+  read.setVersions(info);
+  read.setTexts(block.get());
+  *this = std::move(read);
   return true;
 }
 
@@ -80,15 +87,15 @@ void HxCResourceInfo::setVersions(const VS_FIXEDFILEINFO& info) {
             highWord(info.dwFileVersionLS), lowWord(info.dwFileVersionLS)};
 
   KyCXString product =
-      decimal(m_Product.majorPart) + "." + decimal(m_Product.minorPart);
+      HX_Decimal(m_Product.majorPart) + "." + HX_Decimal(m_Product.minorPart);
   if (m_Product.subPart > 0 || m_Product.maintenance > 0)
-    product += KyCXString(".") + decimal(m_Product.subPart);
+    product += KyCXString(".") + HX_Decimal(m_Product.subPart);
   if (m_Product.maintenance > 0)
-    product += KyCXString(".") + decimal(m_Product.maintenance);
-  m_pProductVersion = std::make_shared<KyCXString>(product);
-  m_pFileVersion = std::make_shared<KyCXString>(
-      decimal(m_File.majorPart) + "." + decimal(m_File.minorPart) + "." +
-      decimal(m_File.subPart) + "." + decimal(m_File.maintenance));
+    product += KyCXString(".") + HX_Decimal(m_Product.maintenance);
+  m_pProductVersion = HX_SharedText(product);
+  m_pFileVersion = HX_SharedText(
+      HX_Decimal(m_File.majorPart) + "." + HX_Decimal(m_File.minorPart) + "." +
+      HX_Decimal(m_File.subPart) + "." + HX_Decimal(m_File.maintenance));
 }
 
 void HxCResourceInfo::setTexts(const void* block) {
@@ -99,8 +106,7 @@ void HxCResourceInfo::setTexts(const void* block) {
     char path[64];
     std::snprintf(path, sizeof path, "StringFileInfo\\%04X%04X\\%s",
                   lowWord(translation), highWord(translation), name);
-    return std::make_shared<KyCXString>(isTranslated ? queryText(block, path)
-                                                     : KyCXString());
+    return HX_SharedText(isTranslated ? queryText(block, path) : KyCXString());
   };
   m_pLegalCopyright = text("LegalCopyright");
   m_pCompanyName = text("CompanyName");

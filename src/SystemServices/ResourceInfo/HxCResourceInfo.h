@@ -1,4 +1,4 @@
-// The version resource of the generator's main module, "hx_codegen".
+// Version resource of the main module of the generator, "hx_codegen".
 //
 //   HxCResourceInfo info;
 //   if (info.retrieveResourceInfo())
@@ -15,23 +15,23 @@
 class KyCXString;
 struct VS_FIXEDFILEINFO;
 
-/// Reads the resource once. Numbers are -1 and texts null until they are read;
-/// texts belong to the object and are shared with its copies, the last of which
-/// releases them.
+/// Reads the resource once. Until then numbers are -1 and texts null.
+/// OWNERSHIP: object and copies share the texts; a text is released with the
+/// last object that holds the text.
 class HX_UTILS_API HxCResourceInfo : public HX_Allocated {
  public:
-  /// Reads the resource of the module "hx_codegen" or, if no module of that
-  /// name is loaded, of the process's executable.
+  /// Reads the resource of the module "hx_codegen"; without a loaded module of
+  /// this name, the resource of the executable.
   ///
-  /// Where the version information or its fixed part is missing or cannot be
-  /// read, this is traced as an error fall-through and the module name is all
-  /// that is set. A text that the resource does not hold in its first language
-  /// is empty.
-  /// \return true if the resource was read or this is not the first call,
-  ///     whatever the first one gave
+  /// Missing or unreadable version information is traced as an error
+  /// fall-through. The call then sets only the module name, as without memory
+  /// (not even the name, if the name finds no memory). A text missing in the
+  /// first language of the resource is empty.
+  /// RETURNS: true if the resource was read, and in every later call, even
+  /// after a first call without success.
   bool retrieveResourceInfo();
 
-  /// The parts of the product's, and of the file's, version.
+  /// The parts of the version of the product and of the file.
   int getProdMajor() const { return m_Product.majorPart; }
   int getProdMinor() const { return m_Product.minorPart; }
   int getProdSub() const { return m_Product.subPart; }
@@ -41,17 +41,17 @@ class HX_UTILS_API HxCResourceInfo : public HX_Allocated {
   int getFileSub() const { return m_File.subPart; }
   int getFileMaintenance() const { return m_File.maintenance; }
 
-  /// Without the zeros at its end, but never shorter than major.minor: "2.2",
+  /// Without zeros at the end, but never shorter than major.minor: "2.2",
   /// "2.2.1", "2.2.0.4".
   KyCXString* getProductVersion() const { return m_pProductVersion.get(); }
   /// Always all four parts: "2.2.0.0".
   KyCXString* getFileVersion() const { return m_pFileVersion.get(); }
 
-  /// The texts of these names in the resource's first language.
+  /// The texts in the first language of the resource.
   KyCXString* getLegalCopyright() const { return m_pLegalCopyright.get(); }
   KyCXString* getCompanyName() const { return m_pCompanyName.get(); }
   KyCXString* getProductName() const { return m_pProductName.get(); }
-  /// The full path of the module's file, cut to 259 characters.
+  /// The full path of the module file, cut to 259 characters.
   KyCXString* getModuleName() const { return m_pModuleName.get(); }
 
  private:
@@ -63,6 +63,7 @@ class HX_UTILS_API HxCResourceInfo : public HX_Allocated {
     int maintenance = -1;
   };
 
+  bool readResource();
   void setVersions(const VS_FIXEDFILEINFO& info);
   void setTexts(const void* block);
 
