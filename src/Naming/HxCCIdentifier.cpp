@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "Control/HX_Memory.h"
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
 #include "platform/model/HxCSymbol.h"
@@ -19,90 +20,236 @@ bool containsMacro(const KyCXString& text, char letter) {
   return false;
 }
 
+// Copies first: an assignment that runs out of memory may leave half a text.
+void assign(KyCXString& target, const KyCXString& text) {
+  HX_WithinMemory([&] {
+    KyCXString copy(text);
+    target = std::move(copy);
+  });
+}
+
 }  // namespace
+
+HxCCIdentifier::HxCCIdentifier() = default;
 
 HxCCIdentifier::HxCCIdentifier(const KyCXString& name) { setName(name); }
 
-HxCCIdentifier::HxCCIdentifier(const char* name) { setName(name); }
+HxCCIdentifier::HxCCIdentifier(const char* name) { *this = name; }
+
+HxCCIdentifier::HxCCIdentifier(const HxCCIdentifier& other) : HX_Allocated() {
+  *this = other;
+}
 
 HxCCIdentifier::~HxCCIdentifier() = default;
 
-HxCCIdentifier& HxCCIdentifier::operator=(const KyCXString& name) {
-  setName(name);
-  return *this;
+void HxCCIdentifier::operator=(const HxCCIdentifier& other) {
+  if (this != &other) HX_WithinMemory([&] { copy(other); });
 }
 
-HxCCIdentifier& HxCCIdentifier::operator=(const char* name) {
-  setName(name);
-  return *this;
+void HxCCIdentifier::operator=(const KyCXString& name) { setName(name); }
+
+void HxCCIdentifier::operator=(const char* name) {
+  HX_WithinMemory([&] { setTemplate(name); });
+}
+
+void HxCCIdentifier::init() {
+  m_Actual = Name();
+  m_Formal = Name();
+  m_FormalNameActive = true;
+  m_CookLevel = eCookLevelRaw;
+  m_SignalLabel = KyCXString();
+  m_pSourceRef = nullptr;
+  m_pDdSourceRef = nullptr;
+  m_pSourceIVBlock = nullptr;
+  m_DollarXValue = KyCXString();
+}
+
+void HxCCIdentifier::copy(const HxCCIdentifier& other) {
+  Name actual(other.m_Actual);
+  Name formal(other.m_Formal);
+  KyCXString label(other.m_SignalLabel);
+  KyCXString x(other.m_DollarXValue);
+  m_Actual = std::move(actual);
+  m_Formal = std::move(formal);
+  m_CookLevel = other.m_CookLevel;
+  m_SignalLabel = std::move(label);
+  m_pSourceRef = other.m_pSourceRef;
+  m_pDdSourceRef = other.m_pDdSourceRef;
+  m_pSourceIVBlock = other.m_pSourceIVBlock;
+  m_DollarXValue = std::move(x);
+  m_FormalNameActive = other.m_FormalNameActive;
 }
 
 bool HxCCIdentifier::setName(const KyCXString& name) {
-  const KyCXString text(name);  // may be one of the names reset here
-  *this = HxCCIdentifier();
+  return HX_WithinMemory(false, [&] { return setTemplate(name); });
+}
+
+bool HxCCIdentifier::setTemplate(const KyCXString& text) {
+  Name actual;
+  Name formal;
   const int colon = text.find(':');
   const int second = colon < 0 ? -1 : text.find(':', colon + 1);
   if (colon < 0) {
-    m_Formal.raw = text;
-    m_Actual.raw = text;
-    m_Actual.raw += "$R";
+    formal.raw = text;
+    actual.raw = text;
+    actual.raw += "$R";
   } else {
-    m_Formal.raw = text.head(colon);
-    m_Actual.raw =
-        text.sub(colon + 1, (second < 0 ? text.length() : second) - 1);
+    formal.raw = text.head(colon);
+    actual.raw = text.sub(colon + 1, (second < 0 ? text.length() : second) - 1);
   }
-  m_Formal.cooked = m_Formal.raw;
-  m_Actual.cooked = m_Actual.raw;
+  formal.cooked = formal.raw;
+  actual.cooked = actual.raw;
+  init();  // text may be one of the names: not read any more
+  m_Actual = std::move(actual);
+  m_Formal = std::move(formal);
   return second < 0;
 }
 
-void HxCCIdentifier::setCookedName(const KyCXString& name,
-                                   HxENameTypeTag type) {
-  this->name(type).cooked = name;
+const KyCXString& HxCCIdentifier::getRawName(HxENameTypeTag type) const {
+  return name(type).raw;
 }
 
-void HxCCIdentifier::setCookedName(KyCXString&& name, HxENameTypeTag type) {
-  this->name(type).cooked = std::move(name);
+const KyCXString& HxCCIdentifier::getCookedName(HxENameTypeTag type) const {
+  return name(type).cooked;
+}
+
+void HxCCIdentifier::setCookedName(const KyCXString& text,
+                                   HxENameTypeTag type) {
+  assign(name(type).cooked, text);
+}
+
+template <class Change>
+void HxCCIdentifier::changeTexts(Change change) {
+  HX_WithinMemory([&] {
+    KyCXString rawActual = change(m_Actual.raw);
+    KyCXString rawFormal = change(m_Formal.raw);
+    KyCXString cookedActual = change(m_Actual.cooked);
+    KyCXString cookedFormal = change(m_Formal.cooked);
+    m_Actual.raw = std::move(rawActual);
+    m_Formal.raw = std::move(rawFormal);
+    m_Actual.cooked = std::move(cookedActual);
+    m_Formal.cooked = std::move(cookedFormal);
+  });
 }
 
 void HxCCIdentifier::addPrefix(const KyCXString& prefix) {
-  const KyCXString text(prefix);  // may be one of the names changed here
-  for (Name* name : {&m_Actual, &m_Formal}) {
-    name->raw = text + name->raw;
-    name->cooked = text + name->cooked;
-  }
+  changeTexts([&](const KyCXString& text) { return prefix + text; });
 }
 
 void HxCCIdentifier::addPostfix(const KyCXString& postfix) { *this += postfix; }
 
 void HxCCIdentifier::makeCIdentifier() {
-  m_Actual.cooked.makeCIdentifier(false);
-  m_Formal.cooked.makeCIdentifier(false);
+  HX_WithinMemory([&] { makeCNames(); });
+}
+
+void HxCCIdentifier::makeCNames() {
+  KyCXString actual(m_Actual.cooked);
+  KyCXString formal(m_Formal.cooked);
+  actual.makeCIdentifier(false);
+  formal.makeCIdentifier(false);
+  m_Actual.cooked = std::move(actual);
+  m_Formal.cooked = std::move(formal);
 }
 
 void HxCCIdentifier::adaptSize() {
   if (!getIdentifierChangeable(eActiveName)) return;
   if (!HxCGlobal::getOptions()->getLimitVariableNameLength()) return;
-  shorten(m_Actual.cooked);
-  shorten(m_Formal.cooked);
+  HX_WithinMemory([&] {
+    KyCXString actual(m_Actual.cooked);
+    KyCXString formal(m_Formal.cooked);
+    shorten(actual);
+    shorten(formal);
+    m_Actual.cooked = std::move(actual);
+    m_Formal.cooked = std::move(formal);
+  });
+}
+
+bool HxCCIdentifier::isFormalNameActive() const { return m_FormalNameActive; }
+
+void HxCCIdentifier::activateFormalName() { m_FormalNameActive = true; }
+
+void HxCCIdentifier::activateActualName() { m_FormalNameActive = false; }
+
+HxCCIdentifier::HxECookLevelTag HxCCIdentifier::getCookLevel() {
+  return m_CookLevel;
+}
+
+void HxCCIdentifier::setCookLevel(HxECookLevelTag level) {
+  m_CookLevel = level;
+}
+
+void HxCCIdentifier::setIdentifierChangeable(bool value, HxENameTypeTag type) {
+  name(type).flags.changeable = value;
+}
+
+bool HxCCIdentifier::getIdentifierChangeable(HxENameTypeTag type) const {
+  return name(type).flags.changeable;
+}
+
+void HxCCIdentifier::setDollarLUsed(bool value, HxENameTypeTag type) {
+  name(type).flags.dollarLUsed = value;
 }
 
 bool HxCCIdentifier::getDollarLUsed(HxENameTypeTag type) const {
   const Name& found = name(type);
-  return m_CookLevel >= eCookLevelFull ? found.dollarLUsed
+  return m_CookLevel >= eCookLevelFull ? found.flags.dollarLUsed
                                        : containsMacro(found.cooked, 'L');
+}
+
+void HxCCIdentifier::setDollarEUsed(bool value, HxENameTypeTag type) {
+  name(type).flags.dollarEUsed = value;
 }
 
 bool HxCCIdentifier::getDollarEUsed(HxENameTypeTag type) const {
   const Name& found = name(type);
-  return m_CookLevel >= eCookLevelDollarE ? found.dollarEUsed
+  return m_CookLevel >= eCookLevelDollarE ? found.flags.dollarEUsed
                                           : containsMacro(found.cooked, 'E');
+}
+
+void HxCCIdentifier::setDollarNUsed(bool value, HxENameTypeTag type) {
+  name(type).flags.dollarNUsed = value;
 }
 
 bool HxCCIdentifier::getDollarNUsed(HxENameTypeTag type) const {
   const Name& found = name(type);
-  return m_CookLevel >= eCookLevelFull ? found.dollarNUsed
+  return m_CookLevel >= eCookLevelFull ? found.flags.dollarNUsed
                                        : containsMacro(found.cooked, 'N');
+}
+
+const KyCXString& HxCCIdentifier::getSignalLabel() const {
+  return m_SignalLabel;
+}
+
+void HxCCIdentifier::setSignalLabel(const KyCXString& label) {
+  assign(m_SignalLabel, label);
+}
+
+const HxCSrcRef* HxCCIdentifier::getSourceRef() const { return m_pSourceRef; }
+
+void HxCCIdentifier::setSourceRef(const HxCSrcRef* srcRef) {
+  m_pSourceRef = srcRef;
+}
+
+const HxCSrcRef* HxCCIdentifier::getDdSourceRef() const {
+  return m_pDdSourceRef;
+}
+
+void HxCCIdentifier::setDdSourceRef(const HxCSrcRef* srcRef) {
+  m_pDdSourceRef = srcRef;
+}
+
+HX_BdBlock* HxCCIdentifier::getSourceIVBlock() { return m_pSourceIVBlock; }
+
+void HxCCIdentifier::setSourceIVBlock(HX_BdBlock* block) {
+  m_pSourceIVBlock = block;
+}
+
+void HxCCIdentifier::getDollarXValue(KyCXString& value) const {
+  assign(value, m_DollarXValue);
+}
+
+void HxCCIdentifier::setDollarXValue(const KyCXString& value) {
+  assign(m_DollarXValue, value);
 }
 
 bool operator==(const HxCCIdentifier& a, const HxCCIdentifier& b) {
@@ -111,14 +258,11 @@ bool operator==(const HxCCIdentifier& a, const HxCCIdentifier& b) {
 }
 
 HxCCIdentifier& operator+=(HxCCIdentifier& id, const KyCXString& text) {
-  const KyCXString tail(text);  // may be one of the names changed here
-  id.m_Actual.raw += tail;
-  id.m_Formal.raw += tail;
-  id.m_Actual.cooked += tail;
-  id.m_Formal.cooked += tail;
+  id.changeTexts([&](const KyCXString& before) { return before + text; });
   return id;
 }
 
 HxCCIdentifier& operator+=(HxCCIdentifier& id, const char* text) {
-  return id += KyCXString(text);
+  HX_WithinMemory([&] { id += KyCXString(text); });
+  return id;
 }

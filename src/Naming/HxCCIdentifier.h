@@ -1,9 +1,9 @@
-// The name of one generated C object on its way from template to C text.
+// Name of one generated C object on the way from template to C text.
 //
-// An identifier holds two names, formal and actual, each as the template the
-// caller gave (raw) and as the text expanded so far (cooked). A template
-// "formal:actual" gives them separately; without ':' both are the same, and the
-// actual one may be changed (it gets the macro $R).
+// An identifier holds two names, formal and actual. Each name has a raw text,
+// the template of the caller, and a cooked text, the template as far as
+// expanded. A template "formal:actual" gives both names. A template without ':'
+// serves for both names; the actual name then ends in the macro "$R".
 //
 //   HxCCIdentifier id("$S_$B");
 //   id.setSourceRef(block.getSrcRef());
@@ -21,130 +21,135 @@
 class HX_BdBlock;
 class HxCSrcRef;
 
-/// A value type. The pointers it holds are borrowed: their owners keep them
-/// alive for as long as the identifier is used. Nothing here reports a message.
+/// A value type. No operation reports a message.
+/// OWNERSHIP: pointers are borrowed; owners keep the objects alive while the
+/// identifier is in use.
+/// MEMORY: an operation that runs out of memory leaves the identifier as before
+/// the call; a constructor makes an empty identifier.
 class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
  public:
-  /// Selects one of the two names. Any other value addresses the actual name.
+  /// Selects a name. Any other value means the actual name.
   enum HxENameTypeTag : int {
-    eActiveName = 0,  ///< the formal name while it is active, else the actual
+    eActiveName = 0,  ///< formal while the formal name is active, else actual
     eActualName = 1,
     eFormalName = 2
   };
 
-  /// How far the identifier has been expanded.
+  /// Progress of the expansion.
   enum HxECookLevelTag : int {
     eCookLevelRaw = 0,      ///< nothing expanded
     eCookLevelDollarE = 1,  ///< $E substituted
     eCookLevelFull = 2,     ///< both templates expanded
-    eCookLevelSymbol = 3    ///< the symbol macros substituted as well
+    eCookLevelSymbol = 3    ///< symbol macros substituted
   };
 
-  /// Empty names, the formal one active, all flags false, level raw, no
+  /// Empty names, formal name active, all flags false, level raw, no
   /// references.
-  HxCCIdentifier() = default;
+  HxCCIdentifier();
   /// The same, then setName().
   HxCCIdentifier(const KyCXString& name);
   HxCCIdentifier(const char* name);
-  HxCCIdentifier(const HxCCIdentifier&) = default;
-  HxCCIdentifier& operator=(const HxCCIdentifier&) = default;
-  /// Like setName().
-  HxCCIdentifier& operator=(const KyCXString& name);
-  HxCCIdentifier& operator=(const char* name);
+  HxCCIdentifier(const HxCCIdentifier& other);
   virtual ~HxCCIdentifier();
 
-  /// Starts anew with the template \p name: everything else gets its initial
-  /// value. \p name may be one of this identifier's own names.
-  /// \return false if \p name has more than two parts; the first two count.
+  /// Copies everything, the active name included.
+  void operator=(const HxCCIdentifier& other);
+  /// Like setName().
+  void operator=(const KyCXString& name);
+  void operator=(const char* name);
+
+  /// Starts anew with the template \p name: all other fields get the initial
+  /// value. \p name may be a name of this identifier.
+  /// RETURNS: false if \p name has more than two parts (the first two parts
+  /// count) or memory runs out.
   bool setName(const KyCXString& name);
 
-  /// That part of the template; a template of one part is both, and the actual
-  /// one then ends in "$R".
-  const KyCXString& getRawName(HxENameTypeTag type) const {
-    return name(type).raw;
-  }
-  /// The name as far as it is expanded; the raw name at first.
-  const KyCXString& getCookedName(HxENameTypeTag type) const {
-    return name(type).cooked;
-  }
-  /// The raw name stays.
+  /// The template of name \p type. Without ':' both names share the template,
+  /// and the actual name ends in "$R".
+  const KyCXString& getRawName(HxENameTypeTag type) const;
+  /// The text of name \p type as far as expanded; at first the raw name.
+  const KyCXString& getCookedName(HxENameTypeTag type) const;
+  /// Replaces the cooked name; the raw name stays.
   void setCookedName(const KyCXString& name, HxENameTypeTag type);
-  void setCookedName(KyCXString&& name, HxENameTypeTag type);
 
-  /// Puts the text before, or after, all four names.
+  /// Puts a text before or behind all four texts.
   void addPrefix(const KyCXString& prefix);
   void addPostfix(const KyCXString& postfix);
 
   /// Makes both cooked names C identifiers.
   void makeCIdentifier();
 
-  /// Shortens both cooked names to HxCSymbol::sm_MaxNameLength with
-  /// "__" for their middle, if the active name may be changed and the option
-  /// that limits the length of names is on.
+  /// Shortens both cooked names to HxCSymbol::sm_MaxNameLength, with "__" in
+  /// the middle. REQUIRES for an effect: the active name may change, and the
+  /// option that limits the length of names is on.
   void adaptSize();
 
-  /// Which of the two names stands for the identifier where no type is given.
-  bool isFormalNameActive() const { return m_FormalNameActive; }
-  void activateFormalName() { m_FormalNameActive = true; }
-  void activateActualName() { m_FormalNameActive = false; }
+  /// The active name stands for the identifier where no type is given.
+  bool isFormalNameActive() const;
+  void activateFormalName();
+  void activateActualName();
 
-  /// How far the names are expanded; set by whoever expands them.
-  HxECookLevelTag getCookLevel() const { return m_CookLevel; }
-  void setCookLevel(HxECookLevelTag level) { m_CookLevel = level; }
+  /// Progress of the expansion, set by the engine.
+  HxECookLevelTag getCookLevel();
+  void setCookLevel(HxECookLevelTag level);
 
-  /// Whether the expanded name may still be changed, to shorten it or to make
-  /// it unique.
-  void setIdentifierChangeable(bool value, HxENameTypeTag type) {
-    name(type).changeable = value;
-  }
-  bool getIdentifierChangeable(HxENameTypeTag type) const {
-    return name(type).changeable;
-  }
+  /// Permission to shorten the expanded name or to make the name unique.
+  void setIdentifierChangeable(bool value, HxENameTypeTag type);
+  bool getIdentifierChangeable(HxENameTypeTag type) const;
 
-  /// Whether the name uses the macro. The stored answer counts once the
-  /// identifier is expanded far enough (level 2 for $L and $N, 1 for $E);
-  /// before that, whether the cooked name contains the macro.
-  void setDollarLUsed(bool value, HxENameTypeTag type) {
-    name(type).dollarLUsed = value;
-  }
+  /// Use of a macro by the name. From a level on (2 for $L and $N, 1 for $E)
+  /// the stored flag answers; below, whether the cooked name contains the
+  /// macro.
+  void setDollarLUsed(bool value, HxENameTypeTag type);
   bool getDollarLUsed(HxENameTypeTag type) const;
-  void setDollarEUsed(bool value, HxENameTypeTag type) {
-    name(type).dollarEUsed = value;
-  }
+  void setDollarEUsed(bool value, HxENameTypeTag type);
   bool getDollarEUsed(HxENameTypeTag type) const;
-  void setDollarNUsed(bool value, HxENameTypeTag type) {
-    name(type).dollarNUsed = value;
-  }
+  void setDollarNUsed(bool value, HxENameTypeTag type);
   bool getDollarNUsed(HxENameTypeTag type) const;
 
-  /// The label of the signal that the name is for, the value of $L; empty if it
-  /// has none.
-  const KyCXString& getSignalLabel() const { return m_SignalLabel; }
-  void setSignalLabel(const KyCXString& label) { m_SignalLabel = label; }
+  /// Label of the signal that the name is for, the value of $L; empty for a
+  /// signal without a label.
+  const KyCXString& getSignalLabel() const;
+  void setSignalLabel(const KyCXString& label);
 
-  /// The model object that the name is for.
-  const HxCSrcRef* getSourceRef() const { return m_pSourceRef; }
-  void setSourceRef(const HxCSrcRef* srcRef) { m_pSourceRef = srcRef; }
-  /// The data dictionary object that the name is for.
-  const HxCSrcRef* getDdSourceRef() const { return m_pDdSourceRef; }
-  void setDdSourceRef(const HxCSrcRef* srcRef) { m_pDdSourceRef = srcRef; }
-  /// The block of the intermediate view that the object stems from.
-  HX_BdBlock* getSourceIVBlock() const { return m_pSourceIVBlock; }
-  void setSourceIVBlock(HX_BdBlock* block) { m_pSourceIVBlock = block; }
+  /// Model object that the name is for.
+  const HxCSrcRef* getSourceRef() const;
+  void setSourceRef(const HxCSrcRef* srcRef);
+  /// Data dictionary object that the name is for.
+  const HxCSrcRef* getDdSourceRef() const;
+  void setDdSourceRef(const HxCSrcRef* srcRef);
+  /// Block of the intermediate view that the object stems from.
+  HX_BdBlock* getSourceIVBlock();
+  void setSourceIVBlock(HX_BdBlock* block);
 
-  /// The text that the macro $X stands for.
-  void getDollarXValue(KyCXString& value) const { value = m_DollarXValue; }
-  void setDollarXValue(const KyCXString& value) { m_DollarXValue = value; }
+  /// Value of the macro $X.
+  void getDollarXValue(KyCXString& value) const;
+  void setDollarXValue(const KyCXString& value);
 
  private:
-  struct Name {
-    KyCXString raw;
-    KyCXString cooked;
+  friend class HxCNames;
+
+  struct Flags {
     bool changeable = false;
     bool dollarLUsed = false;
     bool dollarEUsed = false;
     bool dollarNUsed = false;
   };
+  struct Name {
+    KyCXString raw;
+    KyCXString cooked;
+    Flags flags;
+  };
+
+  void init();
+  // copy(), setTemplate() and makeCNames() throw std::bad_alloc and then leave
+  // the identifier as before.
+  void copy(const HxCCIdentifier& other);
+  bool setTemplate(const KyCXString& text);
+  void makeCNames();
+  // Sets all four texts to change(text), or none without memory.
+  template <class Change>
+  void changeTexts(Change change);
 
   HxENameTypeTag getActiveNameType(HxENameTypeTag type) const {
     if (type != eActiveName) return type;
@@ -154,7 +159,8 @@ class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
     return getActiveNameType(type) == eFormalName ? m_Formal : m_Actual;
   }
   Name& name(HxENameTypeTag type) {
-    return getActiveNameType(type) == eFormalName ? m_Formal : m_Actual;
+    return const_cast<Name&>(
+        static_cast<const HxCCIdentifier*>(this)->name(type));
   }
   friend HX_UTILS_API HxCCIdentifier& operator+=(HxCCIdentifier& id,
                                                  const KyCXString& text);
@@ -170,9 +176,9 @@ class HX_UTILS_API HxCCIdentifier : public HX_Allocated {
   KyCXString m_DollarXValue;
 };
 
-/// True if the raw active names are equal; nothing else counts.
+/// Equality of the raw active names; all other fields may differ.
 HX_UTILS_API bool operator==(const HxCCIdentifier& a, const HxCCIdentifier& b);
-/// Appends \p text to all four names. \return \p id
+/// Appends \p text to all four texts. RETURNS: \p id.
 HX_UTILS_API HxCCIdentifier& operator+=(HxCCIdentifier& id,
                                         const KyCXString& text);
 HX_UTILS_API HxCCIdentifier& operator+=(HxCCIdentifier& id, const char* text);

@@ -1,13 +1,41 @@
-// The engine: from an identifier to its naming context, and the scan loop.
+// Engine of name templates: naming context and scan loop.
+//
+// Problem: expand the formal and the actual template of an identifier, with
+// values that hang on the model object of the identifier.
+//
+// Plain form: derive the context, then copy literal text and put in the value
+// of each macro, twice per identifier. The scan is linear in the template.
+//
+// Idea: most actual templates repeat the formal template ("$S_$B" stands for
+// "$S_$B:$S_$B$R"). A repeated template is copied, not expanded again. The
+// scan loop finds the evaluator of a macro by the letter, in a table made from
+// the macro table at compile time.
+//
+// Example: "$S_$B:$B", block "Speed Gain" in subsystem a3.
+//   formal  "$S" -> "Sa3"   "_" -> "_"   "$B" -> "Speed_Gain"
+//   actual  "$B" -> "Speed_Gain"
+//
+// Invariants:
+// 1. The position of the scan stands on literal text or on the '$' of a macro.
+// 2. Both results exist before the identifier takes a result: missing memory
+//    leaves names, flags, active name and cook level as before.
+// 3. Messages name the reference before the context moved to a parent or chart.
+//
+// The test EveryShortTemplateExpandsAsThePlainScanDoes compares with the plain
+// form.
 
 #include "Naming/HxCNames.h"
 
 #include <array>
+#include <functional>
+#include <new>
 #include <utility>
 
 #include "Control/ERR_Messages.h"
+#include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
 #include "FLAG.h"
+#include "Naming/HX_MacroRows.h"
 #include "Naming/HxCNamesScan.h"
 #include "SourceRef/HxCBlockSrcRef.h"
 #include "SourceRef/HxCDdSrcRef.h"
@@ -23,10 +51,8 @@
 
 namespace {
 
-constexpr char kErrorCode[] = __FILE__ "_";
-
 constexpr int kLongForm = 40;
-constexpr unsigned int kNone = 0;  // of the macros is retained
+constexpr unsigned int kNone = 0;  // no macro retained or provisional
 
 enum class Follows { eNo, eAsIs, eChangeable };
 
@@ -43,110 +69,174 @@ Follows followsFormal(const KyCXString& actual, const KyCXString& formal) {
   return Follows::eNo;
 }
 
+// Objects of the model create their references on demand: null means that
+// memory ran out.
+template <class Ref>
+const Ref* created(const Ref* srcRef) {
+  if (srcRef == nullptr) throw std::bad_alloc();
+  return srcRef;
+}
+
+// Adapter from an evaluator to a row: calls \p Evaluate with result, bit sets
+// and the items of the scan that the evaluator needs.
+template <auto Evaluate, auto... Items, class Scan>
+int expandBy(HxCNames& names, Scan& scan) {
+  return (names.*Evaluate)(scan.result, scan.retained, scan.provisional,
+                           std::invoke(Items, scan)...);
+}
+
 }  // namespace
 
+HxCNames::HxCNames() = default;
+HxCNames::HxCNames(const HxCNames&) = default;
+HxCNames& HxCNames::operator=(const HxCNames&) = default;
 HxCNames::~HxCNames() = default;
+
+// Flags and active name of an identifier, put back unless kept.
+class HxCNames::Restore {
+ public:
+  explicit Restore(HxCCIdentifier& id)
+      : m_Id(id),
+        m_Formal(id.m_Formal.flags),
+        m_Actual(id.m_Actual.flags),
+        m_FormalWasActive(id.m_FormalNameActive) {}
+  Restore(const Restore&) = delete;
+  Restore& operator=(const Restore&) = delete;
+  ~Restore() {
+    m_Id.m_FormalNameActive = m_FormalWasActive;
+    if (m_KeepFlags) return;
+    m_Id.m_Formal.flags = m_Formal;
+    m_Id.m_Actual.flags = m_Actual;
+  }
+
+  void keepFlags() { m_KeepFlags = true; }
+
+ private:
+  HxCCIdentifier& m_Id;
+  HxCCIdentifier::Flags m_Formal;
+  HxCCIdentifier::Flags m_Actual;
+  bool m_FormalWasActive;
+  bool m_KeepFlags = false;
+};
 
 bool HxCNames::createNameFromForm(HxCCIdentifier& id, HX_DataType* type,
                                   unsigned int retainedMacros,
                                   unsigned int provisionalMacros,
                                   bool suppressMessages) {
-  constexpr auto kActual = HxCCIdentifier::eActualName;
   m_NameComplete = true;
-  if (id.getCookLevel() == HxCCIdentifier::eCookLevelFull)
-    return m_NameComplete;
+  if (id.m_CookLevel == HxCCIdentifier::eCookLevelFull) return m_NameComplete;
+  const bool isDone = HX_WithinMemory([&] {
+    createBothNamesFromForm(id, type, retainedMacros, provisionalMacros,
+                            suppressMessages);
+  });
+  if (!isDone) m_NameComplete = false;
+  return m_NameComplete;
+}
 
-  const bool formalWasActive = id.isFormalNameActive();
-  const Follows follows = followsFormal(
-      id.getCookedName(kActual), id.getCookedName(HxCCIdentifier::eFormalName));
+void HxCNames::createBothNamesFromForm(HxCCIdentifier& id, HX_DataType* type,
+                                       unsigned int retainedMacros,
+                                       unsigned int provisionalMacros,
+                                       bool suppressMessages) {
+  Restore restore(id);
+  HxCCIdentifier::Name& actual = id.m_Actual;
+  HxCCIdentifier::Name& formal = id.m_Formal;
+  const Follows follows = followsFormal(actual.cooked, formal.cooked);
   id.activateFormalName();
-  createSingleNameFromForm(id, type, retainedMacros, provisionalMacros,
-                           suppressMessages);
+  KyCXString text = expandActiveName(id, type, retainedMacros,
+                                     provisionalMacros, suppressMessages);
   if (follows == Follows::eNo) {
     id.activateActualName();
     createSingleNameFromForm(id, type, retainedMacros, provisionalMacros,
                              suppressMessages);
+    formal.cooked = std::move(text);
   } else {
-    id.setCookedName(id.getCookedName(kActive), kActual);
-    id.setIdentifierChangeable(
-        id.getIdentifierChangeable(kActive) || follows == Follows::eChangeable,
-        kActual);
-    // The level is not raised yet, so that below it the getters answer from
-    // the expanded text.
-    id.setDollarLUsed(id.getDollarLUsed(kActive), kActual);
-    id.setDollarEUsed(id.getDollarEUsed(kActive), kActual);
-    id.setDollarNUsed(id.getDollarNUsed(kActive), kActual);
+    KyCXString copy(text);
+    formal.cooked = std::move(text);
+    actual.cooked = std::move(copy);
+    actual.flags.changeable =
+        formal.flags.changeable || follows == Follows::eChangeable;
+    // At the level before the expansion: below the threshold of a getter the
+    // expanded text answers.
+    actual.flags.dollarLUsed = id.getDollarLUsed(kActive);
+    actual.flags.dollarEUsed = id.getDollarEUsed(kActive);
+    actual.flags.dollarNUsed = id.getDollarNUsed(kActive);
   }
-  if (formalWasActive)
-    id.activateFormalName();
-  else
-    id.activateActualName();
+  restore.keepFlags();
   id.setCookLevel(HxCCIdentifier::eCookLevelFull);
-  return m_NameComplete;
 }
 
-// Expands the active name.
 void HxCNames::createSingleNameFromForm(HxCCIdentifier& id, HX_DataType* type,
                                         unsigned int retainedMacros,
                                         unsigned int provisionalMacros,
                                         bool suppressMessages) {
-  Context context;
-  deriveContext(id, context);
-  const KyCXString& cooked = id.getCookedName(kActive);
-  const KyCXString standIn =
-      cooked.isEmpty() ? standInForm(context, suppressMessages) : KyCXString();
-  const KyCXString& form = cooked.isEmpty() ? standIn : cooked;
-  Scan scan{
-      *this,   id,   type, retainedMacros, provisionalMacros, suppressMessages,
-      context, form, {}};
-  scanTemplate(scan);
-  id.setCookedName(std::move(scan.result), kActive);
-  if (context.changeable) id.setIdentifierChangeable(true, kActive);
+  KyCXString text = expandActiveName(id, type, retainedMacros,
+                                     provisionalMacros, suppressMessages);
+  id.name(kActive).cooked = std::move(text);
 }
 
-void HxCNames::deriveContext(HxCCIdentifier& id, Context& context) {
-  context.ivBlock = id.getSourceIVBlock();
-  context.srcRef = id.getSourceRef();
-  if (context.srcRef == nullptr && context.ivBlock != nullptr)
-    context.srcRef = context.ivBlock->getSrcRef();
-  context.reportRef = context.srcRef;
-  if (context.srcRef != nullptr) {
-    enterBlock(context);
-    enterStateflowObject(context);
+// Expands the template of the active name, which stays; flags are set.
+KyCXString HxCNames::expandActiveName(HxCCIdentifier& id, HX_DataType* type,
+                                      unsigned int retainedMacros,
+                                      unsigned int provisionalMacros,
+                                      bool suppressMessages) {
+  Scan scan{.pId = &id,
+            .type = type,
+            .retained = retainedMacros,
+            .provisional = provisionalMacros,
+            .suppressMessages = suppressMessages};
+  deriveContext(scan);
+  scan.pForm = &id.name(kActive).cooked;
+  if (scan.pForm->isEmpty()) {
+    scan.standIn = standInForm(scan);
+    scan.pForm = &scan.standIn;
   }
-  if (!context.hasSystemId) getRootDollarI(context.systemId);
-  const HxCSrcRef* ddRef = id.getDdSourceRef();
-  if (ddRef != nullptr && ddRef->isDd() != nullptr)
-    HX_DataDictionary::getObjectName(ddRef->isDd()->getDdHandle(),
-                                     context.ddName);
+  scanTemplate(scan);
+  if (scan.changeable) id.setIdentifierChangeable(true, kActive);
+  return std::move(scan.result);
 }
 
-// From a block reference to the block that the name is for, and on to the
-// chart that it holds.
-void HxCNames::enterBlock(Context& context) {
-  const HxCBlockSrcRef* blockRef = context.srcRef->isBlock();
+void HxCNames::deriveContext(Scan& scan) {
+  scan.ivBlock = scan.pId->m_pSourceIVBlock;
+  scan.srcRef = scan.pId->m_pSourceRef;
+  if (scan.srcRef == nullptr && scan.ivBlock != nullptr)
+    scan.srcRef = scan.ivBlock->getSrcRef();
+  scan.reportRef = scan.srcRef;
+  if (scan.srcRef != nullptr) {
+    enterBlock(scan);
+    enterStateflowObject(scan);
+  }
+  if (!scan.hasSystemId) getRootDollarI(scan.systemId);
+  const HxCSrcRef* ddRef = scan.pId->m_pDdSourceRef;
+  if (ddRef != nullptr && ddRef->isDd() != nullptr)
+    HX_DataDictionary::getObjectName(ddRef->isDd()->getDdHandle(), scan.ddName);
+}
+
+// From a block reference to the block that names the object, then to the chart
+// of the block.
+void HxCNames::enterBlock(Scan& scan) {
+  const HxCBlockSrcRef* blockRef = scan.srcRef->isBlock();
   if (blockRef == nullptr || blockRef->getBlock() == nullptr) return;
   if (blockRef->getBlock()->isNamedThroughParent() != nullptr) {
-    context.srcRef = blockRef->getBlock()->getParent()->getSrcRef();
-    blockRef = context.srcRef->isBlock();
+    scan.srcRef = created(blockRef->getBlock()->getParent()->getSrcRef());
+    blockRef = scan.srcRef->isBlock();
   }
-  context.block = blockRef->getBlock();
-  context.setSystemId(*context.block->getSubsystemId());
-  HX_StateflowBlock* chartBlock = context.block->isStateflowBlock();
+  scan.block = blockRef->getBlock();
+  scan.setSystemId(*scan.block->getSubsystemId());
+  HX_StateflowBlock* chartBlock = scan.block->isStateflowBlock();
   if (chartBlock != nullptr && chartBlock->getChartState() != nullptr)
-    context.srcRef = chartBlock->getChartState()->getStateflowSrcRef();
+    scan.srcRef = created(chartBlock->getChartState()->getStateflowSrcRef());
 }
 
-void HxCNames::enterStateflowObject(Context& context) {
-  const HxCStateflowSrcRef* sfRef = context.srcRef->isStateflow();
+void HxCNames::enterStateflowObject(Scan& scan) {
+  const HxCStateflowSrcRef* sfRef = scan.srcRef->isStateflow();
   if (sfRef == nullptr || sfRef->getSfObject() == nullptr) return;
-  context.sfObject = sfRef->getSfObject();
-  context.block = context.sfObject->getContainingBlock();
-  const SC_State* chartState = SC_ModelAccess::getChartState(context.sfObject);
+  scan.sfObject = sfRef->getSfObject();
+  scan.block = scan.sfObject->getContainingBlock();
+  const SC_State* chartState = SC_ModelAccess::getChartState(scan.sfObject);
   if (chartState != nullptr)
-    context.setSystemId(chartState->getChart()->getSubsystemId());
-  else if (context.block != nullptr)
-    context.setSystemId(*context.block->getSubsystemId());
+    scan.setSystemId(chartState->getChart()->getSubsystemId());
+  else if (scan.block != nullptr)
+    scan.setSystemId(*scan.block->getSubsystemId());
 }
 
 void HxCNames::getRootDollarI(KyCXString& systemId) {
@@ -160,19 +250,19 @@ void HxCNames::getRootDollarI(KyCXString& systemId) {
     systemId = HxCGlobal::getOptions()->getHxSystemID();
 }
 
-// What stands in for an empty template.
-KyCXString HxCNames::standInForm(const Context& context,
-                                 bool suppressMessages) {
-  if (HX_Assert(context.reportRef != nullptr, kErrorCode) && !suppressMessages)
-    ERR_Msg503(context.reportRef);
+// Replacement of an empty template.
+KyCXString HxCNames::standInForm(const Scan& scan) {
+  if (HX_Assert(scan.reportRef != nullptr, kNamesErrorCode) &&
+      !scan.suppressMessages)
+    ERR_Msg503(scan.reportRef);
   const bool forStateflow =
-      context.srcRef != nullptr && context.srcRef->isStateflow() != nullptr;
+      scan.srcRef != nullptr && scan.srcRef->isStateflow() != nullptr;
   return forStateflow ? "$C_$O" : "$S_$B";
 }
 
 void HxCNames::scanTemplate(Scan& scan) {
-  const KyCXString& form = scan.form;
-  // Where the template does not fit into a text object, neither will the name.
+  const KyCXString& form = scan.form();
+  // A template too long for a text object makes a name too long for it.
   if (form.length() >= kLongForm) scan.result.reserve(2 * form.length());
   while (scan.pos < form.length()) {
     const unsigned short unit = form[scan.pos];
@@ -183,170 +273,143 @@ void HxCNames::scanTemplate(Scan& scan) {
       continue;
     }
     const unsigned short letter = form[scan.pos + 1];
-    if (const MacroRow* row = findMacro(letter))
-      scan.pos += row->expand(scan);
-    else
+    const MacroRow* row = findMacro(letter);
+    if (row == nullptr) {
       keepForeignMacro(scan, letter);
+      continue;
+    }
+    scan.pos += row->expand(*this, scan);
+    if (row->noteUse != nullptr) (scan.id().*row->noteUse)(true, kActive);
   }
 }
 
-// In the order of the list of macros; no letter stands twice.
-// NOLINTNEXTLINE(readability-function-size): a table, not a course of steps
+// The letters are different: their order has no meaning.
 const HxCNames::MacroRow* HxCNames::findMacro(unsigned short letter) {
+  using Self = HxCNames;
+  // Extended macros share one row.
+  static constexpr HX_Macro kExtended{"$(", 0, hx_macros::kTemplate, 0, "",
+                                      "",   ""};
   static constexpr MacroRow kRows[] = {
-      {'L',
-       [](Scan& s) {
-         const int length =
-             s.names.evaluateLabelMacro(s.result, s.retained, s.provisional,
-                                        s.id.getSignalLabel(), s.context.block);
-         s.id.setDollarLUsed(true, kActive);
-         return length;
-       }},
-      {'B',
-       [](Scan& s) {
-         return s.names.evaluateBlockNameMacro(s.result, s.retained,
-                                               s.provisional, s.context.block,
-                                               s.context.ivBlock);
-       }},
-      {'S',
-       [](Scan& s) {
-         return s.names.evaluateSystemNumberMacro(
-             s.result, s.retained, s.provisional, s.context.block,
-             s.context.systemId, s.context.changeable);
-       }},
-      {'I',
-       [](Scan& s) {
-         return s.names.evaluateSystemIDMacro(
-             s.result, s.retained, s.provisional, s.context.systemId);
-       }},
-      {'M',
-       [](Scan& s) {
-         return s.names.evaluateModelNameMacro(s.result, s.retained,
-                                               s.provisional);
-       }},
-      {'N',
-       [](Scan& s) {
-         const int length = s.names.evaluateSubsystemNameMacro(
-             s.result, s.retained, s.provisional);
-         s.id.setDollarNUsed(true, kActive);
-         return length;
-       }},
-      {'H',
-       [](Scan& s) {
-         return s.names.evaluateStateHierarchyMacro(
-             s.result, s.retained, s.provisional, s.context.sfObject);
-       }},
-      {'O',
-       [](Scan& s) {
-         return s.names.evaluateSFObjectNameMacro(
-             s.result, s.retained, s.provisional, s.context.sfObject);
-       }},
-      {'C',
-       [](Scan& s) {
-         return s.names.evaluateSFObjectIDMacro(
-             s.result, s.retained, s.provisional, s.context.sfObject,
-             s.context.systemId, s.context.changeable);
-       }},
-      {'D', [](Scan& s) { return s.names.expandDollarD(s); }},
-      {'X',
-       [](Scan& s) {
-         KyCXString value;
-         s.id.getDollarXValue(value);
-         return s.names.evaluateXNameMacro(s.result, s.retained, s.provisional,
-                                           value);
-       }},
-      {'T',
-       [](Scan& s) {
-         return s.names.evaluateTypeNameMacro(s.result, s.retained,
-                                              s.provisional, s.type);
-       }},
-      {'$',
-       [](Scan& s) {
-         s.result += '$';
-         return 2;
-       }},
-      {'R',
-       [](Scan& s) {
-         return s.names.evaluateSFObjectRMacro(
-             s.result, s.retained, s.provisional, s.context.changeable);
-       }},
-      {'(',
-       [](Scan& s) {
-         return s.names.evaluateExtendedNameMacro(
-             s.result, s.retained, s.provisional, s.form, s.pos, s.id, s.type,
-             s.context.srcRef, s.context.reportRef, s.suppressMessages);
-       }},
+      {&HX_MacroOf("$L"),
+       &expandBy<&Self::evaluateLabelMacro, &Scan::label, &Scan::block>,
+       &HxCCIdentifier::setDollarLUsed},
+      {&HX_MacroOf("$B"),
+       &expandBy<&Self::evaluateBlockNameMacro, &Scan::block, &Scan::ivBlock>},
+      {&HX_MacroOf("$S"),
+       &expandBy<&Self::evaluateSystemNumberMacro, &Scan::block,
+                 &Scan::systemId, &Scan::changeable>},
+      {&HX_MacroOf("$I"),
+       &expandBy<&Self::evaluateSystemIDMacro, &Scan::systemId>},
+      {&HX_MacroOf("$M"), &expandBy<&Self::evaluateModelNameMacro>},
+      {&HX_MacroOf("$N"), &expandBy<&Self::evaluateSubsystemNameMacro>,
+       &HxCCIdentifier::setDollarNUsed},
+      {&HX_MacroOf("$H"),
+       &expandBy<&Self::evaluateStateHierarchyMacro, &Scan::sfObject>},
+      {&HX_MacroOf("$O"),
+       &expandBy<&Self::evaluateSFObjectNameMacro, &Scan::sfObject>},
+      {&HX_MacroOf("$C"),
+       &expandBy<&Self::evaluateSFObjectIDMacro, &Scan::sfObject,
+                 &Scan::systemId, &Scan::changeable>},
+      {&HX_MacroOf("$D"), &Self::expandDollarD},
+      {&HX_MacroOf("$X"), &expandBy<&Self::evaluateXNameMacro, &Scan::xValue>},
+      {&HX_MacroOf("$T"), &expandBy<&Self::evaluateTypeNameMacro, &Scan::type>},
+      {&HX_MacroOf("$$"), &Self::expandDollar},
+      {&HX_MacroOf("$R"),
+       &expandBy<&Self::evaluateSFObjectRMacro, &Scan::changeable>},
+      {&kExtended, &expandBy<&Self::evaluateExtendedNameMacro, &Scan::form,
+                             &Scan::pos, &Scan::id, &Scan::type, &Scan::srcRef,
+                             &Scan::reportRef, &Scan::suppressMessages>},
   };
-  static constexpr int kLetters = 128;
+  static constexpr int kCodes = 128;
   static constexpr auto kRowOfLetter = [] {
-    std::array<const MacroRow*, kLetters> rows{};
+    std::array<const MacroRow*, kCodes> rows{};
     for (const MacroRow& row : kRows)
-      rows[static_cast<unsigned char>(row.letter)] = &row;
+      rows[static_cast<unsigned char>(row.macro->text[1])] = &row;
     return rows;
   }();
-  return letter < kLetters ? kRowOfLetter[letter] : nullptr;
+  static_assert(
+      [] {
+        for (const HX_Macro& macro : hx_macros::kLetters)
+          if ((kRowOfLetter[static_cast<unsigned char>(macro.text[1])] !=
+               nullptr) != (macro.stage == hx_macros::kTemplate))
+            return false;
+        return true;
+      }(),
+      "the rows are the letters of the template stage");
+  return letter < kCodes ? kRowOfLetter[letter] : nullptr;
 }
 
-// $D: the data dictionary object, or else what identifies the Stateflow object
-// or the block. A retained or provisional $D is not looked up.
-int HxCNames::expandDollarD(Scan& scan) {
-  Context& context = scan.context;
+// $$
+int HxCNames::expandDollar(HxCNames&, Scan& scan) {
+  scan.result += '$';
+  return 2;
+}
+
+// $D: the data dictionary object, else the identification of the Stateflow
+// object or block. A retained or provisional $D is not looked up.
+int HxCNames::expandDollarD(HxCNames& names, Scan& scan) {
+  constexpr const HX_Macro& kMacro = HX_MacroOf("$D");
   unsigned int provisional = scan.provisional;
   unsigned int retained = scan.retained;
-  if (FLAG_GetFlag(&provisional, eMacroDdObjectName)) {
-    scan.result += "_D";
-    m_NameComplete = false;
-  } else if (FLAG_GetFlag(&retained, eMacroDdObjectName)) {
-    scan.result += "$D";
-    m_NameComplete = false;
-  } else if (scan.id.getDdSourceRef() != nullptr) {
-    return evaluateDdObjectNameMacro(scan.result, retained, provisional,
-                                     context.ddName);
-  } else if (context.sfObject != nullptr) {
+  if (FLAG_GetFlag(&provisional, kMacro.bit)) {
+    scan.result += kMacro.placeholder;
+    names.m_NameComplete = false;
+  } else if (FLAG_GetFlag(&retained, kMacro.bit)) {
+    scan.result += kMacro.text;
+    names.m_NameComplete = false;
+  } else if (scan.pId->m_pDdSourceRef != nullptr) {
+    return names.evaluateDdObjectNameMacro(scan.result, retained, provisional,
+                                           scan.ddName);
+  } else if (scan.sfObject != nullptr) {
     scan.result += "DD_";
-    evaluateSFObjectIDMacro(scan.result, kNone, kNone, context.sfObject,
-                            context.systemId, context.changeable);
+    names.evaluateSFObjectIDMacro(scan.result, kNone, kNone, scan.sfObject,
+                                  scan.systemId, scan.changeable);
     scan.result += "_";
-    evaluateSFObjectNameMacro(scan.result, kNone, kNone, context.sfObject);
-  } else if (context.block != nullptr) {
+    names.evaluateSFObjectNameMacro(scan.result, kNone, kNone, scan.sfObject);
+  } else if (scan.block != nullptr) {
     scan.result += "DD_";
-    evaluateSystemNumberMacro(scan.result, kNone, kNone, context.block,
-                              context.systemId, context.changeable);
+    names.evaluateSystemNumberMacro(scan.result, kNone, kNone, scan.block,
+                                    scan.systemId, scan.changeable);
     scan.result += "_";
-    evaluateBlockNameMacro(scan.result, kNone, kNone, context.block,
-                           context.ivBlock);
+    names.evaluateBlockNameMacro(scan.result, kNone, kNone, scan.block,
+                                 scan.ivBlock);
   } else {
-    scan.result += "_D";
+    scan.result += kMacro.placeholder;
   }
   return 2;
 }
 
-// A macro that is not expanded here stays in the name, and is reported.
+// A macro of no row stays in the name and is reported.
 void HxCNames::keepForeignMacro(Scan& scan, unsigned short letter) {
-  struct ForeignRow {
-    char letter;
-    const char* shown;
-  };
-  static constexpr ForeignRow kForeign[] = {
-      {'P', "'$P'"},          {'V', "'$V' and '$v'"}, {'v', "'$V' and '$v'"},
-      {'F', "'$F' and '$f'"}, {'f', "'$F' and '$f'"}, {'E', "'$E'"}};
-
-  scan.result.appendSub(scan.form, scan.pos, scan.pos + 1);
-  const KyCXString macro = scan.form.sub(scan.pos, scan.pos + 1);
+  const KyCXString& form = scan.form();
+  const KyCXString macro = form.sub(scan.pos, scan.pos + 1);
+  scan.result += macro;
   scan.pos += 2;
-  if (letter == 'E' && scan.form[scan.pos] == '(') {
-    const int length = findDollarELength(scan.form, scan.pos);
-    KyCXString argument = scan.form.sub(scan.pos, scan.pos + length - 1);
+  if (letter == 'E' && form[scan.pos] == '(') {
+    const int length = findDollarELength(form, scan.pos);
+    KyCXString argument = form.sub(scan.pos, scan.pos + length - 1);
     scan.result += argument.makeCIdentifier(false);
     scan.pos += length;
   }
-  if (scan.suppressMessages) return;
-  const char* form = scan.id.getRawName(kActive).cstring();
-  for (const ForeignRow& row : kForeign) {
-    if (row.letter != letter) continue;
-    ERR_Msg1202(scan.context.reportRef, row.shown, form);
+  if (!scan.suppressMessages) reportForeignMacro(scan, macro);
+}
+
+// Where both cases of the letter are known, the message names both: "'$V' and
+// '$v'".
+void HxCNames::reportForeignMacro(Scan& scan, const KyCXString& macro) {
+  const auto isKnown = [](const KyCXString& text) {
+    const HX_Macro* row = HX_FindMacro(text);
+    return row != nullptr && row->message == 1202;
+  };
+  const KyCXString& raw = scan.pId->getRawName(kActive);
+  KyCXString shown = "'" + macro + "'";
+  if (!isKnown(macro)) {
+    ERR_Msg1203(scan.reportRef, shown.cstring(), raw.cstring());
     return;
   }
-  const KyCXString shown = "'" + macro + "'";
-  ERR_Msg1203(scan.context.reportRef, shown.cstring(), form);
+  KyCXString upper(macro);
+  KyCXString lower(macro);
+  if (isKnown(upper.toUpper()) && isKnown(lower.toLower()))
+    shown = "'" + upper + "' and '" + lower + "'";
+  ERR_Msg1202(scan.reportRef, shown.cstring(), raw.cstring());
 }

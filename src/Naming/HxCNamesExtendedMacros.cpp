@@ -1,9 +1,7 @@
 // Extended macros "$(Name)", and the software component of a variable.
 
-#include <cstring>
-#include <iterator>
-
 #include "Control/ERR_Messages.h"
+#include "Naming/HX_MacroRows.h"
 #include "Naming/HxCNames.h"
 #include "SourceRef/HxCDdSrcRef.h"
 #include "platform/datadictionary/HX_DataDictionary.h"
@@ -11,79 +9,13 @@
 
 namespace {
 
-// Every extended macro; the names up to kFirstExpanded are known, but get their
-// values before or after the expansion. One name stands twice.
-constexpr const char* kExtendedNames[] = {"Task",
-                                          "ISR",
-                                          "Msg",
-                                          "Ctr",
-                                          "Event",
-                                          "MsgVar",
-                                          "PObj",
-                                          "Time1us",
-                                          "Time10us",
-                                          "Time100us",
-                                          "Time1ms",
-                                          "Time10ms",
-                                          "Time100ms",
-                                          "Time1s",
-                                          "Time1m",
-                                          "Time1h",
-                                          "Time1d",
-                                          "Time",
-                                          "Period1us",
-                                          "Period10us",
-                                          "Period100us",
-                                          "Period1ms",
-                                          "Period10ms",
-                                          "Period100ms",
-                                          "Period1s",
-                                          "Period1m",
-                                          "Period1h",
-                                          "Period1d",
-                                          "Period",
-                                          "Offset1us",
-                                          "Offset10us",
-                                          "Offset100us",
-                                          "Offset1ms",
-                                          "Offset10ms",
-                                          "Offset100ms",
-                                          "Offset1s",
-                                          "Offset1m",
-                                          "Offset1h",
-                                          "Offset1d",
-                                          "Offset",
-                                          "Section",
-                                          "Module",
-                                          "FunctionName",
-                                          "DataVariantName",
-                                          "PageNumber",
-                                          "DataVariantName",
-                                          "VariantItemName",
-                                          "Type",
-                                          "BaseType",
-                                          "Component"};
-constexpr int kUnknown = -1;
-constexpr int kType = 47;
-constexpr int kBaseType = 48;
-constexpr int kComponent = 49;
-constexpr int kFirstExpanded = kType;
-static_assert(std::size(kExtendedNames) == kComponent + 1);
-
 constexpr char kVariables[] = "//DD0/Pool/Variables/";
 constexpr char kPool[] = "//DD0/Pool/";
 constexpr char kSoftwareComponents[] = "/Pool/Autosar/SoftwareComponents";
 constexpr unsigned short kSoftwareComponentKind = 145;
 constexpr unsigned long kUnconnected = ~0UL;
 
-// The last entry that equals \p name.
-int extendedIndex(const KyCXString& name) {
-  for (int i = kComponent; i >= 0; --i)
-    if (name == kExtendedNames[i]) return i;
-  return kUnknown;
-}
-
-// A text of the data dictionary interface, returned to it at the end.
+// Text of the data dictionary interface, released at the end.
 class DdText {
  public:
   DdText() = default;
@@ -98,7 +30,21 @@ class DdText {
   char* m_Text = nullptr;
 };
 
-// The component that a variable was found in first.
+// List of handles of the data dictionary interface, released at the end.
+class DdHandles {
+ public:
+  explicit DdHandles(kyddapi::KYSDDHandleNode* first) : m_First(first) {}
+  DdHandles(const DdHandles&) = delete;
+  DdHandles& operator=(const DdHandles&) = delete;
+  ~DdHandles() { DDAPIHeapFree(m_First); }
+
+  const kyddapi::KYSDDHandleNode* first() const { return m_First; }
+
+ private:
+  kyddapi::KYSDDHandleNode* m_First;
+};
+
+// First component that refers to the variable.
 struct Owner {
   bool found = false;
   KyCXString property;
@@ -128,8 +74,8 @@ bool refersTo(const kyddapi::KYCDDObject& list, long index,
   return variable.startsWith(path.get());
 }
 
-// Looks for \p variable in one component: the first component of all becomes
-// its owner, every further reference is reported.
+// Looks for \p variable in one component. The first component found becomes
+// the owner; references of further components are reported.
 void searchComponent(unsigned long handle, const KyCXString& variable,
                      const HxCSrcRef* variableRef, Owner& owner) {
   kyddapi::KYCDDSoftwareComponent component(kUnconnected);
@@ -153,39 +99,40 @@ void searchComponent(unsigned long handle, const KyCXString& variable,
 
 }  // namespace
 
+// A known name beyond the three that are expanded here waits for another stage.
 int HxCNames::evaluateExtendedNameMacro(
     KyCXString& result, unsigned int retainedMacros,
-    unsigned int provisionalMacros, const KyCXString& form, int pos,
+    unsigned int provisionalMacros, KyCXString& form, int pos,
     HxCCIdentifier& id, HX_DataType* type, const HxCSrcRef*,
     const HxCSrcRef* reportRef, bool suppressMessages) {
-  constexpr int kFrame = 3;  // '$' and both parentheses
   const int close = form.find(')', pos);
   if (close < 0) {
     result.appendSub(form, pos, form.length() - 1);
     return form.length();
   }
-  const KyCXString name = form.sub(pos + 2, close - 1);
-  const int index = extendedIndex(name);
-  if (index < kFirstExpanded) {
-    if (!suppressMessages) {
-      const KyCXString macro = "$" + name;
-      const auto report = index == kUnknown ? &ERR_Msg1203 : &ERR_Msg1202;
-      report(reportRef, macro.cstring(), id.getRawName(kActive).cstring());
-    }
+  const HX_Macro* macro = HX_FindMacro(form, pos);
+  if (macro == &HX_MacroOf("$(Type)")) {
+    evaluateLongTypeMacro(result, retainedMacros, provisionalMacros, type);
+  } else if (macro == &HX_MacroOf("$(BaseType)")) {
+    evaluateBaseTypeMacro(result, retainedMacros, provisionalMacros, type);
+  } else if (macro == &HX_MacroOf("$(Component)")) {
+    evaluateComponentMacro(result, retainedMacros, provisionalMacros, id);
+  } else {
+    const KyCXString name = form.sub(pos + 2, close - 1);
+    const KyCXString shown = "$" + name;
+    const char* raw = id.getRawName(kActive).cstring();
+    if (!suppressMessages && macro != nullptr)
+      ERR_Msg1202(reportRef, shown.cstring(), raw);
+    else if (!suppressMessages)
+      ERR_Msg1203(reportRef, shown.cstring(), raw);
     result += "__";
     result += name;
     result += "_";
-  } else if (index == kType) {
-    evaluateLongTypeMacro(result, retainedMacros, provisionalMacros, type);
-  } else if (index == kBaseType) {
-    evaluateBaseTypeMacro(result, retainedMacros, provisionalMacros, type);
-  } else {
-    evaluateComponentMacro(result, retainedMacros, provisionalMacros, id);
   }
-  return name.length() + kFrame;
+  return close + 1 - pos;
 }
 
-// Neither bit set has a bit for this macro.
+// No bit of the bit sets belongs to $(Component).
 void HxCNames::evaluateComponentMacro(KyCXString& result, unsigned int,
                                       unsigned int, HxCCIdentifier& id) {
   const HxCSrcRef* reference = id.getDdSourceRef();
@@ -210,12 +157,12 @@ void HxCNames::evaluateComponentMacro(KyCXString& result, unsigned int,
   }
   long count = 0;
   unsigned short error = 0;
-  kyddapi::KYSDDHandleNode* components =
-      pool.GetChildObjects(kSoftwareComponentKind, count, error);
+  const DdHandles components(
+      pool.GetChildObjects(kSoftwareComponentKind, count, error));
   Owner owner;
-  for (const auto* node = components; node != nullptr; node = node->next)
+  for (const auto* node = components.first(); node != nullptr;
+       node = node->next)
     searchComponent(node->handle, variable, variableRef, owner);
-  DDAPIHeapFree(components);
   if (owner.found)
     result += owner.component;
   else

@@ -3,17 +3,18 @@
 #include <algorithm>
 #include <cstdint>
 #include <iterator>
+#include <memory>
+#include <utility>
 
 #include "Control/ERR_Messages.h"
+#include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
-#include "Naming/HxCNames.h"
+#include "Naming/HxCNamesScan.h"
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
 #include "platform/model/HxCSymbol.h"
 
 namespace {
-
-constexpr char kErrorCode[] = __FILE__ "_";
 
 // ISO/IEC 9899:1990, 6.1.1.
 constexpr const char* kCKeywords[] = {
@@ -27,24 +28,40 @@ static_assert(sizeof kCKeywords / sizeof *kCKeywords == 32);
 
 constexpr int kLetters = 26;
 
-// For each first character the lengths of the dictionary's words, one bit per
-// length (the last one stands for all longer words): nearly every name that is
-// no word is turned away here.
+using Dictionary =
+    leda::dictionary<KyCXString, HxCNames::tagHxEDictEntryType, leda::ab_tree>;
+
+// Bloom filter in front of the dictionary: lengths of the words by first
+// character, one bit per length (the last bit for all longer words). Answers
+// most lookups of names without touching the dictionary.
 std::uint64_t s_wordLengths[256];
+// The filter needs texts that are equal only unit by unit.
+bool s_filterIsSound = false;
 
 std::uint64_t lengthBit(const KyCXString& text) {
   return std::uint64_t{1} << std::min(text.length(), 63);
 }
 
 bool mayBeWord(const KyCXString& text) {
-  return (s_wordLengths[text[0] & 0xFF] & lengthBit(text)) != 0;
+  return !s_filterIsSound ||
+         (s_wordLengths[text[0] & 0xFF] & lengthBit(text)) != 0;
 }
 
 void noteWord(const KyCXString& text) {
   s_wordLengths[text[0] & 0xFF] |= lengthBit(text);
 }
 
-// The letters of a bijective base-26 numeral, least significant first.
+// The string class of a host may fold letter case or skip characters in
+// leda::compare. Then two of these 257 texts are equal.
+bool comparesUnitByUnit() {
+  leda::dictionary<KyCXString, bool, leda::ab_tree> different;
+  different.insert(KyCXString(), true);
+  for (int unit = 0; unit < 256; ++unit)
+    different.insert(KyCXString(static_cast<char>(unit)), true);
+  return different.size() == 257;
+}
+
+// Letters of a bijective base-26 numeral, least significant first.
 KyCXString letterCode(int index) {
   KyCXString code;
   for (;;) {
@@ -61,31 +78,37 @@ leda::dictionary<KyCXString, HxCNames::tagHxEDictEntryType, leda::ab_tree>*
     HxCNames::s_pKeywordDict = nullptr;
 
 void HxCNames::boot() {
-  shutdown();
-  s_pKeywordDict =
-      new leda::dictionary<KyCXString, tagHxEDictEntryType, leda::ab_tree>;
-  for (const char* keyword : kCKeywords) {
-    s_pKeywordDict->insert(keyword, eDictCKeyword);
-    noteWord(keyword);
-  }
+  HX_WithinMemory([] {
+    std::unique_ptr<Dictionary> words(new Dictionary);
+    for (const char* keyword : kCKeywords)
+      words->insert(keyword, eDictCKeyword);
+    const bool isSound = comparesUnitByUnit();
+    shutdown();
+    s_pKeywordDict = words.release();
+    for (const char* keyword : kCKeywords) noteWord(keyword);
+    s_filterIsSound = isSound;
+  });
 }
 
 void HxCNames::shutdown() {
   delete s_pKeywordDict;
   s_pKeywordDict = nullptr;
+  s_filterIsSound = false;
   std::fill(std::begin(s_wordLengths), std::end(s_wordLengths), 0);
 }
 
 void HxCNames::addToKeywordDict(const KyCXString& word,
                                 tagHxEDictEntryType type) {
-  if (!HX_Assert(s_pKeywordDict != nullptr, kErrorCode)) return;
-  s_pKeywordDict->insert(word, type);
-  noteWord(word);
+  if (!HX_Assert(s_pKeywordDict != nullptr, kNamesErrorCode)) return;
+  HX_WithinMemory([&] {
+    s_pKeywordDict->insert(word, type);
+    noteWord(word);
+  });
 }
 
 bool HxCNames::isStringValidCVariableName(const KyCXString& name) {
   if (name.isEmpty()) return false;
-  if (!HX_Assert(s_pKeywordDict != nullptr, kErrorCode))
+  if (!HX_Assert(s_pKeywordDict != nullptr, kNamesErrorCode))
     return name.isValidCIdentifier();
   if (!mayBeWord(name)) return name.isValidCIdentifier();
   const auto entry = s_pKeywordDict->lookup(name);
@@ -114,16 +137,18 @@ bool HxCNames::isFileNameValid(KyCXString& name) {
 }
 
 bool HxCNames::isFileNameValid(HxCCIdentifier& identifier) {
-  KyCXString name(identifier.getCookedName(kActive));
-  return isFileNameValid(name);
+  return isFileNameValid(identifier.name(kActive).cooked);
 }
 
 void HxCNames::appendSuffix(KyCXString& name, int index) {
-  const KyCXString code = letterCode(index < 0 ? 0 : index);
-  int kept = name.length();
-  if (HxCGlobal::getOptions()->getLimitVariableNameLength())
-    kept = std::min(kept, HxCSymbol::sm_MaxNameLength - code.length() - 1);
-  name = name.head(kept);
-  name += '_';
-  name += code;
+  HX_WithinMemory([&] {
+    const KyCXString code = letterCode(index < 0 ? 0 : index);
+    int kept = name.length();
+    if (HxCGlobal::getOptions()->getLimitVariableNameLength())
+      kept = std::min(kept, HxCSymbol::sm_MaxNameLength - code.length() - 1);
+    KyCXString result = name.head(kept);
+    result += '_';
+    result += code;
+    name = std::move(result);
+  });
 }

@@ -1,6 +1,7 @@
 // Evaluators of the macros that name model objects.
 
 #include "FLAG.h"
+#include "Naming/HX_MacroRows.h"
 #include "Naming/HxCNames.h"
 #include "platform/model/HX_BdBlock.h"
 #include "platform/model/HX_Block.h"
@@ -24,14 +25,14 @@ void appendAsCIdentifier(KyCXString& result, const KyCXString& text) {
 
 }  // namespace
 
-// The rule of all evaluators: a provisional macro makes the name incomplete; a
-// retained one does as well, and leaves its own text in place of its value.
+// Rule of all evaluators: a provisional macro makes the name incomplete. A
+// retained macro makes the name incomplete, too, and stays as text.
 bool HxCNames::isRetained(KyCXString& result, unsigned int retainedMacros,
-                          unsigned int provisionalMacros, unsigned int bit,
-                          const char* macro) {
-  if (FLAG_GetFlag(&provisionalMacros, bit)) m_NameComplete = false;
-  if (!FLAG_GetFlag(&retainedMacros, bit)) return false;
-  result += macro;
+                          unsigned int provisionalMacros,
+                          const HX_Macro& macro) {
+  if (FLAG_GetFlag(&provisionalMacros, macro.bit)) m_NameComplete = false;
+  if (!FLAG_GetFlag(&retainedMacros, macro.bit)) return false;
+  result += macro.text;
   m_NameComplete = false;
   return true;
 }
@@ -41,7 +42,7 @@ int HxCNames::evaluateLabelMacro(KyCXString& result,
                                  unsigned int provisionalMacros,
                                  const KyCXString& label,
                                  const HX_Block* block) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroLabel, "$L"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$L")))
     return kMacroLength;
   // A propagated label stands in angle brackets.
   KyCXString text(label);
@@ -58,15 +59,14 @@ int HxCNames::evaluateBlockNameMacro(KyCXString& result,
                                      unsigned int provisionalMacros,
                                      const HX_Block* block,
                                      HX_BdBlock* ivBlock) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroBlockName,
-                 "$B"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$B")))
     return kMacroLength;
   if (block != nullptr)
     appendAsCIdentifier(result, block->getName());
   else if (ivBlock != nullptr)
     appendAsCIdentifier(result, ivBlock->getRawName());
   else
-    result += "_B";
+    result += HX_MacroOf("$B").placeholder;
   return kMacroLength;
 }
 
@@ -76,12 +76,11 @@ int HxCNames::evaluateSystemNumberMacro(KyCXString& result,
                                         HX_Block* block,
                                         const KyCXString& systemId,
                                         bool& changeable) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroSystemNumber,
-                 "$S"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$S")))
     return kMacroLength;
   changeable = true;
   if (block == nullptr && systemId.isEmpty()) {
-    result += "_S";
+    result += HX_MacroOf("$S").placeholder;
     return kMacroLength;
   }
   const int found =
@@ -96,8 +95,7 @@ int HxCNames::evaluateSystemIDMacro(KyCXString& result,
                                     unsigned int retainedMacros,
                                     unsigned int provisionalMacros,
                                     const KyCXString& systemId) {
-  if (!isRetained(result, retainedMacros, provisionalMacros, eMacroSystemId,
-                  "$I"))
+  if (!isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$I")))
     result += systemId;
   return kMacroLength;
 }
@@ -105,8 +103,7 @@ int HxCNames::evaluateSystemIDMacro(KyCXString& result,
 int HxCNames::evaluateModelNameMacro(KyCXString& result,
                                      unsigned int retainedMacros,
                                      unsigned int provisionalMacros) {
-  if (!isRetained(result, retainedMacros, provisionalMacros, eMacroModelName,
-                  "$M"))
+  if (!isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$M")))
     result += GLB_GetModelName();
   return kMacroLength;
 }
@@ -114,8 +111,7 @@ int HxCNames::evaluateModelNameMacro(KyCXString& result,
 int HxCNames::evaluateSubsystemNameMacro(KyCXString& result,
                                          unsigned int retainedMacros,
                                          unsigned int provisionalMacros) {
-  if (!isRetained(result, retainedMacros, provisionalMacros,
-                  eMacroSubsystemName, "$N"))
+  if (!isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$N")))
     result += GLB_GetSubsystemName();
   return kMacroLength;
 }
@@ -124,11 +120,10 @@ int HxCNames::evaluateStateHierarchyMacro(KyCXString& result,
                                           unsigned int retainedMacros,
                                           unsigned int provisionalMacros,
                                           const SC_Model* object) {
-  if (isRetained(result, retainedMacros, provisionalMacros,
-                 eMacroStateHierarchy, "$H"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$H")))
     return kMacroLength;
   if (object == nullptr)
-    result += "_H";
+    result += HX_MacroOf("$H").placeholder;
   else
     result += object->getHierarchy();
   return kMacroLength;
@@ -138,11 +133,10 @@ int HxCNames::evaluateSFObjectNameMacro(KyCXString& result,
                                         unsigned int retainedMacros,
                                         unsigned int provisionalMacros,
                                         const SC_Model* object) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroSFObjectName,
-                 "$O"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$O")))
     return kMacroLength;
   if (object == nullptr)
-    result += "_O";
+    result += HX_MacroOf("$O").placeholder;
   else
     appendAsCIdentifier(result, object->getName());
   return kMacroLength;
@@ -154,11 +148,10 @@ int HxCNames::evaluateSFObjectIDMacro(KyCXString& result,
                                       const SC_Model* object,
                                       const KyCXString& systemId,
                                       bool& changeable) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroSFObjectId,
-                 "$C"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$C")))
     return kMacroLength;
   if (object == nullptr) {
-    result += "_C";
+    result += HX_MacroOf("$C").placeholder;
     return kMacroLength;
   }
   changeable = true;
@@ -168,17 +161,17 @@ int HxCNames::evaluateSFObjectIDMacro(KyCXString& result,
   return kMacroLength;
 }
 
-// A provisional $D has its placeholder written in front of whatever follows.
+// A provisional $D writes the placeholder in front of value or macro.
 int HxCNames::evaluateDdObjectNameMacro(KyCXString& result,
                                         unsigned int retainedMacros,
                                         unsigned int provisionalMacros,
                                         const KyCXString& ddName) {
-  if (FLAG_GetFlag(&provisionalMacros, eMacroDdObjectName)) result += "_D";
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroDdObjectName,
-                 "$D"))
+  if (FLAG_GetFlag(&provisionalMacros, eMacroDdObjectName))
+    result += HX_MacroOf("$D").placeholder;
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$D")))
     return kMacroLength;
   if (ddName.isEmpty())
-    result += "_D";
+    result += HX_MacroOf("$D").placeholder;
   else
     result += ddName;
   return kMacroLength;
@@ -188,10 +181,10 @@ int HxCNames::evaluateXNameMacro(KyCXString& result,
                                  unsigned int retainedMacros,
                                  unsigned int provisionalMacros,
                                  const KyCXString& xValue) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroXName, "$X"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$X")))
     return kMacroLength;
   if (xValue.isEmpty())
-    result += "_X";
+    result += HX_MacroOf("$X").placeholder;
   else
     result += xValue;
   return kMacroLength;
@@ -201,8 +194,7 @@ int HxCNames::evaluateSFObjectRMacro(KyCXString& result,
                                      unsigned int retainedMacros,
                                      unsigned int provisionalMacros,
                                      bool& changeable) {
-  if (!isRetained(result, retainedMacros, provisionalMacros, eMacroChangeable,
-                  "$R"))
+  if (!isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$R")))
     changeable = true;
   return kMacroLength;
 }

@@ -1,49 +1,56 @@
-// What the expansion of one name works on; private to HxCNames.
+// State of one expansion, and rows of the scan loop; private to HxCNames.
 
 #ifndef NAMING_HXCNAMESSCAN_H
 #define NAMING_HXCNAMESSCAN_H
 
+#include "Naming/HX_MacroTable.h"
 #include "Naming/HxCNames.h"
 
-class SC_State;
+/// Error code of the assertions in all sources of HxCNames.
+constexpr char kNamesErrorCode[] = "HxCNames";
 
-/// The model objects that the macros of one name speak of.
-struct HxCNames::Context {
-  const HxCSrcRef* srcRef = nullptr;     ///< may move to a parent or a chart
-  const HxCSrcRef* reportRef = nullptr;  ///< the reference before any move
-  HX_Block* block = nullptr;
-  SC_Model* sfObject = nullptr;
-  KyCXString systemId;  ///< of the block or chart, else of the root
-  KyCXString ddName;
-  HX_BdBlock* ivBlock = nullptr;
-  bool changeable = false;   ///< set by $R, $S and $C
-  bool hasSystemId = false;  ///< a block or chart has set it, maybe to empty
-
-  void setSystemId(const KyCXString& id) {
-    systemId = id;
-    hasSystemId = true;
-  }
-};
-
-/// The state of the scan of one template.
+/// Naming context of one name, and position and result of the scan.
 struct HxCNames::Scan {
-  HxCNames& names;
-  HxCCIdentifier& id;
+  HxCCIdentifier* pId;
   HX_DataType* type;
   unsigned int retained;
   unsigned int provisional;
   bool suppressMessages;
-  Context& context;
-  const KyCXString& form;  ///< the template
-  KyCXString result;
+
+  // Naming context.
+  const HxCSrcRef* srcRef = nullptr;     ///< may move to a parent or a chart
+  const HxCSrcRef* reportRef = nullptr;  ///< source reference before a move
+  HX_Block* block = nullptr;
+  SC_Model* sfObject = nullptr;
+  KyCXString systemId{};  ///< of block or chart, else of the root
+  KyCXString ddName{};
+  HX_BdBlock* ivBlock = nullptr;
+  bool changeable = false;   ///< set by $R, $S and $C
+  bool hasSystemId = false;  ///< set by a block or chart, even if empty
+
+  // Scan.
+  KyCXString standIn{};         ///< replaces an empty template
+  KyCXString* pForm = nullptr;  ///< the template
   int pos = 0;
+  KyCXString result{};
+
+  HxCCIdentifier& id() { return *pId; }
+  KyCXString& form() { return *pForm; }
+  const KyCXString& label() { return pId->m_SignalLabel; }
+  const KyCXString& xValue() { return pId->m_DollarXValue; }
+  void setSystemId(const KyCXString& text) {
+    systemId = text;
+    hasSystemId = true;
+  }
 };
 
-/// One row per macro. The expansion appends to the result and returns the
-/// number of template characters it consumed, from the '$' on.
+/// Row of the scan loop. The operation appends to the result and returns the
+/// number of template characters consumed, '$' included.
 struct HxCNames::MacroRow {
-  char letter;
-  int (*expand)(Scan& scan);
+  const HX_Macro* macro;
+  int (*expand)(HxCNames& names, Scan& scan);
+  void (HxCCIdentifier::*noteUse)(bool,
+                                  HxCCIdentifier::HxENameTypeTag) = nullptr;
 };
 
 #endif  // NAMING_HXCNAMESSCAN_H

@@ -1,5 +1,29 @@
 // Substitution of macros by values that other components know.
+//
+// Problem: replace a macro everywhere in a name, but not inside extended macros
+// and arguments of "$E(...)", in the letter cases that the caller allows.
+//
+// Plain form: read the name token by token, compare the text behind each '$'
+// with the macro in lower or upper case, append a value or the token.
+//
+// Idea: search for '$' only, copy the text between two replacements in one
+// piece, and build nothing at all for a name without a replacement.
+//
+// Example: "a$(n)$n" with macro "n" and value "v", one letter case.
+//   '$' at 1: "(" begins an extended macro, the scan goes on at 5
+//   '$' at 5: "n" is the macro: append "a$(n)", append "v"   -> "a$(n)v"
+//
+// Invariants:
+// 1. The result holds the replaced form of the source before `copied`.
+// 2. Both texts exist before the identifier takes a text: missing memory
+//    changes nothing.
+//
+// The test EveryShortTemplateIsSubstitutedAsPlainly compares with the plain
+// form.
 
+#include <utility>
+
+#include "Control/HX_Memory.h"
 #include "FLAG.h"
 #include "Naming/HxCNames.h"
 #include "platform/datatypes/HX_DataType.h"
@@ -9,15 +33,20 @@ namespace {
 
 using NameType = HxCCIdentifier::HxENameTypeTag;
 
-// Macros of a file name that are expanded at once.
-constexpr unsigned int kFileNameRetained = 0xFEFC1;
+// A file name retains every macro bit but $B, $S, $I, $M, $N and $R.
+constexpr unsigned int kAllMacroBits = 0xFFFFF;
 constexpr unsigned int kModelObjectMacros = HxCNames::eMacroBlockName |
                                             HxCNames::eMacroSystemNumber |
                                             HxCNames::eMacroSystemId;
+constexpr unsigned int kFileNameRetained =
+    kAllMacroBits &
+    ~(kModelObjectMacros | HxCNames::eMacroModelName |
+      HxCNames::eMacroSubsystemName | HxCNames::eMacroChangeable);
+static_assert(kFileNameRetained == 0xFEFC1);
 
 enum class Match { eNone, eValue, eUpper };
 
-// A macro name in the forms in which it is looked for.
+// A macro name in the letter cases that count as the macro.
 class MacroKey {
  public:
   MacroKey(const KyCXString& macro, HxCNames::tagMacroKindEnum kind)
@@ -49,7 +78,7 @@ class MacroKey {
 
  private:
   HxCNames::tagMacroKindEnum m_Kind;
-  const KyCXString* m_pLower;  // the macro itself where case matters
+  const KyCXString* m_pLower;  // the macro as given where case matters
   KyCXString m_Lower;
   KyCXString m_Upper;  // only where upper case selects the value
 };
@@ -58,7 +87,7 @@ bool isLetter(const KyCXString& macro, char upper) {
   return macro.length() == 1 && (macro[0] == upper || macro[0] == upper + 32);
 }
 
-// References and flags that the name with the value in it inherits.
+// References and flags that a name inherits from a value.
 void takeOver(HxCCIdentifier& id, const HxCCIdentifier& value) {
   constexpr NameType kActive = HxCCIdentifier::eActiveName;
   if (value.getDdSourceRef() != nullptr)
@@ -83,17 +112,21 @@ bool HxCNames::substAllDollarZByValue(HxCCIdentifier& id,
                                       const KyCXString& macro,
                                       const HxCCIdentifier& value,
                                       tagMacroKindEnum kind) {
-  if (isLetter(macro, 'E')) id.setCookLevel(HxCCIdentifier::eCookLevelDollarE);
-  if (value.getCookLevel() == HxCCIdentifier::eCookLevelDollarE &&
-      id.getCookLevel() == HxCCIdentifier::eCookLevelRaw)
-    id.setCookLevel(HxCCIdentifier::eCookLevelDollarE);
-  takeOver(id, value);
+  return HX_WithinMemory(false,
+                         [&] { return replaceAll(id, macro, value, kind); });
+}
+
+// The formal text is made first and stored last.
+bool HxCNames::replaceAll(HxCCIdentifier& id, const KyCXString& macro,
+                          const HxCCIdentifier& value, tagMacroKindEnum kind) {
+  constexpr auto kFormal = HxCCIdentifier::eFormalName;
+  KyCXString text;
+  const bool inFormal = substitutedText(id.m_Formal.cooked, macro,
+                                        value.m_Formal.cooked, kind, text);
   const bool inActual = substAllDollarZByValue(id, macro, value, kind,
                                                HxCCIdentifier::eActualName);
-  // Put into itself, the actual name may use macros now that it did not.
-  if (&value == &id) takeOver(id, value);
-  const bool inFormal = substAllDollarZByValue(id, macro, value, kind,
-                                               HxCCIdentifier::eFormalName);
+  inherit(id, macro, value);
+  if (inFormal) storeSubstituted(id, macro, std::move(text), kFormal);
   return inActual || inFormal;
 }
 
@@ -101,14 +134,42 @@ bool HxCNames::substAllDollarZByValue(HxCCIdentifier& id,
                                       const KyCXString& macro,
                                       const HxCCIdentifier& value,
                                       tagMacroKindEnum kind, NameType type) {
-  const KyCXString& source = id.getCookedName(type);
+  KyCXString text;
+  const bool replaced = substitutedText(id.name(type).cooked, macro,
+                                        value.name(type).cooked, kind, text);
+  inherit(id, macro, value);
+  if (replaced) storeSubstituted(id, macro, std::move(text), type);
+  return replaced;
+}
+
+// Level, references and flags for \p id, with or without a replacement. The
+// level goes first, because the flags of a value that is \p id hang on it.
+void HxCNames::inherit(HxCCIdentifier& id, const KyCXString& macro,
+                       const HxCCIdentifier& value) {
+  constexpr auto kRaw = HxCCIdentifier::eCookLevelRaw;
+  constexpr auto kDollarE = HxCCIdentifier::eCookLevelDollarE;
+  if (isLetter(macro, 'E') ||
+      (value.m_CookLevel == kDollarE && id.m_CookLevel == kRaw))
+    id.setCookLevel(kDollarE);
+  takeOver(id, value);
+}
+
+void HxCNames::storeSubstituted(HxCCIdentifier& id, const KyCXString& macro,
+                                KyCXString&& text, NameType type) {
+  noteUse(id, macro, type);
+  id.name(type).cooked = std::move(text);
+}
+
+// RETURNS: whether \p source holds the macro; \p result is set only then.
+bool HxCNames::substitutedText(const KyCXString& source,
+                               const KyCXString& macro,
+                               const KyCXString& replacement,
+                               tagMacroKindEnum kind, KyCXString& result) {
   int dollar = source.find('$');
   if (dollar < 0) return false;
 
   const MacroKey key(macro, kind);
-  const KyCXString& replacement = value.getCookedName(type);
-  KyCXString result;
-  int copied = 0;  // the source is taken over up to here
+  int copied = 0;  // end of the source text taken over
   bool replaced = false;
   for (int next = 0; dollar >= 0; dollar = source.find('$', next)) {
     const Match match = key.match(source, dollar + 1);
@@ -126,13 +187,11 @@ bool HxCNames::substAllDollarZByValue(HxCCIdentifier& id,
   }
   if (!replaced) return false;
   result.appendSub(source, copied, source.length() - 1);
-  noteUse(id, macro, type);
-  id.setCookedName(result, type);
   return true;
 }
 
-// The position behind the macro at \p dollar that is copied unchanged: an
-// extended one up to its ')', $E with its argument, or '$' and one character.
+// Position behind the macro at \p dollar, which stays: an extended macro ends
+// at ')', $E behind the argument, any other macro behind one character.
 int HxCNames::endOfForeignMacro(const KyCXString& text, int dollar) {
   const unsigned short letter = text[dollar + 1];
   if (letter == '(') {
@@ -143,8 +202,8 @@ int HxCNames::endOfForeignMacro(const KyCXString& text, int dollar) {
   return dollar + 2;
 }
 
-// The length of the parenthesised group at \p start, 0 if there is none.
-// Parentheses between single quotes do not count; an unclosed group reaches to
+// Length of the parenthesised group at \p start, 0 without a group.
+// Parentheses between single quotes do not count. An unclosed group reaches to
 // the end of the text.
 int HxCNames::findDollarELength(const KyCXString& text, int start) {
   if (start < 0 || start >= text.length() || text[start] != '(') return 0;
@@ -168,18 +227,25 @@ bool HxCNames::handleFileNameMacro(HxCCIdentifier& id, bool useModelContext) {
   return createNameFromForm(id, nullptr, retained, 0, false);
 }
 
+// Each text becomes the template of an identifier.
 void HxCNames::handleSymbolNameMacro(HxCCIdentifier& id, HxCSymbol* symbol) {
-  substAllDollarZByValue(id, "x", HxCCIdentifier(symbol->getDollarX()),
-                         eMacroKindAnyCase);
-  const bool isFunction = symbol->getKind() == HxCSymbol::eFunction;
-  substAllDollarZByValue(id, isFunction ? "f" : "v",
-                         HxCCIdentifier(symbol->getName()),
-                         eMacroKindCaseSelectsValue);
-  const HX_DataType* type = symbol->getDataType();
-  HX_BaseTypeProperties* properties =
-      type == nullptr ? nullptr : type->getBaseTypeProperties();
-  const KyCXString cut =
-      properties == nullptr ? KyCXString() : *properties->getCut();
-  substAllDollarZByValue(id, "t", HxCCIdentifier(cut), eMacroKindAnyCase);
-  id.setCookLevel(HxCCIdentifier::eCookLevelSymbol);
+  HX_WithinMemory([&] {
+    const auto replace = [&](const char* macro, const KyCXString& text,
+                             tagMacroKindEnum kind) {
+      HxCCIdentifier value;
+      value.setTemplate(text);
+      replaceAll(id, macro, value, kind);
+    };
+    const bool isFunction = symbol->getKind() == HxCSymbol::eFunction;
+    const HX_DataType* type = symbol->getDataType();
+    HX_BaseTypeProperties* properties =
+        type == nullptr ? nullptr : type->getBaseTypeProperties();
+    const KyCXString cut =
+        properties == nullptr ? KyCXString() : *properties->getCut();
+    replace("x", symbol->getDollarX(), eMacroKindAnyCase);
+    replace(isFunction ? "f" : "v", symbol->getName(),
+            eMacroKindCaseSelectsValue);
+    replace("t", cut, eMacroKindAnyCase);
+    id.setCookLevel(HxCCIdentifier::eCookLevelSymbol);
+  });
 }

@@ -1,17 +1,17 @@
 // Evaluators of the macros that name data types.
 
 #include "Control/HX_SelfCheck.h"
-#include "Naming/HxCNames.h"
+#include "Naming/HX_MacroRows.h"
+#include "Naming/HxCNamesScan.h"
 #include "platform/datatypes/HX_DataTypeServer.h"
 #include "platform/datatypes/HX_NumericalType.h"
 #include "platform/model/HxCGlobal.h"
 
 namespace {
 
-constexpr char kErrorCode[] = __FILE__ "_";
 constexpr char kUnknownBaseType[] = "_UnknownHXBaseType_";
 
-// An array is named by its elements.
+// An array takes the name of the element type.
 HX_DataType* scalarOf(HX_DataType* type) {
   return HxCGlobal::getDataTypeServer()->getAsScalar(type, type->getSrcRef());
 }
@@ -31,7 +31,7 @@ KyCXString cutOfNumerical(const HX_DataType& type) {
   return cutOf(hasOwn ? &type : type.getUnderlyingType());
 }
 
-// The short name of a scalar type; the questions stand in their order.
+// Short name of a scalar type. The first question that holds decides.
 KyCXString shortName(const HX_DataType& type) {
   if (isUnnamed(type)) return {};
   if (type.isDerived()) return cutOf(type.getDerivedFrom());
@@ -41,7 +41,7 @@ KyCXString shortName(const HX_DataType& type) {
     return numerical != nullptr && numerical->isSigned() ? "I64" : "U64";
   }
   if (type.getNumericalType() != nullptr) return cutOfNumerical(type);
-  HX_Assert(false, kErrorCode);
+  HX_Assert(false, kNamesErrorCode);
   return {};
 }
 
@@ -56,11 +56,10 @@ int HxCNames::evaluateTypeNameMacro(KyCXString& result,
                                     unsigned int provisionalMacros,
                                     HX_DataType* type) {
   constexpr int kMacroLength = 2;
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroTypeName,
-                 "$T"))
+  if (isRetained(result, retainedMacros, provisionalMacros, HX_MacroOf("$T")))
     return kMacroLength;
   if (type == nullptr)
-    result += "_T";
+    result += HX_MacroOf("$T").placeholder;
   else
     result += shortName(*scalarOf(type));
   return kMacroLength;
@@ -70,11 +69,11 @@ void HxCNames::evaluateLongTypeMacro(KyCXString& result,
                                      unsigned int retainedMacros,
                                      unsigned int provisionalMacros,
                                      HX_DataType* type) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroLongTypeName,
-                 "$(Type)"))
+  if (isRetained(result, retainedMacros, provisionalMacros,
+                 HX_MacroOf("$(Type)")))
     return;
   if (type == nullptr) {
-    result += "__Type_";
+    result += HX_MacroOf("$(Type)").placeholder;
     return;
   }
   HX_DataType* scalar = scalarOf(type);
@@ -83,7 +82,7 @@ void HxCNames::evaluateLongTypeMacro(KyCXString& result,
     if (scalar->getNameObject() != nullptr) text = getTypeNameInCode(scalar);
   } else if (HX_Assert(scalar->isDerived() || scalar->isBaseType() ||
                            scalar->getNumericalType() != nullptr,
-                       kErrorCode)) {
+                       kNamesErrorCode)) {
     text = getTypeNameInCode(scalar);
   }
   result += text.makeCIdentifier(false);
@@ -93,20 +92,20 @@ void HxCNames::evaluateBaseTypeMacro(KyCXString& result,
                                      unsigned int retainedMacros,
                                      unsigned int provisionalMacros,
                                      HX_DataType* type) {
-  if (isRetained(result, retainedMacros, provisionalMacros, eMacroLongTypeName,
-                 "$(BaseType)"))
+  if (isRetained(result, retainedMacros, provisionalMacros,
+                 HX_MacroOf("$(BaseType)")))
     return;
   if (type == nullptr) {
-    result += "__BaseType_";
+    result += HX_MacroOf("$(BaseType)").placeholder;
     return;
   }
   KyCXString text = baseTypeName(scalarOf(type));
   result += text.makeCIdentifier(false);
 }
 
-// The questions stand in their order; the base type may be missing.
+// The first question that holds decides; the base type may be missing.
 KyCXString HxCNames::baseTypeName(HX_DataType* scalar) {
-  const auto nameOf = [](HX_DataType* base) {
+  const auto nameOf = [this](HX_DataType* base) {
     return base == nullptr ? KyCXString(kUnknownBaseType)
                            : getTypeNameInCode(base);
   };
@@ -120,6 +119,6 @@ KyCXString HxCNames::baseTypeName(HX_DataType* scalar) {
   if (scalar->isBaseType()) return getTypeNameInCode(scalar);
   if (scalar->getNumericalType() != nullptr)
     return nameOf(scalar->getDerivedFrom());
-  HX_Assert(false, kErrorCode);
+  HX_Assert(false, kNamesErrorCode);
   return {};
 }

@@ -35,7 +35,7 @@ class HxCNamesTestAccess {
   static std::string osekBaseTime(double value) {
     auto base = static_cast<HxCNames::tagHxEOsekTimeBase>(0);
     KyCXString unit("?");
-    HxCNames::determineOsekBaseTime(value, base, unit);
+    HxCNames().determineOsekBaseTime(value, base, unit);
     return std::to_string(base) + unit.cstring();
   }
 };

@@ -12,7 +12,7 @@ class CIdentifierTest : public HX_NamingFixture {
   static constexpr auto kFormal = Id::eFormalName;
 
   /// The raw names, the cooked ones, what is noted and the level.
-  std::string all(const Id& id) {
+  std::string all(Id id) {
     const KyCXString raw =
         id.getRawName(kFormal) + ":" + id.getRawName(kActual);
     return raw.cstring() + (" " + shown(id)) + " " + notedOf(id) + " " +
