@@ -1,8 +1,8 @@
 // The allocation convention of the library's own classes.
 //
-// A class that is created with new derives from HX_Allocated (a struct that
-// cannot derive from it uses the two functions): its memory comes from the
-// memory controller while one is installed and from the C heap otherwise.
+// A class that is created with new derives from HX_Allocated; a struct that
+// cannot derive uses the two functions. Memory comes from the memory controller
+// while a controller is installed, from the C heap otherwise.
 
 #ifndef CONTROL_HX_ALLOCATED_H
 #define CONTROL_HX_ALLOCATED_H
@@ -16,12 +16,12 @@
 /// no memory.
 HX_UTILS_API void* HX_Allocate(std::size_t size) noexcept;
 
-/// Returns a block of HX_Allocate(). The same controller must be installed as
-/// at its allocation; null is ignored.
+/// Returns a block of HX_Allocate(); null is ignored.
+/// REQUIRES: the controller of the allocation is still installed.
 HX_UTILS_API void HX_Free(void* block) noexcept;
 
-/// Empty base class. A failed allocation makes the new expression null, no
-/// constructor runs and nothing is thrown; the same holds for arrays and for
+/// Empty base class. If memory runs out, a new expression is null: no
+/// constructor runs and nothing is thrown. The same holds for arrays and for
 /// new (std::nothrow).
 class HX_Allocated {
  public:
@@ -33,7 +33,7 @@ class HX_Allocated {
   static void* operator new[](std::size_t size) noexcept {
     return HX_Allocate(size);
   }
-  /// The same, for callers who say that they expect null.
+  /// The same, for callers who say that null is expected.
   static void* operator new(std::size_t size, const std::nothrow_t&) noexcept {
     return HX_Allocate(size);
   }
@@ -56,7 +56,7 @@ class HX_Allocated {
   static void operator delete[](void* block, const std::nothrow_t&) noexcept {
     HX_Free(block);
   }
-  /// Takes nothing back: the place is the caller's.
+  /// Does nothing: the caller owns the place.
   static void operator delete(void*, void*) noexcept {}
 
  protected:

@@ -19,11 +19,11 @@ HX_UTILS_API void failAssertion(const char* fileCode, const char* file,
 
 }  // namespace hx_detail
 
-/// Debug check, for conditions that only a developer needs to hear about.
+/// Debug check, for conditions that matter to developers only.
 ///
-/// While ShowInternalInfo() is true, a false \p condition raises a debug report
-/// with \p expression and the caller's place, and breaks into the debugger if
-/// the report answers 1. Otherwise nothing happens.
+/// A false \p condition raises a debug report with \p expression and the place
+/// of the caller while ShowInternalInfo() is true, and breaks into the debugger
+/// if the report answers 1. Otherwise nothing happens.
 /// \return \p condition
 inline bool HX_DebugCheck(bool condition, const char* expression,
                           const char* file = __builtin_FILE(),
@@ -34,10 +34,12 @@ inline bool HX_DebugCheck(bool condition, const char* expression,
 
 /// Internal assertion, for broken invariants.
 ///
-/// A false \p condition raises the debug report with the expression "0" while
-/// ShowInternalInfo() is true, and in any case emits message 7 (severity 3)
-/// with \p fileCode, the text that stands for the source file, and the line.
-/// Execution goes on; the caller decides how.
+/// A false \p condition does two things:
+///   - raises the debug report with the expression "0" while ShowInternalInfo()
+///     is true, as a debug check does;
+///   - emits message 7 (severity 3) with \p fileCode, the text that stands for
+///     the source file, and the line.
+/// Then execution goes on; the caller decides how.
 /// \return \p condition
 inline bool HX_Assert(bool condition, const char* fileCode,
                       const char* file = __builtin_FILE(),

@@ -1,12 +1,14 @@
 #include "Control/HxCControl.h"
 
 #include <cmath>
+#include <utility>
 
+#include "Control/HX_Memory.h"
 #include "platform/messages/ERR_MessageHandler.h"
 
 namespace {
 
-// The start time of a stop without a start, milliseconds.
+// Start time, in milliseconds, of a stop without a start.
 constexpr double kNoStart = -1.0;
 
 bool isOn(double value) { return value != 0.0 && !std::isnan(value); }
@@ -16,10 +18,24 @@ bool isOn(double value) { return value != 0.0 && !std::isnan(value); }
 bool HxCControl::s_ProfilingOn = false;
 bool HxCControl::s_TraceFallThrough = false;
 
+HxCControl::HxCControl(const HxCControl& other) : HX_Allocated() {
+  *this = other;
+}
+
+HxCControl& HxCControl::operator=(const HxCControl& other) {
+  HX_WithinMemory([&] {
+    leda::stack<double> timers(other.m_Timers);
+    m_Timers = std::move(timers);
+  });
+  return *this;
+}
+
 HxCControl::~HxCControl() = default;
 
 void HxCControl::startTimer() {
-  if (s_ProfilingOn) m_Timers.push(m_TimeStamp.getTimeStamp());
+  if (!s_ProfilingOn) return;
+  const double start = m_TimeStamp.getTimeStamp();
+  HX_WithinMemory([&] { m_Timers.push(start); });
 }
 
 void HxCControl::stopTimeAndEmitMessage(KyCXString& label) {

@@ -1,4 +1,4 @@
-// Process-wide switches, and profiling timers that nest.
+// Switches of the process, and profiling timers that nest.
 //
 //   HxCControl::setProfiling(1.0);
 //   HxCControl control;
@@ -17,28 +17,31 @@
 
 class KyCXString;
 
-/// Copying copies the timers that are running. The switches belong to the
-/// process, are off at load and take effect with the next call that reads them.
+/// The switches belong to the process and are off at load. A change takes
+/// effect with the next call that reads the switch.
+/// Copying copies the running timers. If memory runs out, a copy has no timers
+/// and an assignment changes nothing.
 class HX_UTILS_API HxCControl : public HX_Allocated {
  public:
   HxCControl() = default;
-  HxCControl(const HxCControl&) = default;
-  HxCControl& operator=(const HxCControl&) = default;
+  HxCControl(const HxCControl& other);
+  HxCControl& operator=(const HxCControl& other);
   virtual ~HxCControl();
 
-  /// Starts a timer of this object, while profiling is on.
+  /// Starts a timer of this object while profiling is on. If memory runs out,
+  /// no timer starts, and the next stop ends the timer before.
   void startTimer();
 
-  /// Ends the latest timer of this object and reports its time as message 2.
+  /// Ends the latest timer of this object and reports the time as message 2.
   ///
-  /// While profiling is off nothing happens and the timer keeps running. With
-  /// no timer running, the time counts from one millisecond before the origin
-  /// of the process clock.
+  /// While profiling is off nothing happens and the timer keeps running. If no
+  /// timer runs, the time counts from one millisecond before the origin of the
+  /// process clock.
   virtual void stopTimeAndEmitMessage(KyCXString& label);
 
   /// Reports an early exit through HxCTraceFallThrough::throwError() while the
-  /// fall-through switch is on; the tracer's own switch must be on as well.
-  /// \return false, so that a caller can return the result.
+  /// fall-through switch is on. The switch of the tracer must be on as well.
+  /// \return false, so that a caller can return the result
   bool traceFallThrough();
   bool traceFallThrough(const KyCXString& file, int line);
   bool traceFallThrough(const KyCXString& file, int line,

@@ -14,7 +14,7 @@
 
 class KyCXString;
 
-/// Holds no data.
+/// Class without data.
 class HX_UTILS_API HxCTimeStamp : public HX_Allocated {
  public:
   HxCTimeStamp() = default;
@@ -25,8 +25,9 @@ class HX_UTILS_API HxCTimeStamp : public HX_Allocated {
   /// Milliseconds of the process clock.
   double getTimeStamp() const;
 
-  /// Emits message 2 (note): \p label in a column of 30, and the seconds from
-  /// \p start (milliseconds, as of getTimeStamp()) to now.
+  /// Emits message 2 (note): \p label in a column of 30 characters, and the
+  /// seconds from \p start to now.
+  /// \param start  milliseconds of the process clock, as of getTimeStamp()
   /// \return true
   bool emitElapsedTime(double start, KyCXString& label);
 };

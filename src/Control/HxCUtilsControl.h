@@ -2,7 +2,7 @@
 //
 //   HxCUtilsControl control;
 //   control.boot();
-//   HxCNames::boot();            // each server that the host uses
+//   HxCNames::boot();            // and the other servers of the host
 //   ...
 //   HxCNames::shutdown();
 //   control.shutdown();
@@ -13,7 +13,8 @@
 #include "Control/HxCControl.h"
 #include "HX_Export.h"
 
-/// Created by the host. Boots no server: each has its own boot and shutdown.
+/// The host creates one object. Boots no server: a host boots and shuts down
+/// every server through the operations of the server.
 class HX_UTILS_API HxCUtilsControl : public HxCControl {
  public:
   HxCUtilsControl() = default;
@@ -21,9 +22,10 @@ class HX_UTILS_API HxCUtilsControl : public HxCControl {
   HxCUtilsControl& operator=(const HxCUtilsControl&) = default;
   ~HxCUtilsControl() override;
 
-  /// Touches the string library once. \return true
+  /// Calls the string class once, so that a string library that cannot be
+  /// loaded fails here. \return true
   bool boot();
-  /// \return true
+  /// Does nothing. \return true
   bool shutdown();
 };
 

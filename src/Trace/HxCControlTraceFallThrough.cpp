@@ -1,5 +1,5 @@
-// The members of HxCControl that need the tracer; they stand here because the
-// control switches lie below the trace and do not know it.
+// The members of HxCControl that call the tracer. Here, because the folder
+// Control lies below Trace and does not include Trace.
 
 #include "Control/HxCControl.h"
 #include "Trace/HxCTraceFallThrough.h"

@@ -11,7 +11,7 @@ constexpr char kText[] = "trace fall through - early abortion";
 
 using Emitter = void (*)(const HxCSrcRef*, const char*);
 
-// place: what the caller knows of file, line and reason, in this order.
+// place: nothing, (file, line) or (file, line, reason).
 template <class... Place>
 bool report(Emitter emit, const Place&... place) {
   if (!HxCTraceFallThrough::verbose()) return false;

@@ -1,12 +1,12 @@
-// Tells a developer where an operation left early because something unexpected
-// happened (it "fell through").
+// Fall-through trace: tells a developer where an operation left early because
+// something unexpected happened (the operation "fell through").
 //
 //   if (type == nullptr) {
 //     return HxCTraceFallThrough().throwError(__FILE__, __LINE__, "no type");
 //   }
 //
-// Despite their names the operations raise no C++ exception: they report an
-// internal message and return.
+// The names say "throw", but no operation raises a C++ exception: each reports
+// an internal message and returns false.
 
 #ifndef TRACE_HXCTRACEFALLTHROUGH_H
 #define TRACE_HXCTRACEFALLTHROUGH_H
@@ -16,16 +16,17 @@
 
 class KyCXString;
 
-/// Holds no data; instances are made on the spot.
+/// Class without data; callers make objects on the spot.
 ///
-/// Each level has its message, which always reads "trace fall through - early
-/// abortion."; the place is in the internal source reference attached to it:
-/// file "file unknown!", line -1 and cause "cause unknown!" where the call does
-/// not give them. After its message a report raises a failed debug check "0".
+/// Every level has a message of its own with one text: "trace fall through -
+/// early abortion." The place stands in the internal source reference attached
+/// to the message: file "file unknown!", line -1 and cause "cause unknown!" if
+/// the call does not give them. After the message a failed debug check "0"
+/// follows.
 ///
-/// While verbose() is false, notes, warnings and errors report nothing and
-/// take no source reference number; a deadly fall-through fails an internal
-/// assertion instead (message 7, fatal error), so that it is never silent.
+/// While verbose() is false, notes, warnings and errors report nothing and draw
+/// no source reference number. A deadly fall-through is never silent: while
+/// verbose() is false, an internal assertion fails (message 7, fatal error).
 class HX_UTILS_API HxCTraceFallThrough : public HX_Allocated {
  public:
   HxCTraceFallThrough() = default;

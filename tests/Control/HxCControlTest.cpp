@@ -1,12 +1,18 @@
 #include "Control/HxCControl.h"
 
 #include <cmath>
+#include <csignal>
+#include <limits>
+#include <new>
+#include <optional>
 #include <string>
 #include <tuple>
 #include <type_traits>
 #include <utility>
+#include <vector>
 
 #include "Control/ERR_Messages.h"
+#include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
 #include "Control/HxCUtilsControl.h"
 #include "SourceRef/HxCSrcRef.h"
@@ -15,11 +21,13 @@
 #include "SystemServices/HX_SystemCall.h"
 #include "Trace/HxCTraceFallThrough.h"
 #include "platform/messages/HX_MessageHandler.h"
+#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
 
 using testing::ElementsAre;
+using testing::EndsWith;
 using testing::StartsWith;
 
 class ControlTest : public HX_TestFixture {
@@ -169,13 +177,96 @@ TEST_F(ControlTest, AssertionReportsCodeAndLineAndGoesOn) {
   EXPECT_TRUE(HX_Assert(true, "a_"));
   EXPECT_FALSE(HX_DebugCheck(false, "quiet"));
   EXPECT_FALSE(HX_Assert(false, "code_", "f.cpp", 12));
-  const auto& reports = recordDebugReports();
-  HX_DebugCheck(false, "success");
+  recordDebugReports();
+  std::vector<std::string> reports;
+  HX_MessageHandler::instance().setDebugReport([&](const char* file, int line,
+                                                   const char* expression) {
+    reports.push_back(file + (":" + std::to_string(line)) + " " + expression);
+    return 0;
+  });
   HX_Assert(false, "code_", "f.cpp", 13);
-  EXPECT_THAT(reports, ElementsAre("success", "0"));
-  const std::string start = "7/3 Internal error. Error code: code_";
-  EXPECT_THAT(messages(), ElementsAre(StartsWith(start + "12."),
-                                      StartsWith(start + "13.")));
+  HX_DebugCheck(false, "success", "g.cpp", 14);
+  EXPECT_THAT(reports, ElementsAre("f.cpp:13 0", "g.cpp:14 success"));
+  reports.clear();
+  // Without a place: the place of the caller.
+  const int line = __LINE__ + 1;
+  HX_Assert(false, "here_");
+  HX_DebugCheck(false, "here");
+  const std::string place = __FILE__ ":";
+  EXPECT_THAT(reports, ElementsAre(place + std::to_string(line) + " 0",
+                                   place + std::to_string(line + 1) + " here"));
+  const std::string start = "7/3 Internal error. Error code: ";
+  EXPECT_THAT(messages(), ElementsAre(StartsWith(start + "code_12."),
+                                      StartsWith(start + "code_13."),
+                                      StartsWith(start + "here_" +
+                                                 std::to_string(line) + ".")));
+}
+
+volatile std::sig_atomic_t s_Breaks = 0;
+
+TEST_F(ControlTest, ADebugReportBreaksOnTheAnswer1Alone) {
+  const auto before =
+      std::signal(SIGTRAP, [](int) { s_Breaks = s_Breaks + 1; });
+  recordDebugReports();
+  for (const auto& [answer, breaks] : {std::pair(0, 0), {1, 2}, {2, 2}}) {
+    HX_MessageHandler::instance().setDebugReport(
+        [answer = answer](const char*, int, const char*) { return answer; });
+    HX_DebugCheck(false, "x");
+    HX_Assert(false, "x_");
+    EXPECT_EQ(s_Breaks, breaks) << answer;
+  }
+  std::signal(SIGTRAP, before);
+}
+
+TEST_F(ControlTest, WithoutMemoryTimersStayAndNothingIsThrown) {
+  HxCControl::setProfiling(1.0);
+  HxCControl control, assigned;
+  std::optional<HxCControl> copy;
+  m_Clock.milliseconds = 1000;
+  assigned.startTimer();
+  m_Clock.milliseconds = 2000;
+  control.startTimer();
+  {
+    const HX_FailingHeap heap(0, true);
+    for (int i = 0; i < 9; ++i) control.startTimer();
+    assigned = control;
+    copy.emplace(control);
+  }
+  m_Clock.milliseconds = 4000;
+  for (HxCControl* each : {&control, &assigned, &*copy}) stop(*each, "");
+  EXPECT_THAT(messages(), ElementsAre(EndsWith(" in   2.000 seconds."),
+                                      EndsWith(" in   3.000 seconds."),
+                                      EndsWith(" in   4.001 seconds.")));
+}
+
+// A container as the library uses them.
+bool appendWithinMemory(std::vector<int, HX_ControllerAllocator<int>>& values,
+                        int value) {
+  return HX_WithinMemory([&] { values.push_back(value); });
+}
+
+TEST_F(ControlTest, ContainersOfTheControllerFailWithoutAnException) {
+  HX_CountingController memory;
+  {
+    std::vector<int, HX_ControllerAllocator<int>> values;
+    EXPECT_TRUE(appendWithinMemory(values, 1));
+    EXPECT_EQ(memory.liveBlocks(), 1);
+    memory.fail();
+    EXPECT_FALSE(appendWithinMemory(values, 2));
+    EXPECT_THAT(values, ElementsAre(1));
+    const auto tooMany = [&] {
+      values.reserve(std::numeric_limits<std::size_t>::max());
+      return 1;
+    };
+    EXPECT_EQ(HX_WithinMemory(-1, tooMany), -1) << "std::length_error";
+    EXPECT_THROW(HX_ControllerAllocator<int>().allocate(
+                     std::numeric_limits<std::size_t>::max() / 2),
+                 std::bad_alloc)
+        << "the size overflows";
+  }
+  EXPECT_EQ(memory.liveBlocks(), 0);
+  EXPECT_EQ(HX_WithinMemory(-1, [] { return 1; }), 1);
+  EXPECT_THROW(HX_WithinMemory([] { throw 7; }), int) << "of the host";
 }
 
 TEST_F(ControlTest, NewGoesToTheInstalledController) {
@@ -190,9 +281,20 @@ TEST_F(ControlTest, NewGoesToTheInstalledController) {
   delete new HxCSrcRefCompare{};
   delete new HxCTraceFallThrough{};
   EXPECT_EQ(controller.allocated(), 5) << "classes without data as well";
+  delete[] new HxCSrcRef[3];
+  delete new (std::nothrow) HxCSrcRef;
+  delete[] new (std::nothrow) HxCSrcRef[3];
+  EXPECT_EQ(controller.allocated(), 8) << "every form of new";
   EXPECT_EQ(controller.liveBlocks(), 0);
   controller.fail();
   EXPECT_EQ(new HxCSrcRef, nullptr);
+  EXPECT_EQ(new HxCSrcRef[3], nullptr);
+  EXPECT_EQ(new (std::nothrow) HxCSrcRef, nullptr);
+  EXPECT_EQ(new (std::nothrow) HxCSrcRef[3], nullptr);
+  alignas(HxCSrcRef) unsigned char place[sizeof(HxCSrcRef)];
+  auto* const placed = new (place) HxCSrcRef;
+  EXPECT_EQ(static_cast<void*>(placed), place);
+  placed->~HxCSrcRef();
 }
 
 }  // namespace
