@@ -15,9 +15,11 @@
 #include "platform/strings/KyCXString.h"
 
 /// Holds no data. No operation reports a message. Letter case is that of ASCII.
+/// A result may be the same object as an argument. Without memory results keep
+/// their texts and a returned text is empty.
 class HX_UTILS_API HX_StringParser : public HX_Allocated {
  public:
-  /// At which ends to remove.
+  /// Ends of a text to remove characters from.
   enum remove_etp : int {
     eRemoveLeading = 0,
     eRemoveTrailing = 1,
@@ -28,36 +30,35 @@ class HX_UTILS_API HX_StringParser : public HX_Allocated {
 
   /// Reads pairs such as "Name = Foo ; SIZE=3" for a list of known \p keys.
   ///
-  /// An item without \p keyValueSep, and one whose key is not known, is not
-  /// recognised. Keys match without regard to case and to blanks around them;
-  /// values lose the blanks around them and keep their case. Of equal keys in
-  /// \p keys the last one receives the value; of equal keys in \p str the last
-  /// value counts. An empty separator counts as one that does not occur.
+  /// Keys match without regard to case and to blanks around; values lose the
+  /// blanks around and keep their case. Of equal keys in \p keys the last key
+  /// receives the value; of equal keys in \p str the last value counts. An
+  /// item without \p keyValueSep or with an unknown key is not recognised. An
+  /// empty separator counts as a separator that does not occur.
   /// \param[out] values  one slot per key; the slot of a key that does not
-  ///   occur keeps what it held, and is empty if it is new. No other argument
-  ///   may be one of its texts.
-  /// \return the last item (or, of a pair, its key) that was not recognised, in
-  ///   lower case and without surrounding white space (a key: blanks); empty
-  ///   if there was none or if it was a pair without a key. An item that is all
-  ///   white space does not count.
+  ///   occur keeps its text, a new slot is empty
+  /// RETURNS: the last item, or the key of the last pair, that was not
+  ///   recognised, in lower case and without white space around (a key: without
+  ///   blanks around). Empty if every item was recognised and for a pair
+  ///   without a key. An item of white space alone does not count.
   KyCXString parseKeyValuePairs(const KyCXString& str,
                                 const KyCXString& keyValueSep,
                                 const KyCXString& pairSep,
                                 const leda::array<KyCXString>& keys,
                                 leda::array<KyCXString>& values) const;
 
-  /// \p str without the characters of \p chars at the chosen ends; a \p mode
-  /// that is not in the enumeration removes nothing.
+  /// RETURNS: \p str without the characters of \p chars at the chosen ends;
+  ///   unchanged for a \p mode outside the enumeration.
   KyCXString removeChars(const KyCXString& str, const KyCXString& chars,
                          remove_etp mode) const;
 
   /// Separates the sections between the keywords from the rest.
   ///
-  /// "x[[abc]]y" gives "abc" and "xy". Several sections are joined without
-  /// anything between them, and so is the rest; the keywords appear in neither.
-  /// The search ignores case. Without an end keyword the section reaches to the
-  /// end of the text. An empty keyword counts as one that does not occur.
-  /// \param[out] embedded, outside  may be \p str itself
+  /// "x[[abc]]y" gives "abc" and "xy". Sections are joined without anything
+  /// between, and so are the pieces of the rest; the keywords appear in neither
+  /// text. The search ignores case. Without an end keyword a section reaches to
+  /// the end of the text. An empty keyword counts as a keyword that does not
+  /// occur.
   void divideKeywordEmbeddedString(const KyCXString& str,
                                    const KyCXString& startKeyword,
                                    const KyCXString& endKeyword,
@@ -67,10 +68,9 @@ class HX_UTILS_API HX_StringParser : public HX_Allocated {
   /// Describes an object that a user script put into the data dictionary.
   ///
   /// ".../CGTmpData/hxscript_Controller/3/Gain_Var" gives "User script object
-  /// Gain_Var of block Controller"; the middle part may be missing, and what
-  /// follows it may hold slashes. Any other path is copied as it is, also one
+  /// Gain_Var of block Controller"; the middle part may be missing, and the
+  /// object may hold slashes. Any other path is copied unchanged, also a path
   /// without a slash after the block; case matters.
-  /// \param[out] text  may be \p path itself
   void processDDPath(const KyCXString& path, KyCXString& text) const;
 };
 

@@ -2,6 +2,7 @@
 
 #include <cstdarg>
 #include <cstddef>
+#include <cstdint>
 #include <cstdio>
 #include <cstring>
 #include <limits>
@@ -22,6 +23,30 @@ void release(char* s) {
   if (s != nullptr) pHXMemory->freeMemBlock(s);
 }
 
+int digitCount(std::int64_t number) {
+  int count = 1;
+  while (number /= 10) ++count;
+  return count;
+}
+
+// RETURNS: the size of the block of STR_DoubleToString(). A value with a 32-bit
+// integer part has its digits, the decimals, point, zero and a spare byte,
+// which holds the digit of 9.9 rounded up to 10. Any other value is measured; 0
+// for more than INT_MAX characters.
+std::size_t blockSize(double value, int precision, int decimals) {
+  constexpr int kLongest = std::numeric_limits<int>::max() - 20;
+  if (value > -2147483649.0 && value < 2147483648.0 && precision >= 0 &&
+      precision < kLongest) {
+    const int sign = value < 0.0 ? 1 : 0;
+    const int digits = digitCount(static_cast<std::int64_t>(value));
+    return static_cast<std::size_t>(digits + precision + 3 + sign);
+  }
+  const int length = std::snprintf(nullptr, 0, "%.*f", decimals, value);
+  // Of more than INT_MAX characters the C library says -1, but 0 for a
+  // precision of INT_MAX itself.
+  return length <= 0 ? 0 : static_cast<std::size_t>(length) + 1;
+}
+
 char* duplicate(const char* bytes, std::size_t length) {
   char* copy = allocate(length + 1);
   if (copy == nullptr) return nullptr;
@@ -36,7 +61,7 @@ char lower(char ch) {
 
 bool isWhiteSpace(char ch) { return ch == '\n' || ch == '\t' || ch == ' '; }
 
-// A null result of this loop is always a failed allocation, since no further
+// Null in the loop always means a failed allocation, because no further
 // argument is null.
 char* appendAll(char* result, std::va_list arguments) {
   for (const char* next = va_arg(arguments, const char*); next != nullptr;
@@ -83,14 +108,11 @@ char* STR_IntToString(int value) {
 }
 
 char* STR_DoubleToString(double value, int precision) {
-  const int digits = precision < 0 ? kDefaultPrecision : precision;
-  const int length = std::snprintf(nullptr, 0, "%.*f", digits, value);
-  // Of more than INT_MAX characters the C library says -1, but 0 for a
-  // precision of INT_MAX itself.
-  if (length <= 0) return nullptr;
-  char* result = allocate(static_cast<std::size_t>(length) + 1);
-  if (result == nullptr) return nullptr;
-  HX_WriteFixed(result, static_cast<std::size_t>(length) + 1, value, digits);
+  const int decimals = precision < 0 ? kDefaultPrecision : precision;
+  const std::size_t size = blockSize(value, precision, decimals);
+  if (size == 0) return nullptr;
+  char* result = allocate(size);
+  if (result != nullptr) HX_WriteFixed(result, size, value, decimals);
   return result;
 }
 

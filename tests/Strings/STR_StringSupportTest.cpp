@@ -4,6 +4,7 @@
 #include <climits>
 #include <clocale>
 #include <cstdio>
+#include <cstring>
 #include <limits>
 #include <tuple>
 #include <utility>
@@ -60,6 +61,47 @@ TEST_F(StringSupportTest, NumbersAreWrittenInFull) {
       EXPECT_EQ(taken(STR_DoubleToString(value, precision)), expected);
       std::setlocale(LC_NUMERIC, "C");
     }
+}
+
+// Asks how large the blocks are.
+struct MeasuringController : HxCMemController {
+  MeasuringController() { pHXMemory = this; }
+  ~MeasuringController() override { pHXMemory = nullptr; }
+  void* allocMemBlock(unsigned long size) override {
+    asked = size;
+    return HxCMemController::allocMemBlock(size);
+  }
+  unsigned long asked = 0;
+};
+
+TEST(StringSupportBlockTest, BlocksHoldDigitsDecimalsPointAndSpare) {
+  MeasuringController memory;
+  const struct {
+    double value;
+    int precision;
+    unsigned long size;
+  } rows[] = {
+      {0.0, 2, 6},
+      {-0.5, 1, 6},
+      {9.999, 2, 6},
+      {9.5, 0, 4},
+      {-9.99, 1, 6},
+      {10.0, 0, 5},
+      {2147483647.9, 0, 13},
+      {-2147483648.9, 0, 14},
+      // Outside the 32-bit range, and of negative precision: as measured.
+      {2147483648.0, 0, 11},
+      {-2147483649.0, 0, 12},
+      {1.5, -1, 9},
+      {std::numeric_limits<double>::quiet_NaN(), 3, 4},
+      {-std::numeric_limits<double>::infinity(), 3, 5}};
+  for (const auto& row : rows) {
+    SCOPED_TRACE(testing::Message() << row.value << " " << row.precision);
+    char* const text = STR_DoubleToString(row.value, row.precision);
+    EXPECT_EQ(memory.asked, row.size);
+    EXPECT_LT(std::strlen(text), row.size);
+    memory.freeMemBlock(text);
+  }
 }
 
 TEST_F(StringSupportTest, EqualityKnowsNullAndAsciiCase) {
