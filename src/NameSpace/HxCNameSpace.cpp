@@ -8,10 +8,11 @@ namespace {
 
 constexpr char kErrorCode[] = "HxCNameSpace";
 
-bool symbolOf(const HxCSmbScopeData* data, HxCSymbol*& symbol) {
+bool symbolOf(const HxCSmbScopeData* data, HxCSymbol*& symbol,
+              const char* expression) {
   if (data == nullptr) return false;
   symbol = data->getSymbol();
-  HX_DebugCheck(symbol != nullptr, "symbol != 0");
+  HX_DebugCheck(symbol != nullptr, expression);
   return true;
 }
 
@@ -75,7 +76,7 @@ bool HxCNameSpace::stringInScope(const KyCXString& s) {
 bool HxCNameSpace::stringInScope(const KyCXString& s, HxCSymbol*& symbol) {
   int key = 0;
   if (!keyOf(s, key) || !hasScope()) return false;
-  return symbolOf(m_pScope->lookupInScope(key), symbol);
+  return symbolOf(m_pScope->lookupInScope(key), symbol, "prSymbol != 0");
 }
 
 bool HxCNameSpace::keyInEnv(int key) {
@@ -102,7 +103,7 @@ bool HxCNameSpace::stringInEnv(const KyCXString& s, HxCSmbScopeData*& data) {
 bool HxCNameSpace::keyInEnv(int key, HxCSymbol*& symbol) {
   HxCSmbScopeData* data = nullptr;
   keyInEnv(key, data);
-  return symbolOf(data, symbol);
+  return symbolOf(data, symbol, "rpSymbol");
 }
 
 bool HxCNameSpace::stringInEnv(const KyCXString& s, HxCSymbol*& symbol) {

@@ -78,7 +78,10 @@ TEST_F(NameSpaceTest, NamesWithoutSymbolCountOnlyForPlainQueries) {
   data->setSymbol(nullptr);
   EXPECT_TRUE(names.stringInEnv("y", found));
   EXPECT_EQ(found, nullptr);
-  EXPECT_THAT(reports, ElementsAre("symbol != 0"));
+  found = symbol(0);
+  EXPECT_TRUE(names.stringInScope("y", found));
+  EXPECT_EQ(found, nullptr);
+  EXPECT_THAT(reports, ElementsAre("rpSymbol", "prSymbol != 0"));
   EXPECT_TRUE(names.remove("y") && !names.stringInEnv("y") &&
               !names.remove("y"));
   delete root;
