@@ -69,6 +69,7 @@ void HX_CheckEnvironment(HX_Bytes& bytes);
 void HX_CheckMessages(HX_Bytes& bytes);
 void HX_CheckNames(HX_Bytes& bytes);
 void HX_CheckParser(HX_Bytes& bytes);
+void HX_CheckSorter(HX_Bytes& bytes);
 void HX_CheckString(HX_Bytes& bytes);
 
 #endif  // FUZZ_HX_FUZZ_H

@@ -29,6 +29,7 @@ const CheckRow kChecks[] = {
     {"messages", HX_CheckMessages},
     {"names", HX_CheckNames},
     {"parser", HX_CheckParser},
+    {"sorter", HX_CheckSorter},
     {"string", HX_CheckString},
 };
 

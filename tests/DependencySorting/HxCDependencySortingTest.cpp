@@ -3,16 +3,19 @@
 #include <pthread.h>
 
 #include <algorithm>
+#include <cstdlib>
 #include <deque>
 #include <map>
 #include <random>
 #include <utility>
 
+#include "Control/HX_Memory.h"
 #include "DependencySorting/HxCDepSortComp.h"
 #include "DependencySorting/HxCDepSortNode.h"
 #include "Trace/HxCTraceFallThrough.h"
 #include "platform/containers/dictionary.h"
 #include "platform/strings/KyCXString.h"
+#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
 
 // A variable or a data type with three sorting keys.
@@ -359,14 +362,118 @@ TEST_F(DependencySortingTest, ContainersSortByTheCurrentCriterion) {
   }
 }
 
+// Answers from a list, then always the last answer; accepts known nodes only.
+struct ListedAnswers : HxCDepSortComp {
+  int compare(Node a, Node b) override {
+    for (Node node : {a, b})
+      if (std::ranges::find(known, node) == known.end()) {
+        ADD_FAILURE() << "compares what is no node";
+        return 0;
+      }
+    return answers[std::min(calls++, answers.size() - 1)];
+  }
+  std::vector<Node> known = {};
+  std::vector<int> answers = {};
+  std::size_t calls = 0;
+};
+
+TEST_F(DependencySortingTest, AnyAnswersOfACriterionGiveSomeOrder) {
+  std::deque<HxCSsNode> nodes;
+  ListedAnswers comp;
+  const auto sortsSomehow = [&](unsigned count) {
+    while (nodes.size() < count) nodes.emplace_back("n");
+    comp.known.clear();
+    comp.calls = 0;
+    m_Sorting.setSortingCriteriaAndInit({&comp, &comp});
+    m_Sorting.reinit();
+    for (unsigned i = 0; i < count; ++i) {
+      comp.known.push_back(&nodes[i]);
+      m_Sorting.add(&nodes[i]);
+    }
+    const bool sorted = m_Sorting.sort();
+    return sorted &&
+           std::ranges::is_permutation(m_Sorting.getNodes(), comp.known);
+  };
+  // Each list of seven answers of three nodes.
+  for (int list = 0; list < 3 * 3 * 3 * 3 * 3 * 3 * 3; ++list) {
+    comp.answers.clear();
+    for (int rest = list, i = 0; i < 7; ++i, rest /= 3)
+      comp.answers.push_back(rest % 3 - 1);
+    ASSERT_TRUE(sortsSomehow(3)) << list;
+  }
+  std::mt19937 random(HX_Seed());
+  for (unsigned count = 4; count < 100; ++count) {
+    comp.answers.resize(1 + random() % (20 * count));
+    for (int& answer : comp.answers)
+      answer = static_cast<int>(random() % 3) - 1;
+    ASSERT_TRUE(sortsSomehow(count)) << count;
+  }
+}
+
+// Nodes of all kinds: a star with equal names, groups of equals, few criteria.
+// No assertions of GoogleTest, because assertions ask for memory.
+bool sortsMixedNodes() {
+  constexpr int kCount = 60;
+  static std::vector<HxCSsNode> s_Nodes = [] {
+    std::vector<HxCSsNode> nodes;
+    for (int i = 0; i < kCount; ++i)
+      nodes.emplace_back(std::to_string(i % 5), false, i * 7 % 3, i % 2);
+    return nodes;
+  }();
+  static std::vector<Node> s_Expected;
+  KeyComp first(0), second(1);
+  HxCDependencySorting sorter;
+  const bool hasCriteria = HX_WithinMemory([&] {
+    sorter.setSortingCriteriaAndInit({&first, &second});
+  });
+  if (!hasCriteria) return false;
+  for (HxCSsNode& node : s_Nodes) sorter.add(&node);
+  for (int i = 1; i < kCount / 2; ++i)
+    sorter.addDependency(&s_Nodes[0], &s_Nodes[static_cast<std::size_t>(i)]);
+  // A sort without memory may be repeated.
+  const bool done = sorter.sort();
+  if (!done && !sorter.sort()) return false;
+  return HX_WithinMemory(false, [&] {
+    const leda::array<Node> result = sorter.getNodes();
+    if (result.size() == 0) return false;
+    if (s_Expected.empty() && done)
+      s_Expected.assign(result.begin(), result.end());
+    if (!s_Expected.empty() && !std::ranges::equal(result, s_Expected))
+      std::abort();
+    return done;
+  });
+}
+
+TEST_F(DependencySortingTest, BlocksComeFromTheController) {
+  HX_CountingController memory;
+  HxCDependencySorting sorting;
+  std::vector<HxCSsNode> nodes(40, HxCSsNode("n"));
+  for (const bool isFirst : {true, false}) {
+    sorting.reinit();
+    for (HxCSsNode& node : nodes) sorting.add(&node);
+    for (int i = 1; i < 20; ++i)
+      sorting.addDependency(&nodes[0], &nodes[static_cast<std::size_t>(i)]);
+    const int before = HX_HeapBlocks();
+    EXPECT_TRUE(sorting.sort());
+    EXPECT_EQ(HX_HeapBlocks() - before, isFirst ? 1 : 0) << "the result array";
+  }
+  EXPECT_GT(memory.liveBlocks(), 0);
+}
+
 TEST_F(DependencySortingTest, WithoutMemoryTheSortFails) {
-  HX_WithoutEachBlock("sort", [] {
+  ASSERT_TRUE(sortsMixedNodes());
+  HX_WithoutEachBlock("sort", sortsMixedNodes);
+  HX_WithoutEachHeapBlock("sort", sortsMixedNodes);
+  HX_WithoutEachBlock("report a cycle", [] {
     HxCSsNode first("a"), second("b");
     HxCDependencySorting sorter;
     sorter.reinit();
     for (HxCDepSortNode* node : {&first, &second}) sorter.add(node);
     sorter.addDependency(&second, &first);
-    return sorter.sort() && sorter.getNodes()[0] == &second;
+    const bool sorted = sorter.sort() && sorter.getNodes()[0] == &second;
+    sorter.addDependency(&first, &second);
+    sorter.sort();
+    return sorted;
   });
 }
 
