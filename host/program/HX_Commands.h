@@ -5,6 +5,7 @@
 
 #include <cstdint>
 #include <string>
+#include <vector>
 
 enum HX_ExitCode { kHxDone = 0, kHxErrorsFound = 1, kHxRefused = 2 };
 
@@ -15,6 +16,10 @@ struct HX_Arguments {
   std::string keywords;
   std::string out;
   std::string profile;
+  std::vector<std::string> dictionaries;
+  std::vector<std::string> searchPath;
+  std::string rules;
+  bool schema = false;
   bool json = false;
   bool quiet = false;
   int blocks = 1000;

@@ -4,6 +4,7 @@
 
 #include "host/base/HX_System.h"
 #include "host/program/HX_Commands.h"
+#include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_Version.h"
 
 namespace {
@@ -13,6 +14,7 @@ constexpr char kFooter[] =
     "  hx_codegen names model.json\n"
     "  hx_codegen explain model.json --name set_speed\n"
     "  hx_codegen generate model.json --out code --profile profile\n"
+    "  hx_codegen import model.slx > model.json\n"
     "  hx_codegen synthesize --blocks 10000 --seed 7 > large.json\n"
     "\n"
     "Exit codes:\n"
@@ -30,6 +32,7 @@ struct CommandLine {
   CLI::App* add(const char* name, const char* description, Command chosen);
   CLI::App* addOverModel(const char* name, const char* description,
                          Command chosen);
+  void addImportOptions(CLI::App& added);
 
   CLI::App app{"Forms the names of a model and writes its C code.",
                "hx_codegen"};
@@ -57,6 +60,18 @@ CLI::App* CommandLine::addOverModel(const char* name, const char* description,
   return added;
 }
 
+void CommandLine::addImportOptions(CLI::App& added) {
+  added.add_option("--rules", arguments.rules, "file of naming rules");
+  added.add_option("--dictionary", arguments.dictionaries,
+                   "data dictionary (.sldd); may be repeated");
+  added.add_option("--path", arguments.searchPath,
+                   "folder of referenced models and libraries; may be "
+                   "repeated");
+  added.add_option("--keywords", arguments.keywords,
+                   "folder of the word lists that the rules name");
+  added.add_flag("--quiet", arguments.quiet, "no notes");
+}
+
 CommandLine::CommandLine() {
   app.footer(kFooter);
   app.require_subcommand(1);
@@ -74,6 +89,14 @@ CommandLine::CommandLine() {
   generate->add_option("--out", arguments.out, "folder for the files")
       ->required();
   generate->add_flag("--json", arguments.json, "print the name map as well");
+
+  CLI::App* import = add("import", "print a model file as a model document",
+                         HX_ImportModelFile);
+  import->add_option("MODEL.slx", arguments.model, "the model file")
+      ->required();
+  addImportOptions(*import);
+  add("rules", "print the built-in naming rules", HX_PrintRules)
+      ->add_flag("--schema", arguments.schema, "print the schema of rules");
 
   CLI::App* synthesis =
       add("synthesize", "print a document of any size, for trying scale",

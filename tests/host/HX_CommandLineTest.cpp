@@ -38,7 +38,7 @@ TEST_F(CommandLineTest, ManualPageHasTheOptionsOfTheHelp) {
       std::regex_replace(read(HX_MANUAL_PAGE), std::regex(R"(\\-)"), "-");
   std::string help = codegen("--help").out;
   for (const std::string command :
-       {"names", "explain", "generate", "synthesize"}) {
+       {"names", "explain", "generate", "import", "rules", "synthesize"}) {
     EXPECT_THAT(help, HasSubstr("\n  " + command + " "));
     EXPECT_THAT(page, HasSubstr("\n.SS " + command + "\n"));
     help += codegen(command + " --help").out;
