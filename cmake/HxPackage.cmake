@@ -26,6 +26,9 @@ set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS
 set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS ON)
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA
     ${PROJECT_SOURCE_DIR}/cmake/debian/triggers)
+execute_process(COMMAND date --utc --rfc-email --date=${hx_utils_RELEASE_DATE}
+                OUTPUT_VARIABLE debianReleaseDate OUTPUT_STRIP_TRAILING_WHITESPACE
+                COMMAND_ERROR_IS_FATAL ANY)
 configure_file(cmake/debian/changelog.in changelog @ONLY)
 execute_process(COMMAND gzip -9nkf ${PROJECT_BINARY_DIR}/changelog
                 COMMAND_ERROR_IS_FATAL ANY)

@@ -11,16 +11,13 @@
 
 namespace {
 
-constexpr char kProductVersion[] = "1.0";
-constexpr char kReleaseDate[] = "2026-11-22";
-
 // The program answers the question that a generator asks MATLAB.
 int describeProduct(int outputs, mxArray** output, int, mxArray**) {
   if (outputs < 1) return 1;
   const char* fields[] = {"Version", "ReleaseDate"};
   output[0] = mxCreateStructMatrix(1, 1, {fields[0], fields[1]});
-  mxSetField(output[0], 0, fields[0], mxCreateString(kProductVersion));
-  mxSetField(output[0], 0, fields[1], mxCreateString(kReleaseDate));
+  mxSetField(output[0], 0, fields[0], mxCreateString(HX_PRODUCT_VERSION));
+  mxSetField(output[0], 0, fields[1], mxCreateString(HX_RELEASE_DATE));
   return 0;
 }
 
@@ -29,7 +26,9 @@ void loadVersionResource() {
   constexpr std::uint16_t kEnglish = 0x0409;
   constexpr std::uint16_t kUnicode = 0x04B0;
   HX_VersionResource resource;
-  resource.setVersions({1, 0, 0, 0}, {1, 0, 0, 0});
+  const HX_VersionResource::Version version = {
+      HX_VERSION_MAJOR, HX_VERSION_MINOR, HX_VERSION_PATCH, 0};
+  resource.setVersions(version, version);
   resource.addTranslation(kEnglish, kUnicode);
   resource.setText(kEnglish, kUnicode, "ProductName", "hx_codegen");
   HX_LoadModule("hx_codegen", "hx_codegen", resource.block());
@@ -39,8 +38,9 @@ void loadVersionResource() {
 
 HX_BuildNumber HX_BuildOfProgram() {
   HX_BuildNumber build;
-  build.definedBuildNumber(1, 0, 0, 0, "release", false, true, 0,
-                           kProductVersion, kReleaseDate, __DATE__, __TIME__);
+  build.definedBuildNumber(HX_VERSION_MAJOR, HX_VERSION_MINOR, HX_VERSION_PATCH,
+                           0, "release", false, true, 0, HX_PRODUCT_VERSION,
+                           HX_RELEASE_DATE, HX_BUILD_DATE, HX_BUILD_TIME);
   return build;
 }
 
