@@ -1,4 +1,4 @@
-# Settings shared by every target of this project; none of them is global.
+# Settings of every target of this project. No setting is global.
 
 # Language, visibility, warnings and exact floating point for one target.
 function(hx_target_defaults target)
@@ -12,12 +12,16 @@ function(hx_target_defaults target)
     file(RELATIVE_PATH src_from_build ${CMAKE_BINARY_DIR} ${PROJECT_SOURCE_DIR}/src)
     target_compile_options(${target} PRIVATE
       -Wall -Wextra -Wpedantic -Wconversion -Wshadow
-      # Error codes show the path below src/, the same on every machine; a
-      # compiler cache may have made the path relative to the build folder.
+      # Objects hold no path of this machine: two builds in two folders are
+      # byte-equal. Debug builds keep the paths for the debugger.
+      "$<$<NOT:$<CONFIG:Debug>>:-ffile-prefix-map=${PROJECT_SOURCE_DIR}/=>"
+      "$<$<NOT:$<CONFIG:Debug>>:-ffile-prefix-map=${CMAKE_BINARY_DIR}=.>"
+      # Error codes show the path below src/. Two forms, because a compiler cache
+      # may make the path relative to the build folder.
       -fmacro-prefix-map=${PROJECT_SOURCE_DIR}/src/=
       -fmacro-prefix-map=${src_from_build}/=
-      # What g++ 12 warns of, wrongly, once it has inlined enough: moved variants
-      # and joined std::strings. The sanitizers find the true cases.
+      # g++ 12 warns wrongly of moved variants and joined std::strings after much
+      # inlining. The sanitizers find the true cases.
       $<$<CXX_COMPILER_ID:GNU>:-Wno-array-bounds>
       $<$<CXX_COMPILER_ID:GNU>:-Wno-maybe-uninitialized>
       $<$<CXX_COMPILER_ID:GNU>:-Wno-restrict>
