@@ -23,78 +23,91 @@ constexpr auto kCaller = HX_Macro::eStageCaller;
 constexpr auto kMultirate = HX_Macro::eStageMultirate;
 constexpr auto kTemplate = HX_Macro::eStageTemplate;
 constexpr auto kSymbol = HX_Macro::eStageSymbol;
+constexpr auto kNone = HX_Macro::eOriginNone;
+constexpr auto kModel = HX_Macro::eOriginModel;
+constexpr auto kSource = HX_Macro::eOriginSource;
+constexpr auto kDdObject = HX_Macro::eOriginDdObject;
+constexpr auto kType = HX_Macro::eOriginType;
+constexpr auto kTask = HX_Macro::eOriginTask;
+constexpr auto kOfSymbol = HX_Macro::eOriginSymbol;
 
-// Columns: text, bit, stage, message, placeholder, meaning, example.
+// Columns: text, bit, stage, origin, message, placeholder, meaning,
+// example.
 // Each example belongs to the model of the tests: block "Speed Gain" in
 // subsystem a3, chart object "go#" with number 7 in a chart of subsystem c.
 inline constexpr HX_Macro kLetters[] = {
-    {"$L", HxCNames::eMacroLabel, kTemplate, 0, "",
+    {"$L", HxCNames::eMacroLabel, kTemplate, kSource, 0, "",
      "signal label, else block name", "speed"},
-    {"$B", HxCNames::eMacroBlockName, kTemplate, 0, "_B", "block name",
+    {"$B", HxCNames::eMacroBlockName, kTemplate, kSource, 0, "_B", "block name",
      "Speed_Gain"},
-    {"$S", HxCNames::eMacroSystemNumber, kTemplate, 0, "_S",
-     "S, subsystem id and number; the name may change", "Sa3"},
-    {"$I", HxCNames::eMacroSystemId, kTemplate, 0, "", "subsystem id", "a"},
-    {"$M", HxCNames::eMacroModelName, kTemplate, 0, "", "model name",
+    {"$S", HxCNames::eMacroSystemNumber, kTemplate, kSource, 0, "_S",
+     "S with subsystem id and number", "Sa3"},
+    {"$I", HxCNames::eMacroSystemId, kTemplate, kSource, 0, "", "subsystem id",
+     "a"},
+    {"$M", HxCNames::eMacroModelName, kTemplate, kModel, 0, "", "model name",
      "plant v2"},
-    {"$N", HxCNames::eMacroSubsystemName, kTemplate, 0, "",
+    {"$N", HxCNames::eMacroSubsystemName, kTemplate, kModel, 0, "",
      "name of the subsystem under generation", "Ctrl"},
-    {"$H", HxCNames::eMacroStateHierarchy, kTemplate, 0, "_H",
+    {"$H", HxCNames::eMacroStateHierarchy, kTemplate, kSource, 0, "_H",
      "states around the chart object", "Top_Run"},
-    {"$O", HxCNames::eMacroSFObjectName, kTemplate, 0, "_O",
+    {"$O", HxCNames::eMacroSFObjectName, kTemplate, kSource, 0, "_O",
      "name of the chart object", "go_"},
-    {"$C", HxCNames::eMacroSFObjectId, kTemplate, 0, "_C",
-     "C, subsystem id and number of the chart object; the name may change",
-     "Cc7"},
-    {"$D", HxCNames::eMacroDdObjectName, kTemplate, 0, "_D",
+    {"$C", HxCNames::eMacroSFObjectId, kTemplate, kSource, 0, "_C",
+     "C with subsystem id and number of the chart object", "Cc7"},
+    {"$D", HxCNames::eMacroDdObjectName, kTemplate, kDdObject, 0, "_D",
      "name of the data dictionary object", "Kp"},
-    {"$T", HxCNames::eMacroTypeName, kTemplate, 0, "_T",
+    {"$T", HxCNames::eMacroTypeName, kTemplate, kType, 0, "_T",
      "short name of the type", "i16"},
-    {"$X", HxCNames::eMacroXName, kTemplate, 0, "_X",
+    {"$X", HxCNames::eMacroXName, kTemplate, kNone, 0, "_X",
      "text given with the name", "ext"},
-    {"$R", HxCNames::eMacroChangeable, kTemplate, 0, "",
+    {"$R", HxCNames::eMacroChangeable, kTemplate, kNone, 0, "",
      "nothing; the name may change", ""},
-    {"$$", 0, kTemplate, 0, "$", "one dollar sign", "$"},
-    {"$E", 0, kCaller, 1202, "$E", "text given by the caller", "x"},
-    {"$P", 0, kCaller, 1202, "$P", "text given by the caller", "x"},
-    {"$x", 0, kSymbol, 1203, "$x", "text of the symbol", "ext"},
-    {"$f", 0, kSymbol, 1202, "$f", "name of the symbol, a function", "step"},
-    {"$F", 0, kSymbol, 1202, "$F",
+    {"$$", 0, kTemplate, kNone, 0, "$", "one dollar sign", "$"},
+    {"$E", 0, kCaller, kNone, 1202, "$E", "text given by the caller", "x"},
+    {"$P", 0, kCaller, kNone, 1202, "$P", "text given by the caller", "x"},
+    {"$x", 0, kSymbol, kOfSymbol, 1203, "$x", "text of the symbol", "ext"},
+    {"$f", 0, kSymbol, kOfSymbol, 1202, "$f", "name of the symbol, a function",
+     "step"},
+    {"$F", 0, kSymbol, kOfSymbol, 1202, "$F",
      "name of the symbol, a function, in upper case", "STEP"},
-    {"$v", 0, kSymbol, 1202, "$v", "name of the symbol, no function", "speed"},
-    {"$V", 0, kSymbol, 1202, "$V",
+    {"$v", 0, kSymbol, kOfSymbol, 1202, "$v", "name of the symbol, no function",
+     "speed"},
+    {"$V", 0, kSymbol, kOfSymbol, 1202, "$V",
      "name of the symbol, no function, in upper case", "SPEED"},
-    {"$t", 0, kSymbol, 1203, "$t", "short name of the type of the symbol",
-     "i16"}};
+    {"$t", 0, kSymbol, kOfSymbol, 1203, "$t",
+     "short name of the type of the symbol", "i16"}};
 
 inline constexpr HX_Macro kExtended[] = {
-    {"$(Task)", 0, kMultirate, 1202, "__Task_",
+    {"$(Task)", 0, kMultirate, kTask, 1202, "__Task_",
      "name of the task, else of the interrupt service routine", "fast_task"},
-    {"$(ISR)", 0, kMultirate, 1202, "__ISR_",
+    {"$(ISR)", 0, kMultirate, kTask, 1202, "__ISR_",
      "name of the interrupt service routine", "irq_1"},
-    {"$(Msg)", 0, kMultirate, 1202, "__Msg_", "name of the message", "msg"},
-    {"$(Ctr)", 0, kMultirate, 1202, "__Ctr_", "name of the counter", "ctr"},
-    {"$(Event)", 0, kMultirate, 1202, "__Event_", "name of the event", "evt"},
-    {"$(MsgVar)", 0, kMultirate, 1202, "__MsgVar_",
+    {"$(Msg)", 0, kMultirate, kNone, 1202, "__Msg_", "name of the message",
+     "msg"},
+    {"$(Ctr)", 0, kMultirate, kNone, 1202, "__Ctr_", "name of the counter",
+     "ctr"},
+    {"$(Event)", 0, kMultirate, kNone, 1202, "__Event_", "name of the event",
+     "evt"},
+    {"$(MsgVar)", 0, kMultirate, kNone, 1202, "__MsgVar_",
      "number or text of the message variable", "7"},
-    {"$(PObj)", 0, kMultirate, 1202, "__PObj_",
+    {"$(PObj)", 0, kMultirate, kNone, 1202, "__PObj_",
      "name of the operating-system object", "obj"},
-    {"$(Section)", 0, kCaller, 1202, "__Section_", "code section", "x"},
-    {"$(Module)", 0, kCaller, 1202, "__Module_", "module", "x"},
-    {"$(FunctionName)", 0, kCaller, 1202, "__FunctionName_",
+    {"$(Section)", 0, kCaller, kNone, 1202, "__Section_", "code section", "x"},
+    {"$(Module)", 0, kCaller, kNone, 1202, "__Module_", "module", "x"},
+    {"$(FunctionName)", 0, kCaller, kNone, 1202, "__FunctionName_",
      "name of the function", "x"},
-    {"$(DataVariantName)", 0, kCaller, 1202, "__DataVariantName_",
+    {"$(DataVariantName)", 0, kCaller, kNone, 1202, "__DataVariantName_",
      "name of the data variant", "x"},
-    {"$(PageNumber)", 0, kCaller, 1202, "__PageNumber_", "number of the page",
-     "x"},
-    {"$(VariantItemName)", 0, kCaller, 1202, "__VariantItemName_",
+    {"$(PageNumber)", 0, kCaller, kNone, 1202, "__PageNumber_",
+     "number of the page", "x"},
+    {"$(VariantItemName)", 0, kCaller, kNone, 1202, "__VariantItemName_",
      "name of the variant item", "x"},
-    {"$(Type)", HxCNames::eMacroLongTypeName, kTemplate, 0, "__Type_",
+    {"$(Type)", HxCNames::eMacroLongTypeName, kTemplate, kType, 0, "__Type_",
      "name of the type", "Int16"},
-    {"$(BaseType)", HxCNames::eMacroLongTypeName, kTemplate, 0, "__BaseType_",
-     "name of the base type", "Int16"},
-    {"$(Component)", 0, kTemplate, 0, "", "software component of the variable",
-     "Engine"}};
+    {"$(BaseType)", HxCNames::eMacroLongTypeName, kTemplate, kType, 0,
+     "__BaseType_", "name of the base type", "Int16"},
+    {"$(Component)", 0, kTemplate, kDdObject, 0, "",
+     "software component of the variable", "Engine"}};
 
 // --- Time macros: units x {Time, Period, Offset}, and each kind without unit.
 
@@ -167,13 +180,11 @@ inline constexpr auto kTable = [] {
     const TimeTexts& texts = kTimeTexts[i];
     const TimeKind& kind = kTimeKinds[i / (kTimeUnitCount + 1)];
     const bool inUnits = i % (kTimeUnitCount + 1) != kNoTimeUnit;
-    table[count++] = {texts.text,
-                      0,
-                      kMultirate,
-                      1202,
-                      texts.placeholder,
-                      texts.meaning,
-                      inUnits ? kind.exampleInUnits : kind.example};
+    table[count++] = {
+        texts.text,    0,
+        kMultirate,    kTask,
+        1202,          texts.placeholder,
+        texts.meaning, inUnits ? kind.exampleInUnits : kind.example};
   }
   return table;
 }();

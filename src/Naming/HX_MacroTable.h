@@ -25,11 +25,23 @@ struct HX_Macro {
     eStageSymbol = 3      ///< HxCNames::handleSymbolNameMacro()
   };
 
+  /// Object that the value comes from.
+  enum HxEOriginTag : int {
+    eOriginNone = 0,      ///< a constant, or a text given with the name
+    eOriginModel = 1,     ///< model or subsystem under generation
+    eOriginSource = 2,    ///< source reference or intermediate-view block
+    eOriginDdObject = 3,  ///< data dictionary object
+    eOriginType = 4,      ///< data type
+    eOriginTask = 5,      ///< task or interrupt service routine
+    eOriginSymbol = 6     ///< symbol of the symbol table
+  };
+
   /// The macro as written in a template: "$B", "$(Task)".
   const char* text;
   /// Bit in the macro bit sets of HxCNames; 0 for a macro without a bit.
   unsigned int bit;
   HxEStageTag stage;
+  HxEOriginTag origin;
   /// Message of createNameFromForm() about the macro: 0 for macros of the
   /// template stage, 1202 (not supported here) or 1203 (unknown).
   int message;

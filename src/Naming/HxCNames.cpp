@@ -286,45 +286,45 @@ void HxCNames::scanTemplate(Scan& scan) {
 // The letters are different: their order has no meaning.
 const HxCNames::MacroRow* HxCNames::findMacro(unsigned short letter) {
   using Self = HxCNames;
-  // Extended macros share one row.
-  static constexpr HX_Macro kExtended{"$(", 0, hx_macros::kTemplate, 0, "",
-                                      "",   ""};
   static constexpr MacroRow kRows[] = {
-      {&HX_MacroOf("$L"),
+      {HX_MacroOf("$L").text,
        &expandBy<&Self::evaluateLabelMacro, &Scan::label, &Scan::block>,
        &HxCCIdentifier::setDollarLUsed},
-      {&HX_MacroOf("$B"),
+      {HX_MacroOf("$B").text,
        &expandBy<&Self::evaluateBlockNameMacro, &Scan::block, &Scan::ivBlock>},
-      {&HX_MacroOf("$S"),
+      {HX_MacroOf("$S").text,
        &expandBy<&Self::evaluateSystemNumberMacro, &Scan::block,
                  &Scan::systemId, &Scan::changeable>},
-      {&HX_MacroOf("$I"),
+      {HX_MacroOf("$I").text,
        &expandBy<&Self::evaluateSystemIDMacro, &Scan::systemId>},
-      {&HX_MacroOf("$M"), &expandBy<&Self::evaluateModelNameMacro>},
-      {&HX_MacroOf("$N"), &expandBy<&Self::evaluateSubsystemNameMacro>,
+      {HX_MacroOf("$M").text, &expandBy<&Self::evaluateModelNameMacro>},
+      {HX_MacroOf("$N").text, &expandBy<&Self::evaluateSubsystemNameMacro>,
        &HxCCIdentifier::setDollarNUsed},
-      {&HX_MacroOf("$H"),
+      {HX_MacroOf("$H").text,
        &expandBy<&Self::evaluateStateHierarchyMacro, &Scan::sfObject>},
-      {&HX_MacroOf("$O"),
+      {HX_MacroOf("$O").text,
        &expandBy<&Self::evaluateSFObjectNameMacro, &Scan::sfObject>},
-      {&HX_MacroOf("$C"),
+      {HX_MacroOf("$C").text,
        &expandBy<&Self::evaluateSFObjectIDMacro, &Scan::sfObject,
                  &Scan::systemId, &Scan::changeable>},
-      {&HX_MacroOf("$D"), &Self::expandDollarD},
-      {&HX_MacroOf("$X"), &expandBy<&Self::evaluateXNameMacro, &Scan::xValue>},
-      {&HX_MacroOf("$T"), &expandBy<&Self::evaluateTypeNameMacro, &Scan::type>},
-      {&HX_MacroOf("$$"), &Self::expandDollar},
-      {&HX_MacroOf("$R"),
+      {HX_MacroOf("$D").text, &Self::expandDollarD},
+      {HX_MacroOf("$X").text,
+       &expandBy<&Self::evaluateXNameMacro, &Scan::xValue>},
+      {HX_MacroOf("$T").text,
+       &expandBy<&Self::evaluateTypeNameMacro, &Scan::type>},
+      {HX_MacroOf("$$").text, &Self::expandDollar},
+      {HX_MacroOf("$R").text,
        &expandBy<&Self::evaluateSFObjectRMacro, &Scan::changeable>},
-      {&kExtended, &expandBy<&Self::evaluateExtendedNameMacro, &Scan::form,
-                             &Scan::pos, &Scan::id, &Scan::type, &Scan::srcRef,
-                             &Scan::reportRef, &Scan::suppressMessages>},
+      {"$(",  // all extended macros
+       &expandBy<&Self::evaluateExtendedNameMacro, &Scan::form, &Scan::pos,
+                 &Scan::id, &Scan::type, &Scan::srcRef, &Scan::reportRef,
+                 &Scan::suppressMessages>},
   };
   static constexpr int kCodes = 128;
   static constexpr auto kRowOfLetter = [] {
     std::array<const MacroRow*, kCodes> rows{};
     for (const MacroRow& row : kRows)
-      rows[static_cast<unsigned char>(row.macro->text[1])] = &row;
+      rows[static_cast<unsigned char>(row.text[1])] = &row;
     return rows;
   }();
   static_assert(

@@ -3,7 +3,6 @@
 #ifndef NAMING_HXCNAMESSCAN_H
 #define NAMING_HXCNAMESSCAN_H
 
-#include "Naming/HX_MacroTable.h"
 #include "Naming/HxCNames.h"
 
 /// Error code of the assertions in all sources of HxCNames.
@@ -47,7 +46,7 @@ struct HxCNames::Scan {
 /// Row of the scan loop. The operation appends to the result and returns the
 /// number of template characters consumed, '$' included.
 struct HxCNames::MacroRow {
-  const HX_Macro* macro;
+  const char* text;  ///< text of the macro, or "$("
   int (*expand)(HxCNames& names, Scan& scan);
   void (HxCCIdentifier::*noteUse)(bool,
                                   HxCCIdentifier::HxENameTypeTag) = nullptr;

@@ -11,11 +11,11 @@ namespace {
 
 class MacroTableTest : public HX_NamingFixture {
  protected:
-  /// Compares a file of the project with \p text. With HX_RENEW in the
+  /// Compares a file of the project with \p text. With HX_RENEW_GOLDEN in the
   /// environment writes the file instead (script/macros).
   static void expectFile(const std::string& path, const std::string& text) {
     const std::string file = HX_ROOT_FOLDER "/" + path;
-    if (std::getenv("HX_RENEW") != nullptr) std::ofstream(file) << text;
+    if (std::getenv("HX_RENEW_GOLDEN") != nullptr) std::ofstream(file) << text;
     std::ostringstream found;
     found << std::ifstream(file).rdbuf();
     EXPECT_EQ(found.str(), text) << path << ": run script/macros";
@@ -76,10 +76,13 @@ TEST_F(MacroTableTest, PageAndDictionaryShowTheTable) {
        "before the expansion."},
       {"Macros of the expansion",
        "`HxCNames::createNameFromForm()` puts the values in. A macro with a "
-       "bit can be retained or marked provisional."},
+       "bit can be retained or marked provisional. With `$S`, `$C` or `$R` the "
+       "name may change."},
       {"Macros of the symbol",
        "`HxCNames::handleSymbolNameMacro()` puts the values in. `$X` and `$T` "
        "count as `$x` and `$t`."}};
+  const char* const origins[] = {"",     "model", "source", "dictionary object",
+                                 "type", "task",  "symbol"};
   std::string page =
       "# Macros of name templates\n\n"
       "Written by `script/macros` from the macro table "
@@ -95,13 +98,13 @@ TEST_F(MacroTableTest, PageAndDictionaryShowTheTable) {
   for (int stage = 0; stage < 4; ++stage) {
     page += std::string("\n## ") + stages[stage].first + "\n\n" +
             stages[stage].second +
-            "\n\n| macro | value | example | without a value | bit |\n"
-            "|---|---|---|---|---|\n";
+            "\n\n| macro | value | from | example | without a value | bit |\n"
+            "|---|---|---|---|---|---|\n";
     for (const HX_Macro& macro : HX_Macros()) {
       if (macro.stage != stage) continue;
       page += "| " + code(macro.text) + " | " + macro.meaning + " | " +
-              code(macro.example) + " | " + code(macro.placeholder) + " | " +
-              bitText(macro.bit) + " |\n";
+              origins[macro.origin] + " | " + code(macro.example) + " | " +
+              code(macro.placeholder) + " | " + bitText(macro.bit) + " |\n";
       dictionary += std::string("\"") + macro.text + "\"\n";
     }
   }
