@@ -4,6 +4,7 @@
 #include <optional>
 #include <string_view>
 
+#include "Naming/HX_MacroTable.h"
 #include "Naming/HxCNames.h"
 #include "host/base/HX_Text.h"
 #include "host/model/HX_ModelReaders.h"
@@ -13,23 +14,6 @@
 namespace {
 
 using Json = const HX_Json&;
-
-const std::map<std::string, unsigned int> kMacroBits = {
-    {"$L", HxCNames::eMacroLabel},
-    {"$B", HxCNames::eMacroBlockName},
-    {"$S", HxCNames::eMacroSystemNumber},
-    {"$I", HxCNames::eMacroSystemId},
-    {"$M", HxCNames::eMacroModelName},
-    {"$N", HxCNames::eMacroSubsystemName},
-    {"$H", HxCNames::eMacroStateHierarchy},
-    {"$O", HxCNames::eMacroSFObjectName},
-    {"$C", HxCNames::eMacroSFObjectId},
-    {"$D", HxCNames::eMacroDdObjectName},
-    {"$T", HxCNames::eMacroTypeName},
-    {"$X", HxCNames::eMacroXName},
-    {"$R", HxCNames::eMacroChangeable},
-    {"$(Type)", HxCNames::eMacroLongTypeName},
-};
 
 constexpr HX_Word<HxCNames::tagMacroKindEnum> kSubstitutionKinds[] = {
     {"exact", HxCNames::eMacroKindExact},
@@ -61,9 +45,11 @@ std::optional<KyCXString> optionalTextIn(const HX_Json& node,
   return HX_FromUtf8(node[field]);
 }
 
+// The schema admits macros with a bit only.
 unsigned int macroBits(const HX_Json& macros) {
   unsigned int bits = 0;
-  for (const HX_Json& macro : macros) bits |= kMacroBits.at(macro);
+  for (const HX_Json& macro : macros)
+    bits |= HX_FindMacro(HX_FromUtf8(macro))->bit;
   return bits;
 }
 

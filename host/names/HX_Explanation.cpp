@@ -1,7 +1,7 @@
 // HX_NameForming::explain(): the value of each macro of a template.
 #include <algorithm>
-#include <cstring>
 
+#include "Naming/HX_MacroTable.h"
 #include "host/base/HX_Text.h"
 #include "host/names/HX_NameForming.h"
 
@@ -26,56 +26,33 @@ std::string fromTask(const HX_WantedName& name) {
          "'";
 }
 
-std::string fromModel(const HX_WantedName&) { return "the model"; }
+// The object that gives the value of \p macro, for the rows of the macro table
+// with an object.
+std::string originOf(const HX_WantedName& name, const HX_Macro& macro) {
+  switch (macro.origin) {
+    case HX_Macro::eOriginModel:
+      return "the model";
+    case HX_Macro::eOriginSource:
+      return fromSource(name);
+    case HX_Macro::eOriginDdObject:
+      return fromDictionary(name);
+    case HX_Macro::eOriginType:
+      return fromType(name);
+    case HX_Macro::eOriginTask:
+      return fromTask(name);
+    case HX_Macro::eOriginNone:
+    case HX_Macro::eOriginSymbol:
+      break;
+  }
+  return {};
+}
 
-struct MeaningRow {
-  const char* macro;  // the beginning of the macro
-  const char* meaning;
-  std::string (*origin)(
-      const HX_WantedName& name);  // null: given with the name
-};
-
-// The first row that fits counts.
-constexpr MeaningRow kMeanings[] = {
-    {"$(Type)", "name of the type", fromType},
-    {"$(BaseType)", "name of the base type", fromType},
-    {"$(Component)", "software component of the variable", fromDictionary},
-    {"$(Task)", "name of the task", fromTask},
-    {"$(ISR)", "name of the interrupt service routine", fromTask},
-    {"$(Time", "period and offset", fromTask},
-    {"$(Period", "period", fromTask},
-    {"$(Offset", "offset", fromTask},
-    {"$(", "given with the name", nullptr},
-    {"$E", "given with the name", nullptr},
-    {"$L", "signal label, else block name", fromSource},
-    {"$B", "block name", fromSource},
-    {"$S", "subsystem id and number", fromSource},
-    {"$I", "subsystem id", fromSource},
-    {"$M", "model name", fromModel},
-    {"$N", "name of the subsystem under generation", fromModel},
-    {"$H", "states around the chart object", fromSource},
-    {"$O", "name of the chart object", fromSource},
-    {"$C", "subsystem id and number of the chart object", fromSource},
-    {"$D", "name of the dictionary object", fromDictionary},
-    {"$X", "text given with the name", nullptr},
-    {"$T", "short name of the type", fromType},
-    {"$R", "nothing; the name may be changed", nullptr},
-    {"$$", "one dollar sign", nullptr},
-    {"$x", "text of the symbol", nullptr},
-    {"$f", "name of the symbol, a function", nullptr},
-    {"$F", "the same in upper case", nullptr},
-    {"$v", "name of the symbol", nullptr},
-    {"$V", "the same in upper case", nullptr},
-    {"$t", "short name of the symbol's type", nullptr},
-    {"$", "no macro of the language", nullptr},
-    {"", "as written", nullptr},
-};
-
-std::string meaningOf(const HX_WantedName& name, const std::string& macro) {
-  const MeaningRow* row = kMeanings;
-  while (macro.compare(0, std::strlen(row->macro), row->macro) != 0) ++row;
-  if (row->origin == nullptr) return row->meaning;
-  return row->meaning + (", from " + row->origin(name));
+std::string meaningOf(const HX_WantedName& name, const std::string& token) {
+  if (token[0] != '$') return "as written";
+  const HX_Macro* macro = HX_FindMacro(HX_FromUtf8(token));
+  if (macro == nullptr) return "no macro of the language";
+  const std::string origin = originOf(name, *macro);
+  return macro->meaning + (origin.empty() ? "" : ", from " + origin);
 }
 
 // The end of the macro or of the literal text that begins at \p from.
@@ -101,7 +78,7 @@ std::vector<HX_ExplainedMacro> HX_NameForming::explain(
     const std::string token = text.substr(from, end - from);
     from = end;
     if (token[0] != '$') {
-      steps.push_back({token, token, meaningOf(name, "")});
+      steps.push_back({token, token, meaningOf(name, token)});
       continue;
     }
     HxCCIdentifier id(HX_FromUtf8(token));
