@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <set>
 
+#include "host/base/HX_NaturalOrder.h"
 #include "host/import/HX_Literals.h"
 #include "host/import/HX_PartText.h"
 #include "host/import/HX_XmlPart.h"

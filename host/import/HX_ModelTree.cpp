@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <map>
 
+#include "host/base/HX_NaturalOrder.h"
 #include "host/import/HX_ModelFile.h"
 #include "host/import/HX_Notes.h"
 #include "host/import/HX_PartText.h"

@@ -19,8 +19,4 @@ std::string HX_OneLine(std::string_view text);
 /// count bytes.
 std::string HX_PlaceOf(std::string_view text, std::size_t offset);
 
-/// Compares digit runs by value and the rest by byte: "v2" comes before
-/// "v10". Total order: texts with different leading zeros only compare by byte.
-bool HX_NaturalLess(std::string_view a, std::string_view b);
-
 #endif  // HOST_IMPORT_HX_PARTTEXT_H

@@ -20,18 +20,23 @@ bool hasError(const std::vector<HX_Finding>& findings) {
 }  // namespace
 
 std::string HX_Change::text() const {
-  if (reason == eTakenByName) return "taken by '" + owner->id + "'";
-  return kReasons[reason];
+  if (reason != eTakenByName) return kReasons[reason];
+  const std::string path = HX_PathOf(HX_BestSource(*owner));
+  const std::string id = "'" + owner->id + "'";
+  return "taken by " + (path.empty() ? id : path + " (" + id + ")");
 }
 
 std::string HX_FormedName::sourcePath() const {
+  return HX_PathOf(HX_BestSource(*wanted));
+}
+
+const HxCSrcRef* HX_BestSource(const HX_WantedName& name) {
   const HxCSrcRef* block = nullptr;
   const HxCSrcRef* dd = nullptr;
   const HxCSrcRef* other = nullptr;
-  HxCSrcRefServer::getSpecificSrcRefFromSet(&wanted->sources, &block, &dd,
-                                            &other);
-  if (block != nullptr) return HX_PathOf(block);
-  return HX_PathOf(dd != nullptr ? dd : other);
+  HxCSrcRefServer::getSpecificSrcRefFromSet(&name.sources, &block, &dd, &other);
+  if (block != nullptr) return block;
+  return dd != nullptr ? dd : other;
 }
 
 std::string HX_JoinedChanges(const HX_FormedName& name, const char* separator) {

@@ -26,7 +26,8 @@ struct HX_Change {
   HxEReasonTag reason = eNone;
   const HX_WantedName* owner = nullptr;  // for eTakenByName
 
-  /// Empty for eNone. \return for example "shortened", "taken by 'gain'"
+  /// Empty for eNone. \return for example "shortened", "taken by m/Pedal/Gain
+  /// ('gain')"
   std::string text() const;
 };
 
@@ -41,13 +42,16 @@ struct HX_FormedName {
   std::vector<HX_Change> changes;
   std::vector<HX_Finding> findings;
 
-  /// RETURNS: the path of the last block of the sources, else of the last
-  /// dictionary object, else of the last other source; empty without a source.
+  /// RETURNS: the path of the best source; empty without a source.
   std::string sourcePath() const;
 };
 
 /// The texts of \p name.changes in their order.
 std::string HX_JoinedChanges(const HX_FormedName& name, const char* separator);
+
+/// RETURNS: the last block of the sources, else the last dictionary object,
+/// else the last other source; null without a source.
+const HxCSrcRef* HX_BestSource(const HX_WantedName& name);
 
 /// The text of a source reference in UTF-8; empty for null.
 std::string HX_PathOf(const HxCSrcRef* srcRef);

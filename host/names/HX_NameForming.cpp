@@ -1,10 +1,8 @@
 #include "host/names/HX_NameForming.h"
 
-#include <algorithm>
-#include <tuple>
-
 #include "Trace/HxCTransformationTracer.h"
 #include "host/base/HX_Text.h"
+#include "host/names/HX_FormingOrder.h"
 #include "platform/model/HX_BdBlock.h"
 #include "platform/model/HxCGlobal.h"
 
@@ -13,14 +11,6 @@ namespace {
 void remark(HX_FormedName& name, HX_Finding::HxESeverityTag severity,
             const std::string& text) {
   name.findings.push_back({0, severity, text, name.sourcePath()});
-}
-
-// Interrupt service routines first: names of tasks contain their names.
-auto rankOf(const HX_WantedName& name) {
-  const int group = name.kind == HX_NameKind::eIsr    ? 0
-                    : name.kind == HX_NameKind::eTask ? 1
-                                                      : 2;
-  return std::make_tuple(group, std::cref(name.id));
 }
 
 int countOf(char character, const KyCXString& text) {
@@ -56,18 +46,11 @@ constexpr OsTextRow kOsTexts[] = {
 std::deque<HX_FormedName> HX_NameForming::formAll(
     const std::deque<HX_WantedName>& names, const Progress& progress) {
   std::deque<HX_FormedName> formed;
-  std::vector<HX_FormedName*> order;
-  order.reserve(names.size());
-  for (const HX_WantedName& name : names)
-    order.push_back(&formed.emplace_back(name));
-  std::sort(order.begin(), order.end(),
-            [](const HX_FormedName* a, const HX_FormedName* b) {
-              return rankOf(*a->wanted) < rankOf(*b->wanted);
-            });
+  for (const HX_WantedName& name : names) formed.emplace_back(name);
   std::size_t done = 0;
-  for (HX_FormedName* name : order) {
-    form(*name);
-    progress(++done, order.size());
+  for (const std::size_t index : HX_FormingOrder(names)) {
+    form(formed[index]);
+    progress(++done, names.size());
   }
   return formed;
 }

@@ -30,8 +30,7 @@ class HX_NameForming {
 
   explicit HX_NameForming(HX_NameSpaces& spaces) : m_Spaces(spaces) {}
 
-  /// Forms names by ascending id, tasks first, because other names contain the
-  /// names of tasks. The order of \p names has no influence.
+  /// Forms names in the order of HX_FormingOrder().
   /// RETURNS: one formed name per wanted name, in the order of \p names.
   std::deque<HX_FormedName> formAll(const std::deque<HX_WantedName>& names,
                                     const Progress& progress);

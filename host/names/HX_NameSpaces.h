@@ -3,7 +3,7 @@
 //
 //   HX_NameSpaces spaces(model, types);
 //   KyCXString text("speed");
-//   spaces.define(name, text, true).text();   // "taken by 'speed_in'"
+//   spaces.define(name, text, true).text();   // "taken by m/In ('speed_in')"
 //   // text == "speed_a"
 
 #ifndef HOST_NAMES_HX_NAMESPACES_H
