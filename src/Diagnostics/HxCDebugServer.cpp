@@ -77,7 +77,7 @@ void logRunTime(int level, const char* keyword, const char* name,
   char head[128];  // more than indentation, keyword and name
   const int length =
       std::snprintf(head, sizeof head, "%*s%s%s", level * 2, "", keyword, name);
-  char line[kLineWidth + 32];
+  char line[kLineWidth + 48];  // room for the longest time and the line feed
   std::memset(line, '.', kLineWidth);
   std::memcpy(line, head,
               static_cast<std::size_t>(std::min(length, kLineWidth)));
