@@ -6,8 +6,10 @@
 #include "host/model/HX_Document.h"
 #include "host/model/HX_Synthesis.h"
 #include "host/program/HX_Generator.h"
+#include "host/program/HX_Version.h"
 #include "host/write/HX_NameMap.h"
 #include "host/write/HX_NameTable.h"
+#include "host/write/HX_Report.h"
 
 namespace {
 
@@ -61,6 +63,28 @@ void generateCode(const HX_Arguments& arguments, HX_Generator& generator) {
   output.commit();
 }
 
+std::string firstLine(const std::string& text) {
+  return text.substr(0, text.find('\n'));
+}
+
+// A circle of types leaves no names; the page shows the circle.
+void writeReport(const HX_Arguments& arguments, HX_Generator& generator) {
+  const std::filesystem::path file = generator.profile.start / arguments.out;
+  HX_Output output(file.parent_path());
+  const auto explain = [&](const HX_WantedName& name) {
+    return generator.forming->explain(name);
+  };
+  HX_WriteReport(output.open(file.filename().string()),
+                 {*generator.model, generator.result, explain,
+                  generator.profile.runs(), firstLine(HX_VersionText())});
+  output.finish();
+  if (!arguments.quiet)
+    std::cout << generator.result.names.size() << " names in " << arguments.out
+              << '\n';
+  HX_FlushOutput();
+  output.commit();
+}
+
 using Command = void (*)(const HX_Arguments&, HX_Generator&);
 
 HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command) {
@@ -84,6 +108,10 @@ HX_ExitCode HX_ExplainName(const HX_Arguments& arguments) {
 
 HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments) {
   return runOverModel(arguments, generateCode);
+}
+
+HX_ExitCode HX_ReportNames(const HX_Arguments& arguments) {
+  return runOverModel(arguments, writeReport);
 }
 
 HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments) {

@@ -31,6 +31,7 @@ struct HX_Arguments {
 HX_ExitCode HX_ShowNames(const HX_Arguments& arguments);
 HX_ExitCode HX_ExplainName(const HX_Arguments& arguments);
 HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments);
+HX_ExitCode HX_ReportNames(const HX_Arguments& arguments);
 HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments);
 
 /// Throws HX_OutputError if the standard output cannot be written.

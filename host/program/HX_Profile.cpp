@@ -14,6 +14,7 @@ constexpr char kTransformations[] = "HX_Transformations.txt";
 }  // namespace
 
 HX_Profile::HX_Profile(const std::string& folder) : m_IsOn(!folder.empty()) {
+  HX_TimingListener::install(this);
   if (!m_IsOn) return;
   fs::create_directories(folder);
   fs::current_path(folder);
@@ -22,7 +23,6 @@ HX_Profile::HX_Profile(const std::string& folder) : m_IsOn(!folder.empty()) {
   HX_SetCommandWindow([](const char*) {});
   HxCTransformationTracer::boot(kTransformations);
   m_Server.boot();
-  HX_TimingListener::install(this);
 }
 
 HX_Profile::~HX_Profile() {
@@ -52,23 +52,17 @@ void HX_Profile::finish() {
   HxCTransformationTracer::shutdown();
 
   HX_Output output(fs::current_path());
-  output.open("HX_Trace.json")
-      << nlohmann::ordered_json{{"traceEvents", m_Events}}.dump(1) << '\n';
+  HX_WriteTraceEvents(output.open("HX_Trace.json"), m_Runs);
+  HX_WriteFoldedStacks(output.open("HX_Stacks.folded"), m_Runs);
   output.finish();
   output.commit();
 }
 
 void HX_Profile::runEnded(const char* name, std::int64_t begin,
                           std::int64_t duration) {
-  // A phase is both a run time and, around it, a stop watch: shown once.
-  if (!m_Events.empty() && m_Events.back()["name"] == name)
-    m_Events.erase(m_Events.size() - 1);
-  m_Events.push_back({{"name", name},
-                      {"ph", "X"},
-                      {"ts", begin},
-                      {"dur", duration},
-                      {"pid", 1},
-                      {"tid", 1}});
+  // A phase is both a run time and, around the run time, a stop watch.
+  if (!m_Runs.empty() && m_Runs.back().name == name) m_Runs.pop_back();
+  m_Runs.push_back({name, begin, duration});
 }
 
 HX_Profile::Phase::Phase(HX_Profile& profile, const char* name)

@@ -13,17 +13,19 @@
 #include <cstdint>
 #include <filesystem>
 #include <list>
-#include <nlohmann/json.hpp>
 #include <string>
+#include <vector>
 
 #include "Diagnostics/HX_StopWatch.h"
 #include "Diagnostics/HX_TimingListener.h"
 #include "Diagnostics/HxCDebugServer.h"
+#include "host/write/HX_TimedRun.h"
 
 /// One per process. A folder becomes the working directory, because the servers
 /// of the library write their files there: HX_StopWatch.html, HX_DebugLog.txt,
 /// HX_DebugProtocol.txt and HX_Transformations.txt. HX_Trace.json has complete
-/// events of the trace-event format, in microseconds.
+/// events of the trace-event format, HX_Stacks.folded has one line per stack of
+/// phases with the self time; both in microseconds.
 class HX_Profile : private HX_TimingListener {
  public:
   /// Throws std::filesystem::filesystem_error for a folder that cannot be made
@@ -37,6 +39,8 @@ class HX_Profile : private HX_TimingListener {
   const std::filesystem::path start = std::filesystem::current_path();
 
   void setModel(const std::string& name);
+  /// Phases that have ended, inner phases before outer phases.
+  const std::vector<HX_TimedRun>& runs() const { return m_Runs; }
   /// A line of the protocol.
   void note(const std::string& text);
   /// Writes the reports of the servers and the trace; further calls do
@@ -63,7 +67,7 @@ class HX_Profile : private HX_TimingListener {
   bool m_IsOn;
   HxCDebugServer m_Server;
   std::list<HX_StopWatch> m_Watches;  // stay registered until the report
-  nlohmann::ordered_json m_Events = nlohmann::ordered_json::array();
+  std::vector<HX_TimedRun> m_Runs;
 };
 
 #endif  // HOST_PROGRAM_HX_PROFILE_H

@@ -15,6 +15,7 @@ constexpr char kFooter[] =
     "  hx_codegen explain model.json --name set_speed\n"
     "  hx_codegen generate model.json --out code --profile profile\n"
     "  hx_codegen import model.slx > model.json\n"
+    "  hx_codegen report model.json --out report.html\n"
     "  hx_codegen synthesize --blocks 10000 --seed 7 > large.json\n"
     "\n"
     "Exit codes:\n"
@@ -97,6 +98,10 @@ CommandLine::CommandLine() {
   addImportOptions(*import);
   add("rules", "print the built-in naming rules", HX_PrintRules)
       ->add_flag("--schema", arguments.schema, "print the schema of rules");
+  addOverModel("report", "write a page with names, model, types and times",
+               HX_ReportNames)
+      ->add_option("--out", arguments.out, "the file, for example report.html")
+      ->required();
 
   CLI::App* synthesis =
       add("synthesize", "print a document of any size, for trying scale",

@@ -1,4 +1,4 @@
-// Builds ../report_page.html: page, style, own code and libraries in one file.
+// Builds ../report_page.html: page, style, own code and libraries in one ASCII file.
 // hx_codegen writes the data of a run into the place of the data comment.
 
 import { build } from 'esbuild';
@@ -6,7 +6,7 @@ import { readFileSync, writeFileSync } from 'node:fs';
 
 const bundle = await build({
   entryPoints: ['main.js', 'style.css'], bundle: true, minify: true, write: false, outdir: 'out',
-  format: 'iife', target: 'es2020', charset: 'utf8', legalComments: 'none', metafile: true,
+  format: 'iife', target: 'es2020', charset: 'ascii', legalComments: 'none', metafile: true,
 });
 const output = (ending) => bundle.outputFiles.filter((file) => file.path.endsWith(ending))
   .map((file) => file.text.trim()).join('\n');
@@ -26,7 +26,7 @@ for (const name of [...packages].sort()) {
   byText.set(text, [...(byText.get(text) ?? []), `${name} ${version}`]);
 }
 const licences = 'This page contains:\n' + [...byText]
-  .map(([text, names]) => `\n${names.join(', ')}:\n\n${text}\n`).join('').replaceAll('--', '- -');
+  .map(([text, names]) => `\n${names.join(', ')}:\n\n${text}\n`).join('').replaceAll('--', '- -').replace(/[^\x00-\x7f]/g, '?');
 
 // Code must not end the element that holds the code.
 const code = output('.js').replaceAll('</script', '<\\/script');
@@ -34,5 +34,7 @@ const page = readFileSync('page.html', 'utf8')
   .replace('<!-- LICENCES -->', () => `<!--\n${licences}-->`)
   .replace('/* STYLE */', () => output('.css'))
   .replace('/* SCRIPT */', () => code);
+const other = page.match(/[^\x00-\x7f]/);
+if (other) throw new Error(`the page must be ASCII, found ${other[0]}`);
 writeFileSync('../report_page.html', page);
 console.log(`report_page.html: ${page.length} characters`);
