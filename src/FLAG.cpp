@@ -30,7 +30,7 @@ const char* nameOf(const FLAG_flag_info& row) {
 
 struct Conflict {
   int row;             // rowOfFlag()
-  unsigned int flags;  // those of the field that conflict; 0 without a row
+  unsigned int flags;  // conflicting flags of the field; 0 without a row
 };
 
 Conflict findConflict(unsigned int field, unsigned int flag, int rowCount,
@@ -56,7 +56,7 @@ Text describe(const Conflict& conflict, int rowCount,
 }
 
 // Reports a conflict, by the head of the text alone if memory runs out.
-// clear: what has to happen between the forming of the text and the report.
+// clear: called between the forming of the text and the report.
 template <class Clear>
 void report(const Conflict& conflict, int rowCount, const FLAG_flag_info* rows,
             const char* suffix, Clear clear) {

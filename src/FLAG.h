@@ -10,11 +10,11 @@
 //   pHXMemory->freeMemBlock(field);
 //
 // A flag is a mask: bit i stands for the value 2^i. A field may also be a word
-// of the caller's own; only FLAG_NewField() and FLAG_DupFlagField() allocate.
+// of the caller; only FLAG_NewField() and FLAG_DupFlagField() allocate.
 //
-// Where an operation asserts that its field is not null, a null field raises
-// the internal assertion (message 7); the operation then does nothing and
-// returns 0 or false. All others need a valid field and table.
+// Null fields: an operation documented to assert raises the internal assertion
+// (message 7) for a null field, does nothing and returns 0 or false. All other
+// operations REQUIRE a valid field and table.
 
 #ifndef FLAG_H
 #define FLAG_H
@@ -27,7 +27,7 @@
 /// A row of a conflict table. The caller's table has one row per bit position:
 /// row i describes the flag 2^i.
 struct FLAG_flag_info {
-  unsigned int excludedFlags;  ///< may not be set together with this flag
+  unsigned int excludedFlags;  ///< flags that exclude the flag of the row
   const char* flagName;        ///< for reports; may be null or empty
 };
 
@@ -51,12 +51,14 @@ inline bool isFlagField(const unsigned int* field, void (*fail)()) {
 
 }  // namespace hx_detail
 
-// A field is an unsigned int* in every signature, also where it is only read:
+// A field is an unsigned int* in every signature, also in operations that only
+// read:
 // NOLINTBEGIN(readability-non-const-parameter)
 
-/// A new field without flags, owned by the caller: a block of the memory
-/// controller, which must be installed. Null, after the assertion of
-/// FLAG_ClearAll(), if there is no memory.
+/// RETURNS: a new field without flags, a block of the memory controller; null,
+/// after the assertion of FLAG_ClearAll(), if memory runs out.
+/// REQUIRES: a memory controller is installed.
+/// OWNERSHIP: the caller owns the field.
 HX_UTILS_API unsigned int* FLAG_NewField();
 
 /// A new field with the flags of \p field; as FLAG_NewField().
@@ -110,8 +112,8 @@ HX_UTILS_INLINE_API inline int FLAG_GetNumberOfFlagsInField(
   return FLAG_GetNumberOfFlags(*field);
 }
 
-/// The mask of the \p i-th set bit: 1 asks for the lowest, the number of flags
-/// for the highest. 0 if there is no such bit.
+/// The mask of set bit number \p i, counted from 1 upwards from the lowest bit.
+/// 0 if the word has fewer set bits.
 HX_UTILS_INLINE_API inline unsigned int FLAG_GetIthFlag(unsigned int word,
                                                         int i) {
   if (i < 1) return 0;
@@ -131,24 +133,25 @@ HX_UTILS_INLINE_API inline HXCG_compare FLAG_CompareFlagfields(
 
 // Setting under a table of flags that exclude each other.
 //
-// The row of a flag is that of its highest bit; the flag 0 uses row 0. A row
-// that is not among the rowCount rows raises the internal assertion. The
-// conflicting flags are those of the field that the row excludes; they are
-// reported as message 1292 (internal warning).
+// The row of a flag is the row of the highest bit; the flag 0 uses row 0. A row
+// outside [0, rowCount) raises the internal assertion. Flags of the field that
+// the row excludes are in conflict and reported as message 1292 (internal
+// warning). If memory runs out, the report is cut after "Flag conflict found !
+// Flag "; results and field are the same.
 
-/// Only looks: reports a conflict and changes nothing.
-/// \return the conflicting flags; 0 if there are none or the row is missing
+/// Reports a conflict and changes nothing.
+/// \return the conflicting flags; 0 without a conflict or without a row
 HX_UTILS_API int FLAG_CheckFlag(unsigned int* field, unsigned int flag,
                                 int rowCount, const FLAG_flag_info* rows);
 
-/// Sets \p flag unless it conflicts, which is reported, or its row is missing.
+/// Sets \p flag if the row exists and no flag conflicts; reports a conflict.
 /// \return the conflicting flags; 0 if the flag was set or the row is missing
 HX_UTILS_API int FLAG_SaveSetFlag(unsigned int* field, unsigned int flag,
                                   int rowCount, const FLAG_flag_info* rows);
 
-/// Sets \p flag; if it then conflicts, clears \p flag again, even one that had
-/// been set before the call, and reports that. A flag whose row is missing
-/// stays set. A row that excludes its own flag conflicts always.
+/// Sets \p flag. On a conflict, reports and clears \p flag again, even if the
+/// flag was set before the call. Without a row the flag stays set. A row that
+/// excludes the flag of the row always conflicts.
 HX_UTILS_API void FLAG_ForceSetFlag(unsigned int* field, unsigned int flag,
                                     int rowCount, const FLAG_flag_info* rows);
 

@@ -36,11 +36,11 @@ HX_UTILS_INLINE_API inline leda::integer toInteger(unsigned long long v) {
   return (high << 32) + low;
 }
 
-/// The same value if 64 bits hold it, otherwise the bound that it exceeds.
+/// The same value if 64 bits hold \p x, otherwise the nearest bound of 64 bits.
 ///
 /// Before LedaIntegerSupportBoot() the bounds are 0: every positive value gives
-/// the largest, every negative value the smallest result. A debug check
-/// reports values of more than two words, which cannot get past the bounds.
+/// the largest, every negative value the smallest result. The debug check
+/// "usedWords <= 2" cannot fail behind the bounds of a boot.
 // NOLINTNEXTLINE(performance-unnecessary-value-param): callers pass a value
 HX_UTILS_INLINE_API inline long long toInt64(leda::integer x) {
   if (x > hx_detail::ledaLargestInt64) {

@@ -1,18 +1,18 @@
 // The messages that this library emits, one row each.
 //
-// A new message is a new row here. The row makes the entry of the catalogue,
-// which a message handler reads, and the emitter ERR_Msg<number> in
-// ERR_Messages.h. The compiler checks each row: the numbers ascend, and the
-// parameters of the emitter fit the conversions of the text.
+// A new message is a new row here. The row makes two things: the entry of the
+// catalogue, for message handlers, and the emitter ERR_Msg<number> in
+// ERR_Messages.h. The compiler checks every row: numbers ascend, and parameters
+// of the emitter fit the conversions of the text.
 
 #ifndef CONTROL_ERR_CATALOGUE_H
 #define CONTROL_ERR_CATALOGUE_H
 
 /// One message: number, identification, class and wording.
 struct ERR_CatalogueRow {
-  int number;            ///< what ERR_EmitErrorMessage() receives
-  int id;                ///< the number that a user sees
-  const char* category;  ///< the group that a user sees
+  int number;            ///< for ERR_EmitErrorMessage()
+  int id;                ///< the number shown to users
+  const char* category;  ///< the group shown to users
   int severity;          ///< 0 to 7, see ERR_EmitErrorMessage()
   const char* text;      ///< a printf format
 };
@@ -25,10 +25,10 @@ inline constexpr const char* kVariableMessages = "Variables Messages";
 inline constexpr const char* kNamingMessages = "Naming Macros Messages";
 inline constexpr const char* kInternalMessages = "Internals message";
 
-/// Calls ROW for each message, ascending by number, with: number, id, category,
-/// severity, parameters of the emitter, the same parameters without types,
-/// text. An emitter whose first parameter is a source reference attaches the
-/// message to that reference.
+/// Calls ROW for every message, ascending by number, with: number, id,
+/// category, severity, parameters of the emitter, the same parameters without
+/// types, text. An emitter whose first parameter is a source reference attaches
+/// the message to that reference.
 #define ERR_MESSAGES(ROW)                                                      \
   ROW(2, 10002, kGeneralMessages, 0, (const char* label, double seconds),      \
       (label, seconds), "%-30s in %7.3lf seconds.")                            \

@@ -1,4 +1,4 @@
-// One policy for missing memory, for every class of the library.
+// The policy for missing memory, for every class of the library.
 //
 // An exported operation that runs out of memory throws nothing. The operation
 // returns its failure value (null, false, 0 or an empty text, as the header of
@@ -26,8 +26,8 @@
 
 /// Runs \p work, which takes no argument.
 /// RETURNS: the result of \p work; \p failure if memory runs out on the way.
-/// Any exception but std::bad_alloc and std::length_error passes through,
-/// because such an exception belongs to the host.
+/// Exceptions other than std::bad_alloc and std::length_error pass through,
+/// because the host threw them.
 template <class Result, class Work>
 Result HX_WithinMemory(Result failure, Work&& work) {
   try {
@@ -54,7 +54,7 @@ bool HX_WithinMemory(Work&& work) {
 /// installed. allocate() throws std::bad_alloc.
 template <class T>
 struct HX_ControllerAllocator {
-  /// What std::allocator_traits asks of every allocator.
+  /// Required by std::allocator_traits.
   using value_type = T;
   HX_ControllerAllocator() = default;
   /// Allocators have no state: a copy of another type is an allocator as well.
@@ -75,7 +75,7 @@ struct HX_ControllerAllocator {
   /// Returns memory of allocate().
   void deallocate(T* block, std::size_t) noexcept { HX_Free(block); }
 
-  /// True: every allocator returns the memory of every other.
+  /// True: any allocator may return the memory of any allocator.
   friend bool operator==(const HX_ControllerAllocator&,
                          const HX_ControllerAllocator&) {
     return true;

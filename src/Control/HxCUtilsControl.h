@@ -22,8 +22,8 @@ class HX_UTILS_API HxCUtilsControl : public HxCControl {
   HxCUtilsControl& operator=(const HxCUtilsControl&) = default;
   ~HxCUtilsControl() override;
 
-  /// Calls the string class once, so that a string library that cannot be
-  /// loaded fails here. \return true
+  /// Calls the string class once: a string library missing at run time fails
+  /// here. \return true
   bool boot();
   /// Does nothing. \return true
   bool shutdown();

@@ -1,7 +1,7 @@
 // Sets the state of the floating-point unit when the library is loaded.
 //
-// Nothing refers to this file, so users of the static library pull it in with a
-// linker option (see CMakeLists.txt).
+// No other file refers to this file. A linker option (see CMakeLists.txt) makes
+// users of the static library link the file.
 
 #include <cfenv>
 
@@ -13,8 +13,8 @@
 
 namespace {
 
-// Where doubles are computed by the SSE unit alone (64 bit), the x87 precision
-// stays: it would only spoil the host's long double.
+// On 64 bits the SSE unit alone computes doubles, and the x87 precision stays,
+// because a change would only spoil the host's long double.
 int setFloatingPointState() {
 #if defined(__i386__) && defined(__GLIBC__)
   fpu_control_t control;

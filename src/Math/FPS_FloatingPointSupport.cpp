@@ -1,3 +1,50 @@
+// The rounding to integers, the integer logarithms and the other operations on
+// doubles.
+//
+// Rounding up and down
+// --------------------
+// Problem: ceiling and floor, but a value within the tolerance 2^-26 of an
+// integer snaps to the integer.
+//
+// Plain form, kept for magnitudes from 2^51 on: r = floor(x + 0.5), saturated
+// to 64 bits; a tolerant comparison of r and x; then a saturated cast of
+// x - 1, x or x + 1, chosen by the sign of x and of r - x.
+// COST: two calls of floor, three casts with bounds of the data type server.
+//
+// Idea: below 2^51 nothing saturates and x has places for a half, so one
+// truncation is enough. Round the magnitude m = |x| between cut = truncation of
+// m and above = cut + 1; the rest m - cut decides (roundMagnitude). A negative
+// x rounds the magnitude in the other direction.
+//
+// Example, FPS_RoundUp:
+//   x             cut   rest          snaps       result
+//   2.00000001    2     1e-8          to 2        2
+//   2.25          2     0.25          no          3
+//   2.9999999999  2     1 - 1e-10     to 3        3
+//   -2.5          2     0.5           no          -2
+//   1 - 2^-53     0     1 - 2^-53     to 1        2, because x + 1 rounds to 2
+//
+// Invariants:
+//   1. m < 2^51, hence cut, above and rest are exact.
+//   2. x snaps to the nearest integer n if 2^-26 max(1, |n|, m) > |n - m|.
+//   3. On a tie the nearest integer is floor(x + 0.5): above for x > 0, cut for
+//      x < 0.
+//   4. A value that snaps upward takes the truncation of m + 1, also where the
+//      sum rounds to the integer after next (last row of the example).
+//
+// Integer logarithms
+// ------------------
+// Problem: FPS_Log2(x) truncated or rounded, including the error of the divisor
+// 0.69314718055995. Plain form: the logarithm.
+//
+// Idea: for x = m 2^k with m in [1, 2) the exponent k decides, unless m lies
+// within kClearance of 1, of 2 or, for the rounded form, of the root of 2. Only
+// values that close take the logarithm.
+//
+// Tests: OperationsGiveTheRecordedResults,
+// LogarithmIsAlmostAlwaysCorrectlyRounded and, with rational numbers,
+// SaturationAndRoundingMatchExactArithmetic.
+
 #include "Math/FPS_FloatingPointSupport.h"
 
 #include <algorithm>
@@ -24,8 +71,8 @@ double s_PosInf = 0.0;
 double s_NegInf = 0.0;
 double s_Pi = 0.0;
 
-// A special value as it is handed back: registers of the 32-bit convention
-// turn a signalling NaN quiet, so it is made quiet everywhere.
+// Makes a signalling NaN quiet on every machine, because the registers of the
+// 32-bit convention do.
 double returnSpecial(double x) { return x + x; }
 
 bool areEqual(double a, double b) {
@@ -48,7 +95,7 @@ long long satCastToInt64(double x) {
                              : DT_GetMinAsInt64(code);
 }
 
-// The truncation with the 64-bit bounds as a double again.
+// The truncation as a double, saturated at the 64-bit bounds.
 double truncate(double x) { return static_cast<double>(satCastToInt64(x)); }
 
 int satCastToInt(double x) {
@@ -58,11 +105,11 @@ int satCastToInt(double x) {
   return x > -2147483648.0 ? static_cast<int>(x) : -2147483647 - 1;
 }
 
-// True for values that have the places for a half, and so can be rounded
-// without saturation and without the run-time's floor; false for special ones.
+// True if rounding never saturates and a half has a place (invariant 1); false
+// for special values.
 bool isModerate(double x) { return std::fabs(x) < 0x1p51; }
 
-// Of a moderate value; never -0.0.
+// Truncation of a moderate value; never -0.0.
 double cutOff(double x) {
   return static_cast<double>(static_cast<long long>(x));
 }
@@ -82,7 +129,7 @@ bool isIntegerValue(double x) {
   return isNear(x, cut > y ? cut - 1.0 : cut);
 }
 
-// The integer that the near-integer x is snapped to.
+// The integer for a value near an integer.
 double snap(double x) {
   HX_Assert(isIntegerValue(x), kErrorCode);
   const double nearest = std::floor(x + 0.5);
@@ -90,8 +137,8 @@ double snap(double x) {
   return truncate(nearest < x ? x - 1.0 : x);
 }
 
-// Rounds a moderate magnitude to an integer, with a snap to the near one. The
-// sign of its value decides where the integer nearest to a half lies.
+// Rounds a moderate magnitude to an integer, with snapping. isNegative is the
+// sign of the value and decides ties (invariant 3).
 double roundMagnitude(double magnitude, bool isNegative, bool isUp) {
   const double cut = cutOff(magnitude);
   const double above = cut + 1.0;
@@ -101,7 +148,7 @@ double roundMagnitude(double magnitude, bool isNegative, bool isUp) {
       isUp ? kDefaultTolerance > rest || kDefaultTolerance * magnitude > rest
            : kDefaultTolerance * above > above - magnitude;
   if (isUp ? isSnapped && isBelowHalf : !isSnapped || isBelowHalf) return cut;
-  // Adding 1 may round to the integer after the one above.
+  // Invariant 4.
   return magnitude + 1.0 < above + 1.0 ? above : above + 1.0;
 }
 
@@ -122,9 +169,9 @@ Split split(double x) {
                                                  std::uint64_t{1023} << 52)};
 }
 
-// This far from a power of two or its root, relatively, the exponent decides
-// how the logarithm rounds: FPS_Log2 errs by less than 2^-36, which is 1024
-// times the relative error of its divisor.
+// Relative distance from powers of two (and from roots of powers) beyond which
+// the exponent decides the integer logarithms. FPS_Log2 errs by less than
+// 2^-36, 1024 times the relative error of the divisor; 2^-30 is 64 times more.
 constexpr double kClearance = 0x1p-30;
 
 bool isClearOfIntegers(double mantissa) {
@@ -180,7 +227,7 @@ bool FPS_IsIntegerValue(double x) { return isIntegerValue(x); }
 
 double FPS_RoundOffBits(double x, int bits) {
   if (!std::isfinite(x)) return returnSpecial(x);
-  // Beyond these nothing changes any more; a negated minimum would overflow.
+  // More bits change nothing; the negated minimum of int would overflow.
   constexpr int kMostBits = 5000;
   const int places = std::clamp(bits, -kMostBits, kMostBits);
   int exponent = 0;
@@ -227,7 +274,7 @@ bool FPS_ConvertSpecialValueToInteger(double x, double* out) {
 
 double FPS_Round(double x) { return truncate(x < 0.0 ? x - 0.5 : x + 0.5); }
 
-// Subtracting a magnitude from 0.0 keeps a zero positive.
+// A magnitude is subtracted from 0.0, because 0.0 - 0.0 is not -0.0.
 double FPS_RoundUp(double x) {
   if (isModerate(x)) {
     return x < 0.0 ? 0.0 - roundMagnitude(-x, true, false)

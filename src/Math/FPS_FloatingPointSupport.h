@@ -13,10 +13,11 @@
 // as the library sets it when it is loaded (on 32-bit x86 it also sets the
 // precision of the floating-point unit to 53 bits).
 //
-// NaN: the comparisons and FPS_ConvertSpecialValueToInteger are made for it.
-// The casts take it for a value too large (it is not below zero), as do the
-// roundings that end in a cast; everything else returns a NaN if its result is
-// a double. Nothing here faults or loops for any argument.
+// NaN:
+//   comparisons, FPS_ConvertSpecialValueToInteger   accept NaN, see below
+//   casts, and roundings that end in a cast         take NaN as a large value
+//   other operations with a double as result        return NaN
+// No operation faults or loops for any argument.
 //
 // The bounds of integers are those of the data type server. No operation
 // reports an error, apart from the internal assertions that are named.
@@ -28,8 +29,8 @@
 
 #include "HX_Export.h"
 
-/// Sets the four values below; may be called again. Asserts that they are what
-/// they should be.
+/// Sets the four values below; may be called again. Asserts that the NaN is a
+/// NaN and that the infinities are not finite.
 HX_UTILS_API void ModInit_FPS_FloatingPointSupport();
 
 /// A quiet NaN, the infinities and pi; 0.0 before the initialisation.
@@ -59,9 +60,12 @@ HX_UTILS_API bool FPS_ValuesAreApproxEqual(double a, double b);
 /// True if \p x is approximately equal, with the tolerance 2^-26, to the
 /// nearest integer of 64 bits.
 ///
-/// Above magnitude 2^25 half a unit is within the tolerance, so every value is
-/// an integer; above 2^63 none is, but for the first 2^-26 of relative
-/// distance. False for special values.
+/// | |x|                       | result |
+/// |---------------------------|-----------------------------------------------|
+/// | [0, 2^25]                 | true near an integer | | (2^25, 2^63) | true:
+/// half a unit is within the tolerance     | | [2^63, 2^63 (1 + 2^-26))  |
+/// true: within the tolerance of the largest one | | above, special values |
+/// false                                         |
 HX_UTILS_API bool FPS_IsIntegerValue(double x);
 
 // --- Rounding to a number of places ------------------------------------------
@@ -71,13 +75,13 @@ HX_UTILS_API bool FPS_IsIntegerValue(double x);
 /// With 53 bits an odd mantissa already counts as a tie and moves up, with more
 /// nothing changes; more than 1024 give an infinity of the sign of \p x.
 /// 0 bits leave 0 or a power of two, fewer leave 0. Special values are returned
-/// as they are; -0.0 gives 0.0.
+/// unchanged; -0.0 gives 0.0.
 HX_UTILS_API double FPS_RoundOffBits(double x, int bits);
 
 /// \p x rounded to 13 decimal places, ties upward. Special values are returned
-/// as they are; above about 1.8e295 the scaled value overflows and the result
-/// is infinite. From magnitude 450 on a double has no 13 places: the last bit
-/// may change.
+/// unchanged; above about 1.8e295 the scaled value overflows and the result is
+/// infinite. From magnitude 450 on a double has no 13 places: the last bit may
+/// change.
 HX_UTILS_API double FPS_RoundOffDigits(double x);
 
 // --- Conversion to integers --------------------------------------------------
@@ -116,19 +120,19 @@ HX_UTILS_API bool FPS_ConvertSpecialValueToInteger(double x, double* out);
 /// an odd value may move to its even neighbour.
 HX_UTILS_API double FPS_Round(double x);
 
-/// Ceiling and floor. A value for which FPS_IsIntegerValue holds is snapped to
-/// the nearest integer instead, whether it lies above or below it; from
-/// magnitude 2^25 on that is every value. Just below a power of two adding 1 to
-/// the value rounds, and the value is snapped one too far: 1 - 2^-53 gives 2.
-/// The result saturates at -2^63 and 2^63, also for the infinities.
+/// Ceiling and floor, but a value for which FPS_IsIntegerValue holds snaps to
+/// the nearest integer above or below; from magnitude 2^25 on every value
+/// snaps. Just below a power of two the sum of value and 1 rounds, and the
+/// result is 1 too far: 1 - 2^-53 gives 2. The result saturates at -2^63 and
+/// 2^63, also for the infinities.
 HX_UTILS_API double FPS_RoundUp(double x);
 HX_UTILS_API double FPS_RoundDown(double x);
 
 // --- Arithmetic of the simulation --------------------------------------------
 
 /// x - floor(x / y) * y, with the sign of \p y; \p x if \p y is 0. Quotient and
-/// product are rounded: the result may miss the exact remainder, even reach
-/// \p y, and just below a multiple of \p y be tiny and of the other sign.
+/// product are rounded: the result may miss the exact remainder, may reach \p
+/// y, and just below a multiple of \p y may be tiny with the opposite sign.
 HX_UTILS_API double FPS_SimulinkAlikeModulo(double x, double y);
 
 /// x - t * y with t = x / y truncated and saturated to 64 bits, with the sign
@@ -152,14 +156,15 @@ HX_UTILS_API double FPS_ATanh(double x);
 /// every result is too near to 0, by 7e-15 of its value: FPS_Log2(8.0) is
 /// 2.9999999999999796.
 ///
-/// The logarithm is the library's own, since those of run-times differ in the
-/// last bit; its error is below 0.51 units of that. -Inf for 0, a NaN below.
+/// The logarithm is the library's own, because the logarithms of run-times
+/// differ in the last bit. Error: below 0.51 units in the last place. -Inf for
+/// 0, NaN below 0.
 HX_UTILS_API double FPS_Log2(double x);
 HX_UTILS_API double FPS_Log2(int n);
 
-/// FPS_Log2(x) truncated, and so one too near to 0 for every power of two but
-/// 1 and for what lies just beyond it: FPS_Log2Int(8.0) is 2, FPS_Log2Int(0.25)
-/// is -1.
+/// FPS_Log2(x) truncated. Because of the divisor the result is 1 too near to 0
+/// for every power of two but 1, and just beyond the power: FPS_Log2Int(8.0) is
+/// 2, FPS_Log2Int(0.25) is -1.
 ///
 /// -2147483648 for 0, 2147483647 for +Inf and where the logarithm is a NaN.
 HX_UTILS_API int FPS_Log2Int(double x);
@@ -167,34 +172,36 @@ HX_UTILS_API int FPS_Log2Int(double x);
 /// FPS_Log2(x) rounded half away from zero, with the bounds of FPS_Log2Int.
 HX_UTILS_API int FPS_GetPowerOf2(double x);
 
-/// True if the 52 fraction bits of \p x are 0 and \p x is not.
+/// True if the 52 fraction bits of \p x are 0 and \p x is not 0.
 ///
 /// Looks at the bits alone: the sign does not matter, an infinity is a power
-/// with the exponent 1024, a value below 2^-1022 never is one.
+/// with the exponent 1024, a value below 2^-1022 is no power.
 /// \param[out] exponent  the exponent, 0 if the result is false; may be null.
 HX_UTILS_API bool FPS_PowerOf2(double x, int* exponent);
 
 /// The exponent of the smallest power of two not below \p x; that of |x| for a
 /// negative power.
 ///
-/// For other values it comes from FPS_Log2, whose error makes it one too small
-/// just above a power of two from 2 on and one too large just below one from
-/// 1/2 down. For 0 and other negative values as FPS_Log2Int.
+/// For all other values the result comes from FPS_Log2. The error of FPS_Log2
+/// makes the result 1 too small just above the powers 2, 4, 8, ..., and 1 too
+/// large just below the powers 1/2, 1/4, ... For 0 and negative values that are
+/// no powers as FPS_Log2Int.
 HX_UTILS_API int FPS_GetGreaterPowerOf2(double x);
 
 // --- Divisors and multiples --------------------------------------------------
 
-/// Euclid's algorithm with fmod on the two values of \p pair, which stay
-/// unchanged. Exact, without tolerance; the sign follows the remainders. A NaN
-/// if a remainder is one (NaN or an infinity in the pair).
+/// Euclid's algorithm with fmod on the two values of \p pair; the values stay
+/// unchanged. Exact, without tolerance; the sign follows the remainders. NaN if
+/// a remainder is NaN (NaN or an infinity in the pair).
 ///
 /// Raises an internal assertion in every call and again in every step: message
 /// 7 with this source file. IMS_FindGreatestCommonDivisor does not.
 HX_UTILS_API double FPS_FindGreatestCommonDivisor(double* pair);
 
-/// The least common multiple of \p n values, at least 2, which stay unchanged.
-/// There is no check of overflow; a NaN if all values are 0. Raises the
-/// assertions of the divisors it takes.
+/// The least common multiple of \p n values; the values stay unchanged. No
+/// check of overflow; NaN if all values are 0. Raises the assertions of
+/// FPS_FindGreatestCommonDivisor.
+/// REQUIRES: \p n is at least 2.
 HX_UTILS_API double FPS_FindLeastCommonMultiple(int n, double* values);
 
 #endif  // MATH_FPS_FLOATINGPOINTSUPPORT_H

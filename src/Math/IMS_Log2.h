@@ -4,7 +4,7 @@
 //   IMS_Log2(1024u);   // 10
 //
 // The result is the index of the highest set bit; 0 and 1 both give 0. A
-// negative value has no logarithm and gives -1, which is no index of a bit.
+// negative value has no logarithm and gives -1, the index of no bit.
 
 #ifndef MATH_IMS_LOG2_H
 #define MATH_IMS_LOG2_H

@@ -1,4 +1,4 @@
-// Walks the elements of a collection, one at a time.
+// Walk over the elements of a collection.
 //
 //   std::unique_ptr<HX_Iterator<const HxCSrcRef*>> it(set.createIterator());
 //   if (it == nullptr) return;   // no memory
@@ -9,7 +9,7 @@
 
 #include "Control/HX_Allocated.h"
 
-/// An iterator starts at the first element. The iterator is valid while the
+/// An iterator starts at the first element and is valid while the
 /// collection is neither changed nor destroyed.
 template <class T>
 class HX_Iterator : public HX_Allocated {

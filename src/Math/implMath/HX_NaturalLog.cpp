@@ -12,7 +12,8 @@ double logNearOne(double x, std::uint64_t offset) {
       std::bit_cast<double>(std::bit_cast<std::uint64_t>(x) -
                             offset % kIntervalNearOne + kIntervalNearOne / 2);
 
-  // As far from one, but q is exact, and the error of the sum is carried along.
+  // As in logFarFromOne(), but q is exact, and low carries the error of the sum
+  // (invariant 3).
   const double q = (x - centre) * row.reciprocal;
   const double high = row.lnHigh + q;
   const double low = row.lnLow + (q - (high - row.lnHigh));

@@ -1,16 +1,41 @@
-// The natural logarithm of this library: the same bits on every machine.
+// Natural logarithm with the same bits on every machine.
 //
-// The logarithms of C run-times differ in the last bit from each other, and one
-// run-time's from itself on another processor. This one is a fixed sequence of
-// additions and multiplications of doubles, which IEEE 754 rounds in one way
-// only. It is correctly rounded for nearly all arguments, as a good run-time's
-// is.
+// Problem: the logarithms of C run-times differ in the last bit, also between
+// two processors with one run-time. One model would give two results.
 //
-// Method: P. T. P. Tang, "Table-driven implementation of the logarithm function
-// in IEEE floating-point arithmetic", ACM TOMS 16 (1990). What limits the speed
-// is the number of operations on doubles that wait for the argument, more than
-// their order; so the multiples of ln 2 come from a table as well, and the
-// arguments near 1, which need more digits, have a sequence of their own.
+// Plain form: a logarithm of 50 digits, rounded to a double. Correct, but every
+// call computes with numbers of many words.
+//
+// Idea (P. T. P. Tang, "Table-driven implementation of the logarithm function
+// in IEEE floating-point arithmetic", ACM TOMS 16, 1990): a fixed sequence of
+// additions and multiplications of doubles, because IEEE 754 rounds both in one
+// way only. For x = z 2^k with z in [1, 2), a table gives a centre c near z:
+//   ln(x) = k ln(2) + ln(c) + ln(1 + r),   r = (z - c) / c
+// ln(c) comes from the table in two parts, high and low; ln(1 + r) is a short
+// polynomial, because |r| is below 2^-9.
+//
+// Example, x = 10: k = 3, z = 1.25, row 128 with c = 1.2510690287110569
+//   k ln(2)     2.0794415416798
+//   ln(c)       0.2239984087883
+//   r          -0.0008544921875   ln(1 + r) = r - r^2/2 + ... = -0.0008548574741
+//   sum         2.3025850929940   = ln(10)
+//
+// Invariants:
+//   1. kLn2High and all lnHigh are multiples of 2^-42: k.high + lnHigh is
+//   exact.
+//   2. All parts after this first sum are below 2^-9: their rounding errors
+//   stay
+//      below 0.01 units in the last place of a logarithm beyond 1/8.
+//   3. Near x = 1 the logarithm itself is small and invariant 2 says nothing.
+//      Arguments in the second table take logNearOne(), where q is exact and
+//      the error of the sum is carried along.
+//   4. No operation depends on the locale, on errno or on fused multiplication.
+//
+// COST: operations that wait for the argument limit the speed, not the number
+// of operations; hence the table of k ln(2) for the frequent k.
+//
+// Tests: LogarithmIsAlmostAlwaysCorrectlyRounded compares with 50 digits;
+// script/make_log_table.py writes the tables.
 
 #ifndef MATH_IMPLMATH_HX_NATURALLOG_H
 #define MATH_IMPLMATH_HX_NATURALLOG_H
@@ -31,7 +56,7 @@ double logOfRareArgument(double x);
 /// ln of a value with an offset below kWidthNearOne.
 double logNearOne(double x, std::uint64_t offset);
 
-// k ln(2). The high part is exact, for k below 2^11.
+// k ln(2). The high part is exact for k below 2^11.
 struct Ln2Multiple {
   double high;
   double low;
@@ -39,7 +64,7 @@ struct Ln2Multiple {
 
 constexpr Ln2Multiple ln2Times(int k) { return {k * kLn2High, k * kLn2Low}; }
 
-// The arguments in [2^-64, 2^64) take theirs from a table.
+// Table of k ln(2) for the arguments in [2^-64, 2^64).
 inline constexpr int kTabulatedExponents = 64;
 inline constexpr auto kLn2Multiples = [] {
   std::array<Ln2Multiple, std::size_t{2} * kTabulatedExponents> table{};
@@ -48,7 +73,7 @@ inline constexpr auto kLn2Multiples = [] {
   return table;
 }();
 
-// A normal number is z 2^k: z in [1, 2) and the row of its interval.
+// z of a normal number z 2^k, in [1, 2), and the row of the table for z.
 struct Mantissa {
   double z;
   const HX_NaturalLogRow& row;
@@ -61,24 +86,22 @@ inline Mantissa mantissaOf(std::uint64_t bits) {
           kNaturalLogRows[fraction >> 43]};
 }
 
-// ln of the positive normal number with the bits \p bits, not near 1. Its parts
-// after the first sum are below 2^-9, so their errors stay below 0.01 units in
-// the last place of a logarithm beyond 1/8.
+// ln of the positive normal number with the bits \p bits, not near 1
+// (invariants 1 and 2).
 inline double logFarFromOne(std::uint64_t bits, const Ln2Multiple& k) {
-  // ln(x) = k ln(2) + ln(centre) + ln(1 + r), r = (z - centre) / centre, with
-  // |r| <= 1.02 / 2^10; the first sum is exact.
+  // |r| <= 1.02 / 2^10
   const auto [z, row] = mantissaOf(bits);
   const double r = (z - row.centre) * row.reciprocal;
   const double r2 = r * r;
-  // r - r^2/2 + r^3/3 - ..., moved to an error below 2^-64
+  // r - r^2/2 + r^3/3 - ..., coefficients moved to an error below 2^-64
   const double tail = (-1.0 / 2 + r * 0x1.5555555554fe2p-2) +
                       r2 * (-0x1.0000098982d54p-2 + r * 0x1.9999b6c8a2c8dp-3);
   return (k.high + row.lnHigh) + (r + ((k.low + row.lnLow) + r2 * tail));
 }
 
-// What is near one: the intervals of the second table. Offsets, the differences
-// between the bits of two doubles, pass 1 without a gap; there their unit
-// doubles.
+// Near one: the intervals of the second table, in offsets. An offset is the
+// difference between the bits of two doubles. Offsets pass 1 without a gap,
+// where the distance of neighbouring doubles doubles.
 inline constexpr std::uint64_t kIntervalNearOne = std::uint64_t{1} << 44;
 inline constexpr std::uint64_t kWidthNearOne =
     std::size(kNaturalLogRowsNearOne) * kIntervalNearOne;
@@ -88,9 +111,9 @@ inline constexpr auto kLowestNearOne = std::bit_cast<std::uint64_t>(1.0) -
 
 }  // namespace hx_detail
 
-/// ln(x), with an error below 0.51 units in the last place. Minus infinity for
-/// both zeros, a NaN below zero and for a NaN, infinity for infinity. Leaves
-/// errno alone. Needs round-to-nearest.
+/// ln(x), with an error below 0.51 units in the last place. -Inf for both
+/// zeros, NaN below zero and for NaN, +Inf for +Inf. Never touches errno.
+/// REQUIRES: round-to-nearest.
 inline double HX_NaturalLog(double x) {
   using namespace hx_detail;
   const auto bits = std::bit_cast<std::uint64_t>(x);
