@@ -1,5 +1,5 @@
-// What a line in the debug server's files costs. One item is one line, after
-// which the file is complete. Run in a directory of its own, which goes again.
+// Cost of a line in the files of the debug server. One item is one line; the
+// file is complete after each line. Runs in a temporary directory.
 
 #include <benchmark/benchmark.h>
 

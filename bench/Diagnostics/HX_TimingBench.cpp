@@ -1,4 +1,4 @@
-// What it costs to time something. One item is one start with its stop.
+// Cost of timing. One item is one start and one stop.
 
 #include <benchmark/benchmark.h>
 
@@ -35,7 +35,7 @@ void BM_DebugServer_Clock(benchmark::State& state) {
 }
 BENCHMARK(BM_DebugServer_Clock);
 
-// Beside as many registered watches as the argument says, none of them running.
+// The argument is the number of further registered watches; all are idle.
 void BM_StopWatch_StartStop(benchmark::State& state) {
   std::vector<std::unique_ptr<HX_StopWatch>> idle;
   for (std::int64_t i = 0; i < state.range(0); ++i)
@@ -50,7 +50,7 @@ void BM_StopWatch_StartStop(benchmark::State& state) {
 }
 BENCHMARK(BM_StopWatch_StartStop)->Arg(0)->Arg(1000);
 
-// Inside as many running watches as the argument says.
+// The argument is the number of surrounding running watches.
 void BM_StopWatch_Nested(benchmark::State& state) {
   std::vector<std::unique_ptr<HX_StopWatch>> outer;
   for (std::int64_t i = 0; i < state.range(0); ++i) {

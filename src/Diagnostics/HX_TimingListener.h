@@ -1,7 +1,6 @@
-// Lets the host follow the runs that stop watches and the debug server time.
+// Tells a host of each run of a stop watch or of the debug server.
 //
-// The servers' own files hold sums; a host that draws a time line listens to
-// each run as it ends:
+// The report files hold sums only. A host draws a time line from single runs:
 //
 //   class Timeline : public HX_TimingListener {
 //     void runEnded(const char* name, std::int64_t start,
@@ -19,27 +18,28 @@
 
 #include "HX_Export.h"
 
-/// Listening changes no time that is accounted: the clock is not read again.
+/// Listening changes no accounted time, because the clock is not read again.
 class HX_UTILS_API HX_TimingListener {
  public:
   virtual ~HX_TimingListener();
 
-  /// A run of a stop watch or a run time of the debug server has ended; called
-  /// once per run, in the order of the ends, so that a nested run comes before
-  /// the one around it.
+  /// Called once at the end of each run of a stop watch and of each run time of
+  /// the debug server; an inner run comes before the surrounding run.
   ///
-  /// Must not start, stop, create or destroy what is timed.
+  /// REQUIRES: the listener does not start, stop, create or destroy watches or
+  /// run times.
   /// \param name  valid during the call
-  /// \param start  microseconds since an arbitrary origin, the same for all
-  ///     runs timed by one clock: a debug server that is not booted takes the
-  ///     process clock, also where stop watches take the counter; the start of
-  ///     a run time during which it is booted tells nothing
-  /// \param duration  microseconds, as it is accounted
+  /// \param start  microseconds since an arbitrary origin, equal for all runs
+  /// of
+  ///     one clock. Before boot() a debug server uses the process clock, even
+  ///     while stop watches use the counter; the start of a run time across
+  ///     boot() has no meaning.
+  /// \param duration  the accounted microseconds
   virtual void runEnded(const char* name, std::int64_t start,
                         std::int64_t duration) = 0;
 
-  /// Makes \p listener, which is not owned, the only one; null for none, as at
-  /// load.
+  /// Makes \p listener the only listener; null, as at load, for no listener.
+  /// OWNERSHIP: the host keeps the listener.
   static void install(HX_TimingListener* listener) { s_pListener = listener; }
   static HX_TimingListener* installed() { return s_pListener; }
 

@@ -1,4 +1,4 @@
-// The counters and clocks of the debug server, and the texts that name them.
+// Counters and clocks of the debug server, and their names in reports.
 //
 //   HxCDebugElements::getClockComment(eClockEvalMlExpr);
 //   // "method HX_MlExprEvaluator::evalMlExpr"
@@ -8,7 +8,7 @@
 
 #include "HX_Export.h"
 
-/// The counters. The common ones are for whoever debugs; the last one counts
+/// Counters. Common counters are free for debugging; the last counter counts
 /// evaluated MATLAB expressions.
 enum ScEDebugCounter : int {
   eCounterCommon1 = 0,
@@ -22,11 +22,11 @@ enum ScEDebugCounter : int {
   eCounterCommon9 = 8,
   eCounterEvalMlExpr = 9
 };
-/// How many there are.
+/// Number of counters.
 inline constexpr int kDebugCounters = 10;
 
-/// The clocks. The common ones are for whoever debugs; the last one measures
-/// the evaluation of MATLAB expressions.
+/// Clocks. Common clocks are free for debugging; the last clock measures the
+/// evaluation of MATLAB expressions.
 enum ScEDebugClock : int {
   eClockCommon1 = 0,
   eClockCommon2 = 1,
@@ -50,13 +50,14 @@ enum ScEDebugClock : int {
   eClockCommon20 = 19,
   eClockEvalMlExpr = 20
 };
-/// How many there are.
+/// Number of clocks.
 inline constexpr int kDebugClocks = 21;
 
-/// The texts are constant; a value outside its enumeration has an empty one.
+/// Names in reports. The texts are constant, empty for a value outside the
+/// enumeration.
 class HX_UTILS_API HxCDebugElements {
  public:
-  /// What the counter, or the clock, is shown as.
+  /// RETURNS: the name of the counter, or of the clock.
   static const char* getCounterComment(ScEDebugCounter counter);
   static const char* getClockComment(ScEDebugClock clock);
 };

@@ -9,10 +9,10 @@
 class HX_SystemCall;
 class HX_SystemFileIo;
 
-/// OWNERSHIP: the object owns its services until their release or the object's
-/// destruction. Copies share the services: call disown() on all copies but one
-/// before a copy is destroyed or releases a service. Assignment forgets the
-/// services of the target without a release.
+/// OWNERSHIP: the object owns the services until release or destruction. Copies
+/// share the services: exactly one copy may release them, call disown() on
+/// every other copy first. Assignment forgets the services of the target
+/// without a release.
 class HX_UTILS_API HX_SystemServiceEnv : public HX_Allocated {
  public:
   HX_SystemServiceEnv() = default;
@@ -20,14 +20,14 @@ class HX_UTILS_API HX_SystemServiceEnv : public HX_Allocated {
   HX_SystemServiceEnv& operator=(const HX_SystemServiceEnv&) = default;
   ~HX_SystemServiceEnv();
 
-  /// RETURNS: the same object on each call until its release; null without
+  /// RETURNS: the same object on every call until the release; null without
   /// memory.
   HX_SystemCall* getSystemCall();
   HX_SystemFileIo* getSystemFileIo();
 
   /// Deletes the service; the next demand creates a new one.
   void releaseSystemCall();
-  /// The same, and closes the files that are still open.
+  /// Deletes the service and closes the files still open.
   void releaseSystemFileIo();
 
   /// Forgets the services without a release.

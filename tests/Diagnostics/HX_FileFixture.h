@@ -1,5 +1,4 @@
-// Runs each test in an empty working directory of its own; a listener that
-// records.
+// An empty working directory for each test, and a recording listener.
 
 #ifndef DIAGNOSTICS_HX_FILEFIXTURE_H
 #define DIAGNOSTICS_HX_FILEFIXTURE_H
@@ -24,7 +23,7 @@ class HX_FileFixture : public HX_TestFixture {
     std::filesystem::remove_all(directory);
   }
 
-  /// The bytes of a file of the directory, "(none)" if it is not there.
+  /// The bytes of a file of the directory; "(none)" for a missing file.
   static std::string content(const char* name) {
     std::ifstream file(name, std::ios::binary);
     if (!file) return "(none)";
@@ -35,7 +34,7 @@ class HX_FileFixture : public HX_TestFixture {
   std::filesystem::path m_Previous = std::filesystem::current_path();
 };
 
-/// Installed while it lives; notes each run as "name start+duration ".
+/// Listener, installed while alive; notes each run as "name start+duration ".
 class HX_RunRecorder : public HX_TimingListener {
  public:
   HX_RunRecorder() { install(this); }

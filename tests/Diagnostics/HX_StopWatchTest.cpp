@@ -18,8 +18,8 @@ constexpr char kReport[] = "HX_StopWatch.html";
 
 class StopWatchTest : public HX_FileFixture {
  protected:
-  // Ends a measuring period, whose report cannot be opened: the next watch asks
-  // for the frequency.
+  // Ends a measuring period without a report file: the next watch asks for the
+  // frequency.
   void setFrequency(std::int64_t frequency) {
     m_Clock.frequency = frequency;
     const HX_StopWatch ended(nullptr);
@@ -74,7 +74,7 @@ const std::string kHead =
     "<th bgcolor=#E88098>subwatches (name/calls/time)</th>\n"
     "<th bgcolor=#E080A0>time witout sub-watches</th></tr>\n";
 
-// What a stop watch is, without the list of running watches.
+// Plain form of a stop watch, without the list of running watches.
 struct PlainWatch {
   std::string name;
   int id = 0, calls = 0;
@@ -83,7 +83,7 @@ struct PlainWatch {
 };
 using PlainRegistry = std::map<int, PlainWatch*>;
 
-// What the listener hears. Three ticks are a microsecond.
+// Returns the text of the listener. Three ticks are a microsecond.
 std::string stopPlain(PlainWatch& watch, std::int64_t ticks,
                       const PlainRegistry& registry) {
   if (watch.start == 0) return "";
@@ -142,7 +142,7 @@ TEST_F(StopWatchTest, RandomUseAccountsLikeThePlainForm) {
     return static_cast<unsigned>(random()) % bound;
   };
   setFrequency(3'000'000);
-  // Times a million as large would not fit: ten thousand years of ticks.
+  // Ten thousand years of ticks: a million times as much does not fit 64 bits.
   m_Clock.ticks = 3'000'001 * std::int64_t{315'360'000'000};
   std::array<std::unique_ptr<HX_StopWatch>, kSlots> watches;
   std::array<PlainWatch, kSlots> plains;
@@ -153,7 +153,7 @@ TEST_F(StopWatchTest, RandomUseAccountsLikeThePlainForm) {
 
   for (int step = 0, nextId = 0; step < 20'000; ++step) {
     SCOPED_TRACE("step " + std::to_string(step));
-    // Now and then an hour, which 32 bits of microseconds do not hold.
+    // One step in 50 lasts an hour: more microseconds than 32 bits hold.
     m_Clock.ticks += below(50) == 0 ? 12'000'000'000 : below(100);
     const std::size_t i = below(kSlots), from = below(kSlots);
     PlainWatch& plain = plains[i];
@@ -164,7 +164,7 @@ TEST_F(StopWatchTest, RandomUseAccountsLikeThePlainForm) {
       watches[i].reset();
       if (action < 8) {
         std::string name = std::to_string(step) + "%s";
-        // One character or, of 256, one too many.
+        // 1 character, or 254 to 256: the longest name has 255.
         name.resize(below(2) == 0 ? 1 : 254 + below(3), 'x');
         watches[i] = std::make_unique<HX_StopWatch>(name.c_str());
         plain = {.name = name.substr(0, 255), .id = nextId};

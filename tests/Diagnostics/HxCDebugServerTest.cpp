@@ -28,7 +28,7 @@ class DebugServerTest : public HX_FileFixture {
   }
   ~DebugServerTest() override { HX_SetCommandWindow({}); }
 
-  // A log without the header of boot(), which is checked where it matters.
+  // The log without the header of boot().
   static std::string log() { return content(kLog).substr(kHeader.size()); }
 
   HX_ManualClock m_Clock;

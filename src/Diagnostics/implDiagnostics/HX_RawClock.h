@@ -1,8 +1,8 @@
 // Raw times of the stop watches and the debug server.
 //
-// A raw time counts ticks of the high-resolution counter or, where there is
-// none, milliseconds of the process clock. Arithmetic wraps around at 64 bits:
-// an interval of up to 2^63 / 1000000 ticks is exact.
+// A raw time counts ticks of the high-resolution counter; on a machine without
+// counter, milliseconds of the process clock. Arithmetic wraps around at 64
+// bits: an interval in [0, 2^63 / 1000000) ticks is exact.
 
 #ifndef DIAGNOSTICS_IMPLDIAGNOSTICS_HX_RAWCLOCK_H
 #define DIAGNOSTICS_IMPLDIAGNOSTICS_HX_RAWCLOCK_H
@@ -29,7 +29,7 @@ inline std::int64_t wrapMultiply(std::int64_t a, std::int64_t b) {
 
 /// Asks for the ticks per second.
 /// \param[out] frequency  written when the result is true
-/// \return true if there is a counter with a positive frequency
+/// RETURNS: true for a counter with a positive frequency
 inline bool queryFrequency(std::int64_t& frequency) {
   std::int64_t found = 0;
   if (QueryPerformanceFrequency(&found) != 1 || found <= 0) return false;
@@ -37,7 +37,7 @@ inline bool queryFrequency(std::int64_t& frequency) {
   return true;
 }
 
-/// The current raw time; 0 if the counter has meanwhile gone.
+/// The current raw time; 0 if the counter has vanished.
 inline std::int64_t rawTime(bool hasCounter) {
   if (!hasCounter) return HX_ProcessClock();
   std::int64_t ticks = 0;
@@ -45,8 +45,8 @@ inline std::int64_t rawTime(bool hasCounter) {
   return ticks;
 }
 
-/// A raw interval in microseconds, cut towards zero. \p frequency, in ticks
-/// per second, must be positive where there is a counter.
+/// A raw interval in microseconds, cut towards zero.
+/// REQUIRES: \p frequency, in ticks per second, is positive if \p hasCounter.
 inline std::int64_t rawToMicroseconds(std::int64_t raw, bool hasCounter,
                                       std::int64_t frequency) {
   if (!hasCounter) return wrapMultiply(raw, 1000);
