@@ -1,8 +1,8 @@
-# What cmake --install lays down: libraries, headers, the CMake package and the
-# pkg-config file. Everything is found from where these files are, so that the
-# tree may be moved as a whole. The program and its data: host/CMakeLists.txt.
+# Installs libraries, headers, the CMake package and the pkg-config file. All
+# paths are relative to the installed files: the installed tree may be moved as a
+# whole. Program and data: host/CMakeLists.txt.
 #
-# Components: runtime (what programs load), development, codegen.
+# Components: runtime (shared objects), development, codegen.
 if(NOT hx_utils_OWN_PLATFORM)
   message(FATAL_ERROR "HX_INSTALL installs the platform layer of this tree; a "
                       "parent with a layer of its own installs both itself")
@@ -34,8 +34,8 @@ install(FILES ${PROJECT_BINARY_DIR}/hx_utils-config.cmake
               ${PROJECT_BINARY_DIR}/hx_utils-config-version.cmake
   DESTINATION ${packageFolder} COMPONENT development)
 
-# A shared library wants its macros, a static one all that it is linked with;
-# the two archives need each other. As one word, no tool reorders it.
+# Users of the shared libraries need the macros, users of the archives need both
+# archives as a group. The group is one word, because tools reorder words.
 set(pcLibraries "-L\${libdir} -lhx_utils -lhx_platform")
 set(pcDefinitions "-DHX_UTILS_SHARED -DHX_PLATFORM_SHARED")
 set(pcPrivate "")

@@ -1,11 +1,11 @@
-# Debian packages: what programs load, what compiles against it, the program.
-# script/package builds, installs, tries and removes them. They want
-# BUILD_SHARED_LIBS and the prefix /usr.
+# Debian packages: shared objects, development files, the program. Built,
+# installed, tried and removed by script/package.
+# REQUIRES: BUILD_SHARED_LIBS and the prefix /usr.
 set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME hx-utils)
 set(CPACK_PACKAGE_VERSION ${PROJECT_VERSION})
 set(CPACK_PACKAGE_CONTACT "The hx_utils maintainers <hx-utils@localhost>"
-    CACHE STRING "Who answers for the packages")
+    CACHE STRING "Maintainer of the packages")
 set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "")  # each package has its own
 set(CPACK_PACKAGING_INSTALL_PREFIX /usr)
 set(CPACK_STRIP_FILES ON)
@@ -17,8 +17,7 @@ set(CPACK_DEB_COMPONENT_INSTALL ON)
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
 set(CPACK_DEBIAN_ENABLE_COMPONENT_DEPENDS ON)
 set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
-# Our own libraries are in no installed package yet: their package is named
-# above, the others are found.
+# No installed package holds our own libraries yet: dpkg-shlibdeps looks here.
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS
     ${PROJECT_BINARY_DIR} ${PROJECT_BINARY_DIR}/platform)
@@ -33,8 +32,8 @@ configure_file(cmake/debian/changelog.in changelog @ONLY)
 execute_process(COMMAND gzip -9nkf ${PROJECT_BINARY_DIR}/changelog
                 COMMAND_ERROR_IS_FATAL ANY)
 
-# hx_package(<component> <name> <section> <summary> <text>): the text is what
-# apt shows below the summary.
+# hx_package(<component> <name> <section> <summary> <text>): apt shows the text
+# below the summary.
 macro(hx_package component name section summary text)
   string(TOUPPER ${component} upper)
   set(CPACK_DEBIAN_${upper}_PACKAGE_NAME ${name})

@@ -34,7 +34,8 @@ def error_bound(reciprocal, centre, middle):
     largest = (HALF_WIDTH + abs(centre - middle)) * reciprocal
     skew = abs(centre * reciprocal - 1)  # since the inverse is rounded
     rounding = 1 if reciprocal.numerator.bit_length() > 11 else 0
-    # What begins at 2^-10 rounds to twice the unit; the series ends there too.
+    # From 2^-10 on the unit of rounding is twice as large; the series ends at
+    # 2^-10 as well.
     excess = max(0.0, float(largest * 1024) - 1.0)
     return (float(largest * skew) * 2.0**64 + rounding
             + (1 + 20 * excess if excess > 0 else 0))

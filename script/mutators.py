@@ -23,7 +23,7 @@ TOKEN = re.compile(
 
 INTEGER = re.compile(r"(0[xX][0-9a-fA-F']+|0[bB][01']+|[0-9']+)([uUlLzZ]*)")
 
-# Operator between blanks -> what takes its place.
+# Operator between blanks -> replacements.
 BINARY = {
     "relational": {
         "<": ["<=", ">="], "<=": ["<", ">"], ">": [">=", "<="],
@@ -45,7 +45,7 @@ ASSIGNMENTS = {"=", "+=", "-=", "*=", "/=", "%=", "&=", "|=", "^=", "<<=", ">>="
 RELATIONS = set(BINARY["relational"])
 OPEN, CLOSE = {"(": ")", "[": "]", "{": "}"}, {")": "(", "]": "[", "}": "{"}
 
-# Begins no statement that could be taken out.
+# Words at the start of lines without a removable statement.
 NO_STATEMENT = set(
     """alignas auto bool break case catch char class const consteval constexpr
     continue default delete do double else enum explicit extern float for friend
@@ -91,7 +91,7 @@ class Mutant:
         return " ".join(line.split())
 
     def mutated(self):
-        # As many lines as before: checks report where they stand.
+        # The number of lines stays, because checks report line numbers.
         lines = self.source.count("\n", self.start, self.end) - self.text.count("\n")
         return (
             self.source[: self.start] + self.text + "\n" * lines

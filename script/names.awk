@@ -1,12 +1,12 @@
-# Reads sources and headers, from the root of the tree, and prints what is not
-# called as it should be; exit code 1 if there is anything.
+# Checks names of files, guards and classes. Prints one line per wrong name;
+# exit code 1 if a line was printed. Runs in the root of the tree.
 #
 #   awk -f script/names.awk src/FLAG.h ...
 #
-# - A file that is included with quotes exists by that very name, below src/,
-#   tests/, bench/ or the root, or beside who includes it.
+# - A file included with quotes exists under exactly this name, below src/,
+#   tests/, bench/ or the root, or beside the including file.
 # - The guard of a header is its include path in capitals.
-# - A header of src/ that defines a class defines one, and is named after it.
+# - A header of src/ defines at most one class and is named after the class.
 
 function report(text) {
   print FILENAME ":" FNR ": " text
@@ -32,7 +32,7 @@ FNR == 1 {
   gsub(/[^A-Z0-9]/, "_", wanted)
 }
 
-# A header has been read to its end.
+# At the end of a header.
 function finish() {
   if (header != "" && guard != "defined") {
     print header ": the guard is not " wanted

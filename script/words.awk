@@ -1,5 +1,5 @@
-# Counts the pointers in comments and documents: words that stand for a noun
-# instead of saying the noun. A reader must look back for each of them.
+# Counts the pointers in comments and documents: words in place of a noun. For
+# each pointer a reader must look back.
 #
 #   awk -f script/words.awk LIMIT FILE...        one line per file over LIMIT
 #   awk -v TOTAL=src -f script/words.awk LIMIT FILE...   all files as one text

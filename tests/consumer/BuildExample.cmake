@@ -1,4 +1,4 @@
-# Builds and runs the generator of docs/example and compares what it prints.
+# Builds and runs the generator of docs/example and compares the output.
 #
 #   cmake -DSOURCE=<tree> -DWORK=<folder> -DGENERATOR=<name> -DCOMPILER=<c++>
 #         -P BuildExample.cmake

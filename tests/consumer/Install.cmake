@@ -1,6 +1,6 @@
-# Installs the library, moves what was installed to PREFIX, and looks for
-# paths of this machine in it. The static library is that of the build tree
-# TREE, the shared one is built first.
+# Installs the library, moves the installed tree to PREFIX, and looks for paths
+# of this machine in the tree. The static library comes from the build tree TREE;
+# the shared library is built first.
 cmake_minimum_required(VERSION 3.25)
 if(KIND STREQUAL "shared")
   set(TREE ${WORK}/build)
@@ -19,7 +19,8 @@ file(RENAME ${WORK}/installed ${PREFIX})
 
 file(GLOB_RECURSE files ${PREFIX}/*)
 foreach(file IN LISTS files)
-  # What the debugger reads may name the sources, and only this build has it.
+  # Debug information may name the sources; only this build has debug
+  # information.
   if(KIND STREQUAL "static" AND file MATCHES "\\.a$|/hx_codegen$")
     continue()
   endif()

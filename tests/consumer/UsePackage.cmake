@@ -1,5 +1,5 @@
-# Builds the project package/ with what is installed in PREFIX. PROGRAM says
-# whether the program is there too.
+# Builds the project package/ with the library installed in PREFIX. PROGRAM:
+# whether the program is installed too.
 set(folder ${WORK}/package)
 foreach(step IN ITEMS
     "--fresh;-G;${GENERATOR};-S;${CMAKE_CURRENT_LIST_DIR}/package;-B;${folder};-DCMAKE_CXX_COMPILER=${COMPILER};-DCMAKE_PREFIX_PATH=${PREFIX};-DPROGRAM=${PROGRAM};-DMODEL=${SOURCE}/host/models/cruise_control.json"

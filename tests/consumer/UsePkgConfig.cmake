@@ -1,4 +1,4 @@
-# Builds consumer.cpp as pkg-config says, with what is installed in PREFIX.
+# Builds consumer.cpp with the flags of pkg-config and the library in PREFIX.
 set(ENV{PKG_CONFIG_PATH} ${PREFIX}/${LIBDIR}/pkgconfig)
 execute_process(COMMAND pkg-config --cflags --libs "hx_utils >= 1.0"
                 COMMAND_ERROR_IS_FATAL ANY OUTPUT_VARIABLE flags)

@@ -2,8 +2,8 @@
 #
 #   cmake -DROOT=<tree> -DTABLE=<table> -P CheckIncludes.cmake
 #
-# Prints one line per violation and fails if there was one. The form of the
-# table is told in include_edges.txt.
+# Prints one line per violation and fails if a line was printed.
+# include_edges.txt describes the form of the table.
 cmake_minimum_required(VERSION 3.25)
 get_filename_component(ROOT ${ROOT} ABSOLUTE)
 
@@ -14,7 +14,7 @@ function(report text)
   set(violations ${count} PARENT_SCOPE)
 endfunction()
 
-# The folder that a path below src/ or the root belongs to.
+# Returns the folder of a path below src/ or the root.
 function(folder_of path result)
   if(path MATCHES "^(platform|host)/[^/]+/")
     string(REGEX MATCH "^[^/]+/[^/]+" folder "${path}")
@@ -46,7 +46,7 @@ foreach(line IN LISTS lines)
   endif()
 endforeach()
 
-# Reads the includes and refuses those that the table does not permit.
+# Reads the includes and refuses includes missing in the table.
 file(GLOB_RECURSE files RELATIVE ${ROOT}
      ${ROOT}/src/*.h ${ROOT}/src/*.cpp
      ${ROOT}/platform/*.h ${ROOT}/platform/*.cpp
@@ -79,7 +79,7 @@ foreach(file IN LISTS files)
   endforeach()
 endforeach()
 
-# The table says no more than the tree needs, and gives its reasons.
+# Refuses unused edges, and upward edges without a reason.
 foreach(edge IN LISTS edges)
   string(REPLACE ">" ";" ends ${edge})
   list(GET ends 0 from)

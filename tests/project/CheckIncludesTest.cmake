@@ -1,5 +1,5 @@
-# Proves that CheckIncludes.cmake finds each kind of fault in a tree of three
-# files, and nothing in the sound one.
+# Runs CheckIncludes.cmake on a sound tree of three files and on trees with one
+# fault of each kind.
 #
 #   cmake -DCHECKER=<CheckIncludes.cmake> -DWORK=<folder> -P CheckIncludesTest.cmake
 cmake_minimum_required(VERSION 3.25)
