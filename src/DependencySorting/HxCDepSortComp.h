@@ -1,4 +1,4 @@
-// A criterion by which items without dependencies are put in order.
+// Criterion for the order of items without dependencies.
 //
 //   class BySize : public HxCDepSortComp {
 //     int compare(HxCDepSortNode* a, HxCDepSortNode* b) override {
@@ -14,7 +14,7 @@
 
 class HxCDepSortNode;
 
-/// Callers derive one class per criterion and own the objects.
+/// Callers derive one class per criterion. OWNERSHIP: the caller.
 class HX_UTILS_API HxCDepSortComp : public HX_Allocated {
  public:
   HxCDepSortComp() = default;
@@ -22,11 +22,12 @@ class HX_UTILS_API HxCDepSortComp : public HX_Allocated {
   HxCDepSortComp& operator=(const HxCDepSortComp&) = default;
   virtual ~HxCDepSortComp();
 
-  /// Negative if \p a goes before \p b, 0 if the criterion does not tell them
-  /// apart, positive if \p a goes after \p b. The sorter never passes null.
+  /// RETURNS: negative if \p a goes before \p b, 0 for equals, positive if \p a
+  /// goes after \p b. The sorter never passes null.
   ///
-  /// Must be a weak order: one that contradicts itself gives some order of the
-  /// same nodes. How often it is called is not promised.
+  /// REQUIRES: a weak order. A criterion that contradicts itself, or changes
+  /// its answers, gives some order of the same nodes. The number of calls is
+  /// not promised.
   virtual int compare(HxCDepSortNode* a, HxCDepSortNode* b) = 0;
 };
 

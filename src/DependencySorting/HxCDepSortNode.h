@@ -1,4 +1,4 @@
-// An item that can be sorted by dependencies: the base of all sortable items.
+// Base class of items sorted by dependencies.
 //
 //   class HxCSdtNode : public HxCDepSortNode {
 //    public:
@@ -19,33 +19,32 @@ class HxCSdtNode;
 class HxCSsNode;
 class KyCXString;
 
-/// Owned by the caller, who derives a class for each kind of item.
+/// Callers derive a class per kind of item. OWNERSHIP: the caller.
 class HX_UTILS_API HxCDepSortNode : public HX_Allocated {
  public:
   /// The ordinal number is -1.
   HxCDepSortNode() = default;
-  /// Copies share the ordinal number of their source.
+  /// A copy has the ordinal number of the original.
   HxCDepSortNode(const HxCDepSortNode&) = default;
   HxCDepSortNode& operator=(const HxCDepSortNode&) = default;
   virtual ~HxCDepSortNode();
 
-  /// This node as a variable; null here.
+  /// This node as a variable; null in the base class.
   virtual HxCSsNode* isSsNode();
-  /// This node as a data type; null here.
+  /// This node as a data type; null in the base class.
   virtual HxCSdtNode* isSdtNode();
-  /// The name of the item: it orders items that become free together and
-  /// stands in the report of a cycle. The text must stay valid and unchanged
-  /// while a sort runs.
+  /// Name of the item, for the order of items that become free together and
+  /// for the report of a cycle. The text must stay valid and unchanged during a
+  /// sort.
   virtual const KyCXString& getName() = 0;
 
-  /// A number for the caller's own use; the sorter neither reads nor writes it.
+  /// Number for the use of the caller alone.
   int getOrdNr() const { return m_OrdNr; }
   void setOrdNr(int ordNr) { m_OrdNr = ordNr; }
 
-  /// The current criterion of leda::compare() below: null at first, after a
-  /// sort by criteria the last one that had two or more nodes to sort. The
-  /// runs of nodes that a criterion leaves together are sorted by the next one
-  /// from the front to the back.
+  /// Current criterion of leda::compare() below: null at first, after a sort
+  /// the last criterion that had two or more nodes to sort. Groups of equals
+  /// are sorted by the next criterion from the front to the back.
   static HxCDepSortComp* getComp();
   /// Not owned. One thread at a time may sort or set the criterion.
   static void setComp(HxCDepSortComp* comp);
@@ -58,9 +57,9 @@ class HX_UTILS_API HxCDepSortNode : public HX_Allocated {
 
 namespace leda {
 
-/// Orders node pointers in the caller's own containers by the current
-/// criterion, which must not be null. A specialisation, so that the containers
-/// find it whichever header comes first.
+/// Orders node pointers in containers of the caller by the current criterion.
+/// REQUIRES: the current criterion is not null. A specialisation, because then
+/// the order of includes does not matter.
 template <>
 HX_UTILS_API int compare(HxCDepSortNode* const& a, HxCDepSortNode* const& b);
 

@@ -128,7 +128,7 @@ bool HxCNameSpace::hasScope() const {
   return HX_Assert(m_pScope != nullptr, kErrorCode);
 }
 
-// The server itself reports that it is down.
+// The server reports by itself that the server is down.
 bool HxCNameSpace::keyOf(const KyCXString& s, int& key) const {
   return HX_Assert(m_pIdServer != nullptr, kErrorCode) &&
          m_pIdServer->findOrAdd(s, key);

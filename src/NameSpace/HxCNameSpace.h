@@ -1,11 +1,10 @@
-// Which names are taken in nested scopes of the generated code, and which
-// symbol each stands for.
+// Names taken in nested scopes of the generated code, with a symbol per name.
 //
 //   HxCNameSpace file(&ids), body(&ids);
 //   auto* root = file.newEnv();
 //   body.newScope(root);
 //   body.defineString("i", symbol);
-//   file.stringInEnv("i");     // true: an inner scope uses it
+//   file.stringInEnv("i");     // true: taken in an inner scope
 //   file.stringInScope("i");   // false
 //   delete root;               // the scopes outlive the handles
 
@@ -21,40 +20,42 @@ class HxCSymbol;
 class HxCXStringIdServer;
 class KyCXString;
 
-/// A handle to one scope, its current scope. Copies refer to the same scope;
-/// destruction leaves the scopes alone. Their user deletes the root of a tree
-/// once no handle refers into it (see HxCObjectEnvironment).
+/// Handle to one scope, the current scope. Copies refer to the same scope.
 ///
-/// A key is the id that the server gives to a name; each operation with a
-/// string adds that string to the server. The server is not owned and must be
-/// up.
+/// OWNERSHIP: a handle owns neither scopes nor server. The user deletes the
+/// root of a tree once no handle refers to a scope of the tree (see
+/// HxCObjectEnvironment).
 ///
-/// Without a current scope, all but the first group of operations and
-/// createIdn() raise an internal assertion and give false; so do operations
-/// with a string while the server is null, down or out of memory (which raises
-/// no assertion).
+/// A key is the id of a name in the server. Every operation with a string adds
+/// the string to the server.
+///
+/// FAILURE: without a current scope all operations below getDebugIndex(), but
+/// not createIdn(), raise an internal assertion and return false. So do
+/// operations with a string while the server is null or down. Without memory
+/// an operation returns false, or null, and raises no assertion.
 class HX_UTILS_API HxCNameSpace : public HX_Allocated {
  public:
-  /// A scope as this class makes it; its values are owned by it.
+  /// A scope owns the data of its entries.
   using Scope = HxCObjectEnvironment<HxCSmbScopeData*>;
 
-  /// The handles constructed from a server so far; copies do not count.
+  /// Number of handles constructed from a server; copies do not count.
   static int sm_ObjectCount;
 
   /// A handle without a current scope.
   explicit HxCNameSpace(HxCXStringIdServer* idServer);
 
-  /// Makes a new root the current scope. A handle that has a current scope
-  /// keeps it, after an internal assertion.
-  /// \return the current scope; null if there was no memory
+  /// Makes a new root the current scope. A handle with a current scope keeps
+  /// its scope, after an internal assertion.
+  /// RETURNS: the current scope; null without memory.
   Scope* newEnv();
 
-  /// Makes a new scope the current one: the last child of \p parent or, for
-  /// null, a root. A handle that has a current scope keeps it and makes none.
-  /// \return the current scope; null if there was no memory
+  /// Makes a new scope the current scope: the last child of \p parent or, for
+  /// null, a root. A handle with a current scope keeps its scope and makes no
+  /// new scope.
+  /// RETURNS: the current scope; null without memory.
   Scope* newScope(Scope* parent);
 
-  /// The current scope, null if the handle has none.
+  /// The current scope; null for an empty handle.
   Scope* getScope() const { return m_pScope; }
   /// Null empties the handle.
   void setScope(Scope* scope) { m_pScope = scope; }
@@ -66,39 +67,38 @@ class HX_UTILS_API HxCNameSpace : public HX_Allocated {
   /// \param[out] key  the id of \p s; written unless the server fails
   void createIdn(const KyCXString& s, int& key);
 
-  /// Define a name in the current scope; without a symbol it has no scope
+  /// Define a name in the current scope; a name without a symbol has no scope
   /// data. Names of scopes around and inside do not stand in the way.
-  /// \return false, with nothing changed, if the current scope holds the name
-  ///         already or there is no memory
+  /// RETURNS: false, with nothing changed, if the current scope holds the name
+  /// already, or without memory.
   bool defineIdn(int key);
   bool defineIdn(int key, HxCSymbol* symbol);
   bool defineString(const KyCXString& s);
   bool defineString(const KyCXString& s, HxCSymbol* symbol);
 
-  /// Whether the current scope itself holds a name.
+  /// True if the current scope itself holds the name.
   bool keyInScope(int key);
   bool stringInScope(const KyCXString& s);
-  /// \param[out] symbol  written when the result is true
-  /// \return false also for a name defined without a symbol
+  /// \param[out] symbol  written if the result is true
+  /// RETURNS: false also for a name defined without a symbol.
   bool stringInScope(const KyCXString& s, HxCSymbol*& symbol);
 
-  /// Whether a name is taken in the environment of the current scope: there,
-  /// around it or inside it.
+  /// True if the name is taken in the current scope, in a scope around or in a
+  /// scope inside.
   bool keyInEnv(int key);
   bool stringInEnv(const KyCXString& s);
-  /// \param[out] data  what HxCObjectEnvironment::lookupInEnv() gives, owned by
-  ///                   its scope; null when the result is false
+  /// \param[out] data  result of HxCObjectEnvironment::lookupInEnv(), owned by
+  ///                   its scope; null if the result is false
   bool keyInEnv(int key, HxCSmbScopeData*& data);
   bool stringInEnv(const KyCXString& s, HxCSmbScopeData*& data);
-  /// \param[out] symbol  the symbol of that data; written when the result is
-  ///                     true
+  /// \param[out] symbol  symbol of the data; written if the result is true
   bool keyInEnv(int key, HxCSymbol*& symbol);
   bool stringInEnv(const KyCXString& s, HxCSymbol*& symbol);
 
-  /// Takes a name out of the current scope and destroys its scope data; the
+  /// Removes a name from the current scope and deletes its scope data; the
   /// symbol stays.
-  /// \return false, with nothing changed, if the current scope itself does not
-  ///         hold the name
+  /// RETURNS: false, with nothing changed, if the current scope itself does not
+  /// hold the name.
   bool remove(const KyCXString& s);
 
  private:

@@ -1,19 +1,38 @@
-// One scope in a tree of nested scopes: which keys it holds, and with what
-// value.
+// One scope in a tree of nested scopes: its keys, and a value per key.
 //
 // A key is taken in the environment of a scope if the scope itself, a scope
-// around it or a scope inside it holds the key; scopes beside it do not count.
+// around or a scope inside holds the key. Scopes beside do not count.
 //
 //   auto* file = new HxCObjectEnvironment<HxCSmbScopeData*>(nullptr);
 //   auto* body = new HxCObjectEnvironment<HxCSmbScopeData*>(file);
 //   file->addChild(body);
 //   body->defineKey(7, nullptr);
-//   file->containsInEnv(7);   // true: inside it
-//   delete file;              // and body with it
+//   file->containsInEnv(7);   // true: inside file
+//   delete file;              // deletes body too
 //
-// Each scope counts, by key, the definitions below it, so that a search skips
-// the subtrees without the key: that a root misses costs two lookups, however
-// many scopes it has. The counts of a definition go to the scopes around it.
+// Problem: a name for a file must be absent from every function and block of
+// the file. Plain form: walk over all scopes below, one lookup each, 1000
+// lookups for 1000 scopes.
+//
+// Idea: every scope counts, by key, the definitions in all scopes below. A
+// count of 0 ends a search without visiting the children; a Bloom filter
+// (HX_BloomFilter) answers most lookups of the counts. So a lookup that fails
+// at the root costs two hash lookups, not one per scope.
+//
+// Example, scopes file > f > block, file > g:
+//   block->defineKey(7), g->defineKey(7), g->defineKey(8)
+//   counts of file {7: 2, 8: 1}, of f {7: 1}, of g and block {}
+//   f->containsInEnv(8): absent in f and file, count 0 in f: false
+//
+// Invariants:
+// 1. While m_HasExactCounts, m_Below[k] of a scope of the 16 outermost levels
+//    is the number of scopes below that hold k.
+// 2. Counts travel upward along parents that list their child. Listing a scope
+//    twice, or beside its parent, clears m_HasExactCounts of the listing scope
+//    and of all scopes around; searches from there visit every scope below.
+// 3. A scope without exact counts has no listing parent with exact counts.
+//
+// Test: NameSpaceTest.SearchesAgreeWithThePlainWalkAndTreesReturnAllMemory.
 
 #ifndef NAMESPACE_HXCOBJECTENVIRONMENT_H
 #define NAMESPACE_HXCOBJECTENVIRONMENT_H
@@ -25,63 +44,64 @@
 #include "implContainers/HX_HashTable.h"
 #include "implContainers/HX_PlainArray.h"
 
-/// \tparam T  pointer to the values, which are created with new; null stands
-///            for a key without a value.
+/// \tparam T  pointer to values created with new; null is a key without value
 ///
-/// Ownership: destruction destroys the values of its entries and the children,
-/// with their entries and children. A child belongs to the scope that added it
-/// first, so a scope listed twice is destroyed once. Only roots, scopes that
-/// nobody added, are deleted by their users. The scope around is not owned.
+/// OWNERSHIP: the destructor deletes the values of the entries and the children
+/// with all below. A child belongs to the scope that added the child first, so
+/// a scope listed twice is deleted once. Users delete roots only: scopes that
+/// no scope added. The parent is not owned.
 ///
-/// A search below and the destruction call themselves once per level of nesting
-/// and need about 100 bytes of stack for each: ten thousand levels fit into a
-/// megabyte.
+/// Memory comes from HX_Allocate(); without memory no operation throws.
+///
+/// COST: a definition updates up to 16 counts. A search below and the
+/// destructor call themselves once per level of nesting, with about 100 bytes
+/// of stack per call: ten thousand levels fit into a megabyte.
 template <class T>
 class HxCObjectEnvironment : public HX_Allocated {
   static_assert(std::is_pointer_v<T>);
 
  public:
-  /// An empty scope inside \p parent, null for a root. The parent does not
-  /// know it before addChild().
+  /// An empty scope inside \p parent, null for a root. addChild() tells the
+  /// parent of the new scope.
   explicit HxCObjectEnvironment(HxCObjectEnvironment* parent)
       : m_pParent(parent) {}
   HxCObjectEnvironment(const HxCObjectEnvironment&) = delete;
   HxCObjectEnvironment& operator=(const HxCObjectEnvironment&) = delete;
-  /// Destroys the values, and the children that this scope owns.
+  /// Deletes the values and the owned children.
   ~HxCObjectEnvironment();
 
-  /// Appends \p scope, created with new, to the children. The lists of
-  /// children must not form a cycle.
+  /// Appends \p scope, created with new, to the children.
+  /// REQUIRES: the lists of children form no cycle.
   ///
-  /// A scope may be added that has another parent or none, or that was added
-  /// before; then searches from here and from the scopes around here visit
-  /// every scope below, one by one.
-  /// \return false, with nothing changed, for null or if there is no memory
+  /// \p scope may have another parent, or no parent, or may have been added
+  /// before. Searches from here and from the scopes around then visit all
+  /// scopes below one by one.
+  /// RETURNS: false, with nothing changed, for null or without memory.
   bool addChild(HxCObjectEnvironment* scope);
 
-  /// Enters \p key, whose value belongs to this scope from then on.
-  /// \return false, with nothing changed and \p value left to the caller, if
-  ///         this scope holds \p key already or there is no memory
+  /// Enters \p key.
+  /// OWNERSHIP: \p value belongs to this scope if the result is true.
+  /// RETURNS: false, with nothing changed, if this very scope holds \p key
+  /// already, or without memory.
   bool defineKey(int key, T value);
 
   /// True if this very scope holds \p key.
   bool containsInScope(int key) const { return m_Entries.find(key) != nullptr; }
-  /// The value of \p key in this scope; null if it has none or is not here.
+  /// RETURNS: the value of \p key in this very scope; null for an absent key.
   T lookupInScope(int key) const;
 
   /// True if this scope, a scope around it or a scope below it holds \p key.
   bool containsInEnv(int key) const;
 
-  /// The value of \p key in the first scope that holds it: this scope, then
-  /// those around it from the inside out, then those below it, depth first in
-  /// the order of addChild(). Null if no scope holds it.
-  ///
-  /// A null value found here or around, or in a child, is the result; one found
-  /// deeper ends only the search among its siblings.
+  /// Searches this scope, then the scopes around from the inside out, then the
+  /// scopes below, depth first in the order of addChild().
+  /// RETURNS: the value of \p key in the first scope with \p key; null if no
+  /// scope holds \p key. A null value ends the search in this scope, in a scope
+  /// around and in a child; deeper it ends the search among its siblings only.
   T lookupInEnv(int key) const;
 
-  /// Takes \p key out of this scope, if it is there; its value, if any, goes
-  /// back to the caller.
+  /// Removes \p key from this scope; nothing happens for an absent key.
+  /// OWNERSHIP: the value goes back to the caller.
   void removeKey(int key);
 
  private:
@@ -91,8 +111,8 @@ class HxCObjectEnvironment : public HX_Allocated {
   };
   struct Nothing {};
 
-  // Scopes nested deeper keep no counts, which bounds the cost of a definition:
-  // C90 guarantees 15 levels of blocks (5.2.4.1).
+  // Deeper scopes keep no counts, which bounds the cost of a definition. C90
+  // guarantees 15 levels of blocks (5.2.4.1).
   static constexpr int kCountedLevels = 16;
 
   enum Wanted { eAnyEntry, eValue };
@@ -113,13 +133,12 @@ class HxCObjectEnvironment : public HX_Allocated {
   HxCObjectEnvironment* m_pParent;
   HX_PlainArray<Child> m_Children;  // in the order of addChild()
   HX_HashTable<int, T> m_Entries;
-  // The definitions of a key in all scopes below, while counted. A count
-  // travels up only along parents that list their child.
+  // Per key the number of definitions in all scopes below (invariant 1).
   HX_HashTable<int, Nothing> m_Below;
   HX_BloomFilter m_BelowFilter;
   int m_Level = 0;  // listing parents above
   bool m_IsListedByParent = false;
-  bool m_HasExactCounts = true;  // false here: false in all listing parents
+  bool m_HasExactCounts = true;
   bool m_HasOwner = false;
   bool m_IsDying = false;
 };
@@ -185,7 +204,7 @@ void HxCObjectEnvironment<T>::removeKey(int key) {
   countAround(key, -1);
 }
 
-// From here outward. \p value is written when the result is true.
+// From this scope outward. Writes \p value if the result is true.
 template <class T>
 bool HxCObjectEnvironment<T>::searchAround(int key, T& value) const {
   for (const auto* scope = this; scope != nullptr; scope = scope->m_pParent) {
@@ -215,7 +234,7 @@ bool HxCObjectEnvironment<T>::searchBelow(int key, Wanted wanted,
   return false;
 }
 
-// Tells the scopes around that list this one of a definition here.
+// Updates the counts of the scopes around after a definition in this scope.
 template <class T>
 void HxCObjectEnvironment<T>::countAround(int key, int change) {
   for (auto* scope = listingParent();
@@ -226,7 +245,7 @@ void HxCObjectEnvironment<T>::countAround(int key, int change) {
   }
 }
 
-// False, with nothing changed, if there is no memory.
+// RETURNS: false, with nothing changed, without memory.
 template <class T>
 bool HxCObjectEnvironment<T>::changeCount(int key, int change) {
   auto* slot = m_Below.find(key);
@@ -250,7 +269,8 @@ void HxCObjectEnvironment<T>::giveUpCounts() {
     scope->m_HasExactCounts = false;
 }
 
-// Tells the scopes around, which have just listed this one, of all it holds.
+// Updates the counts of the scopes around, new parents of this scope, by all
+// entries of this scope and all counts of the scopes below.
 template <class T>
 void HxCObjectEnvironment<T>::countAllAround() {
   m_Entries.forEach([this](const auto& slot) { countAround(slot.key, 1); });

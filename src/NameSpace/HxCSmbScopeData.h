@@ -1,4 +1,4 @@
-// What a scope stores for a name that stands for a symbol.
+// Data of a name with a symbol in a scope.
 
 #ifndef NAMESPACE_HXCSMBSCOPEDATA_H
 #define NAMESPACE_HXCSMBSCOPEDATA_H
@@ -7,18 +7,18 @@
 
 class HxCSymbol;
 
-/// A value type. The symbol is not owned; the collision count belongs to
-/// whoever makes names unique, starts at 0 and has no bounds.
+/// Value type. The symbol is not owned. The collision count serves the caller
+/// who makes names unique, starts at 0 and has no bounds.
 class HxCSmbScopeData : public HX_Allocated {
  public:
   /// An entry for \p symbol, which may be null; no collisions.
   explicit HxCSmbScopeData(HxCSymbol* symbol) : m_pSymbol(symbol) {}
 
-  /// The symbol; null if it has none.
+  /// The symbol; may be null.
   HxCSymbol* getSymbol() const { return m_pSymbol; }
   void setSymbol(HxCSymbol* symbol) { m_pSymbol = symbol; }
 
-  /// How many names have collided with this one, as its user counts.
+  /// Number of names that collided with this name, counted by the caller.
   int getCollisionCount() const { return m_CollisionCount; }
   void setCollisionCount(int count) { m_CollisionCount = count; }
   void incrCollisionCount() { ++m_CollisionCount; }

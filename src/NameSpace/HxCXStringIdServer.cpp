@@ -1,3 +1,26 @@
+// Problem: one id per distinct text, where the id must be bucket + 1024 * k for
+// the k-th text of the bucket, and names of a model often share a bucket: the
+// character sum of x12 and x21 is the same.
+//
+// Plain form: 1024 lists, searched one by one; n names of one sum take n^2 / 2
+// comparisons of texts.
+//
+// Idea: two structures over the same texts.
+//   index    hash table, hash of the text -> id: finds the id of a text
+//   buckets  per bucket an array of texts in the order of arrival: finds the
+//            text of an id, and its size gives the next id
+//
+// Example: "ab", "ba", "c" on a fresh server
+//   bucket 195: "ab" "ba"   ids 195, 1219
+//   bucket 99:  "c"         id 99
+//   getString(1219): bucket 1219 % 1024 = 195, arrival 1219 / 1024 = 1
+//
+// Invariants: 1. buckets[b][k] is the text of id b + 1024 * k, and the index
+// holds the id. 2. Every text is in one bucket. 3. A text stays at its address
+// (HX_TextArena) until shutdown().
+//
+// Test: StringIdServerTest.AgreesWithPlainBuckets.
+
 #include "NameSpace/HxCXStringIdServer.h"
 
 #include <cstring>
@@ -68,7 +91,7 @@ unsigned HxCXStringIdServer::bucketOf(const char* text, std::size_t length) {
   return sum % kBucketCount;
 }
 
-// False, with nothing changed, if there is no memory.
+// RETURNS: false, with nothing changed, without memory.
 bool HxCXStringIdServer::add(int hash, const char* text, std::size_t length,
                              int& id) {
   const unsigned number = bucketOf(text, length);

@@ -1,8 +1,8 @@
-// Interns strings: one integer id per distinct string.
+// String interning: one integer id per distinct string.
 //
-// Scopes key their names by these ids, so that a lookup in a scope compares
-// integers. An id carries its bucket, the character sum of the string, in its
-// low ten bits and the string's place of arrival in the bucket above them.
+// Scopes key their names by ids, so a lookup in a scope compares integers. The
+// low ten bits of an id are the bucket of the string: the sum of its
+// characters. The bits above count the strings that the bucket held before.
 //
 //   HxCXStringIdServer ids;
 //   ids.boot();
@@ -22,44 +22,46 @@
 
 class KyCXString;
 
-/// Down after construction. A copy shares the strings of its original: boot
-/// before copying, and shut only one of the two down. Destruction does not
-/// shut down.
+/// Down after construction.
 ///
-/// Strings are told apart by their 8-bit form up to its first zero: two strings
-/// that differ only in characters shown as '?' share an id. A bucket counts
-/// four million strings.
+/// OWNERSHIP: shutdown() frees all strings, the destructor frees nothing. A
+/// copy shares the strings of the original: boot before copying, and shut down
+/// only the original or the copy.
+///
+/// Strings with equal 8-bit forms up to the first zero share an id, also
+/// strings that differ only in characters shown as '?'. A bucket counts four
+/// million strings. Without memory no operation throws.
 class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
  public:
   /// Makes the server ready; a server that is up keeps its strings.
-  /// \return true, even if there was no memory and the server stays down
+  /// RETURNS: true, even if the server stays down for want of memory.
   bool boot();
 
-  /// Forgets all strings; ids start afresh after the next boot(). A server
-  /// that is down stays down.
-  /// \return true
+  /// Forgets all strings; ids start afresh after the next boot().
+  /// RETURNS: true, also for a server that is down.
   bool shutdown();
 
   /// False before boot() and after shutdown().
   bool isUp() const { return m_pTable != nullptr; }
 
-  /// The id of \p s, which is added if it is new: its bucket (the sum of its
-  /// characters as signed values, modulo 1024, not negative) plus 1024 for each
-  /// string that the bucket held before. The empty string has id 0 and is not
-  /// stored; another string may get id 0 as well.
+  /// Adds \p s if \p s is new. The id is the bucket (the sum of the characters
+  /// as signed values, modulo 1024, in [0, 1023]) plus 1024 times the number of
+  /// strings that the bucket held before. The empty string has id 0 and is not
+  /// stored; a stored string may have id 0 as well.
   ///
-  /// 0 if the server is down (internal assertion) or has no memory left.
+  /// RETURNS: the id; 0 if the server is down or \p s is null (internal
+  /// assertion), or without memory.
   int getId(const KyCXString& s);
   int getId(const KyCXString* s);
 
-  /// getId() for callers that must tell its failures from the id 0.
+  /// getId() for callers who must tell a failure from the id 0.
   /// \param[out] id  written on success
-  /// \return false where getId() fails
+  /// RETURNS: false where getId() fails.
   bool findOrAdd(const KyCXString& s, int& id);
 
-  /// The 8-bit form of the string with \p id, null if there is none. Valid
-  /// until shutdown(), however many strings are added. Null after an internal
-  /// assertion if the server is down.
+  /// RETURNS: the 8-bit form of the string with \p id, valid until shutdown();
+  /// null for an unknown id; null after an internal assertion if the server is
+  /// down.
   const char* getString(int id) const {
     if (m_pTable == nullptr) return refuseText();
     const unsigned bits = static_cast<unsigned>(id);
@@ -73,7 +75,7 @@ class HX_UTILS_API HxCXStringIdServer : public HX_Allocated {
 
   using Bucket = HX_PlainArray<const char*>;  // in the order of arrival
 
-  // The part of the table that getString() reads.
+  // Part of the table for getString().
   struct Buckets : HX_Allocated {
     Bucket buckets[kBucketCount];
   };

@@ -4,10 +4,10 @@
 //   ...
 //   pHXMemory->freeMemBlock(text);
 //
-// Every string returned as char* is a new block of the memory controller and
-// belongs to the caller. The C heap never stands in for the controller: the
-// host must have installed pHXMemory before the first call that returns one.
-// Where the controller has no memory, the result is null.
+// OWNERSHIP: every string returned as char* is a new block of the memory
+// controller and belongs to the caller. Null if the controller has no memory.
+// REQUIRES of functions that return char*: pHXMemory is installed. The C heap
+// never stands in for the controller.
 
 #ifndef STRINGS_STR_STRINGSUPPORT_H
 #define STRINGS_STR_STRINGSUPPORT_H
@@ -36,18 +36,20 @@ HX_UTILS_API char* STR_Concatenate3Strings(const char* a, const char* b,
                                            const char* c);
 
 /// All arguments in order: const char* each, ended by a null const char*.
-/// \p first alone may be null without ending the list; null if it is and no
-/// other string follows. Meant for short lists: each argument copies the
-/// result so far.
+/// A null \p first does not end the list; null if \p first is null and no
+/// string follows. COST: every argument copies the result so far.
 HX_UTILS_API char* STR_ConcatenateNStrings(const char* first, ...);
 
 /// Decimal digits, after '-' for a negative value.
 HX_UTILS_API char* STR_IntToString(int value);
 
 /// Decimal with \p precision digits after the point, no point for 0, rounded as
-/// printf does, whatever the locale; a negative precision counts as 6. The
-/// infinities and NaN read "inf", "-inf", "nan" and "-nan". Every finite value
-/// is written out in full; null if that takes more than INT_MAX characters.
+/// printf does, with a point in every locale; a negative precision counts as 6.
+/// The infinities and NaN read "inf", "-inf", "nan" and "-nan". Every finite
+/// value is written in full; null for more than INT_MAX characters.
+///
+/// The block of a value with a 32-bit integer part has digits + precision + 3
+/// bytes, one more for a negative value, where digits counts the integer part.
 HX_UTILS_API char* STR_DoubleToString(double value, int precision);
 
 /// A copy of \p s; null for null.
@@ -56,8 +58,8 @@ HX_UTILS_API char* STR_DuplicateString(const char* s);
 /// True for null and for a string of length 0.
 HX_UTILS_API bool STR_IsNullOrEmpty(const char* s);
 
-/// Two nulls are equal; null and a string, even an empty one, are not. Any
-/// \p mode but STR_CASE_SENSITIVE ignores the case of ASCII letters.
+/// Two nulls are equal; null and any string, even "", are not. Every \p mode
+/// but STR_CASE_SENSITIVE ignores the case of ASCII letters.
 HX_UTILS_API bool STR_StringsAreEqual(const char* a, const char* b,
                                       STR_case_sensitive_etp mode);
 
@@ -67,9 +69,9 @@ HX_UTILS_API bool STR_IsValidCharForCIdentifier(char ch);
 
 /// Writes \p src to \p dst with the characters that \p mode selects replaced.
 ///
-/// STR_INVALID_TO_UNDERSCORE replaces what may not stand in a C identifier, a
-/// leading digit may; every other mode replaces line feed, tab and blank, and
-/// a \p mode that is not in the enumeration writes blanks.
+/// STR_INVALID_TO_UNDERSCORE replaces characters not allowed in a C identifier;
+/// a leading digit stays. Every other mode replaces line feed, tab and blank;
+/// a \p mode outside the enumeration writes blanks.
 /// \param[out] dst  as many bytes as \p src has, the final zero included; may
 ///   be \p src itself. Neither may be null.
 HX_UTILS_API void STR_ProcessString(char* dst, const char* src,

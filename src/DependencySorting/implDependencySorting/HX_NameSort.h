@@ -41,11 +41,11 @@ class HX_NameSort {
   const HX_Vector<HxCDepSortNode*>& m_Nodes;
   HX_Vector<Entry> m_Entries;  // ascending by name
   HX_Vector<Entry> m_Buffer;   // of the merge sort
-  // Entries with equal names form a group, whose number is the index of its
-  // first entry.
+  // Entries with equal names form a group; the index of the first entry is the
+  // number of the group.
   HX_Vector<int> m_GroupOfEntry;
   HX_Vector<int> m_GroupAt;    // by position in the batch; moves along
-  HX_Vector<int> m_Positions;  // one heap per group, smallest position in front
+  HX_Vector<int> m_Positions;  // a heap per group, smallest position in front
   HX_Vector<int> m_HeapEnd;    // by group
   HX_Vector<int> m_Batch;      // copy of the batch
 };
