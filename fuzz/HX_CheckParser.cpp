@@ -19,12 +19,13 @@ std::string trim(std::string text, const std::string& chars, int mode = 2) {
   return text;
 }
 
-// No place for an empty text.
+// RETURNS: npos for an empty text.
 std::size_t find(const std::string& in, const std::string& text) {
   return text.empty() ? in.npos : lower(in).find(lower(text));
 }
 
-// The front of \p text up to \p separator, which goes with it.
+// Removes the front of \p text up to and with \p separator.
+// RETURNS: the front without the separator.
 std::string cut(std::string& text, const std::string& separator) {
   const std::size_t at = find(text, separator);
   const std::string front = text.substr(0, at);
@@ -32,7 +33,7 @@ std::string cut(std::string& text, const std::string& separator) {
   return front;
 }
 
-// Key -> value; what is known keeps its value if the key does not occur.
+// Key -> value; a key that does not occur keeps its value.
 using Values = std::map<std::string, std::string>;
 
 std::string plainPairs(std::string text, const std::string& keyValueSep,

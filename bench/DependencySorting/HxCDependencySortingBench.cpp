@@ -1,9 +1,9 @@
 // The dependency sorter beside Kahn's algorithm, a graph library and std::sort.
 //
-// One item of work is one node: handed over by pointer with its dependencies,
-// given back at its place in an array of pointers. Every method starts from the
-// same two arrays, of node pointers and of pairs of them, and builds what it
-// needs, the way back from a pointer to a number included.
+// Item of work: a node, handed over by pointer with its dependencies, given
+// back at its place in an array of pointers. Every method starts from two
+// arrays, of node pointers and of pairs of node pointers. The index from
+// pointers to numbers is part of the measured work.
 
 #include <benchmark/benchmark.h>
 
@@ -38,8 +38,8 @@ class Node : public HxCDepSortNode {
   int m_Key;
 };
 
-// The sorter does not know the caller's criterion. Nor shall the compiler open
-// it up in the loops of the peer: both pay for the call.
+// Not inlined, because the sorter cannot inline the criterion of a caller
+// either: sorter and peer pay for the call.
 class ByKey : public HxCDepSortComp {
  public:
   int compare(HxCDepSortNode* a, HxCDepSortNode* b) override;
@@ -76,8 +76,8 @@ Input nodesOf(const std::vector<int>& numbers) {
   return input;
 }
 
-// A hundred layers; each node depends on three nodes of the layer before, of
-// which the first one makes sure that none is isolated.
+// A hundred layers; every node depends on three nodes of the layer before. The
+// first dependency leaves no node isolated.
 Input layered(int count) {
   Input input = nodesOf(shuffled(count));
   const std::size_t width = static_cast<std::size_t>(count) / 100;
@@ -112,8 +112,8 @@ Input isolatedReversed(int count) {
   return nodesOf(numbers);
 }
 
-// Two nodes of each key, rising: a Quicksort that takes the last element as its
-// pivot needs n^2 steps.
+// Two nodes per key, rising: a Quicksort with the last element as pivot takes
+// n^2 steps.
 Input isolatedPairs(int count) {
   std::vector<int> numbers(static_cast<std::size_t>(count));
   for (int i = 0; i < count; ++i) numbers[static_cast<std::size_t>(i)] = i / 2;

@@ -61,7 +61,7 @@ void BM_ValueSymbolTable_OneName(benchmark::State& state) {
 HX_MISSING_PEER(BM_ValueSymbolTable_OneName, "llvm-14-dev")
 #endif
 
-// Names that differ only behind the longest common head that fits.
+// Names with one head of the length limit, different behind the head.
 std::vector<std::string> longNames(std::int64_t count) {
   std::vector<std::string> names;
   for (std::int64_t i = 0; i < count; ++i)
@@ -97,7 +97,7 @@ void BM_LimitedNameSpace_OneHead(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations() * state.range(0));
 }
 
-// A set whose cut names have a counter each.
+// A set with a counter per cut name.
 void BM_SetWithCounters_OneHead(benchmark::State& state) {
   const std::vector<std::string> wanted = longNames(state.range(0));
   for (auto _ : state) {

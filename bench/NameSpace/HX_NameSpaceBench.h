@@ -1,4 +1,4 @@
-// What the name space benchmarks share: peers and made-up names.
+// Shared by the name space benchmarks: peers and made-up names.
 
 #ifndef NAMESPACE_HX_NAMESPACEBENCH_H
 #define NAMESPACE_HX_NAMESPACEBENCH_H

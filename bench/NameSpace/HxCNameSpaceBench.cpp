@@ -1,5 +1,5 @@
-// Searches of the environment beside walks over the peers' maps. One item of
-// work is one query.
+// Searches of the environment beside walks over maps of peers. Item of work: a
+// query.
 
 #include "NameSpace/HxCNameSpace.h"
 
@@ -37,8 +37,7 @@ std::vector<int> missingKeys(int scopes) {
   return keys;
 }
 
-// A file with functions of some blocks each; all scopes hold names of their
-// own.
+// A file with functions of some blocks; no name is in two scopes.
 void BM_NameSpace_MissFromRoot(benchmark::State& state) {
   HxCXStringIdServer ids;
   HxCNameSpace handle(&ids);
@@ -106,8 +105,8 @@ void BM_FlatHashMap_MissFromRoot(benchmark::State& state) {
 HX_MISSING_PEER(BM_FlatHashMap_MissFromRoot, "libabsl-dev")
 #endif
 
-// Queries from the innermost of some nested scopes: keys of all levels and one
-// share of keys that no level holds.
+// Queries from the innermost of some nested scopes: keys of all levels and an
+// equal share of absent keys.
 std::vector<int> outwardKeys() {
   std::vector<int> keys;
   for (int i = 0; i < (kNesting + 1) * kNamesPerScope; ++i)

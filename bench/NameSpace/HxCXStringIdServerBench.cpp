@@ -1,5 +1,5 @@
-// Interning beside the hash maps of the standard library and of two peers. One
-// item of work is one string, or one id.
+// Interning beside the hash maps of the standard library and of two peers. Item
+// of work: a string or an id.
 
 #include "NameSpace/HxCXStringIdServer.h"
 
@@ -20,7 +20,7 @@
 
 namespace {
 
-// Each interner: Text, the form in which it takes a string, and intern().
+// Interface of an interner: intern(Text), with Text made by text().
 class Ours {
  public:
   using Text = KyCXString;
@@ -36,7 +36,7 @@ class Ours {
   HxCXStringIdServer m_Ids;
 };
 
-// A map that numbers its strings.
+// A map from strings to numbers.
 template <class Map>
 class Numbering {
  public:
@@ -122,7 +122,7 @@ void BM_StringIdServer_OneSum(benchmark::State& state) {
                   namesOfOneSum(static_cast<std::size_t>(state.range(0))));
 }
 
-// The sum of the addresses keeps each one read.
+// The sum of the addresses makes the compiler read every address.
 template <class Read>
 void readTexts(benchmark::State& state, const std::vector<int>& ids,
                Read read) {

@@ -37,8 +37,7 @@ namespace {
 
 using Node = HxCDepSortNode*;
 
-// The order in its plain form: quadratic, recursive and short enough to be
-// read.
+// Plain form of the order: quadratic, recursive and short.
 struct PlainSorting {
   struct Vertex {
     Node node;
@@ -184,18 +183,30 @@ class DependencySortingTest : public HX_TestFixture {
     m_Sorting.reinit();
     m_Plain = {.criteria = m_Plain.criteria, .result = m_Plain.result};
   }
-  // Sorts with both; true if everything that can be seen is the same.
-  bool sortsAlike() {
+  // Sorts with sorter and plain form, expects the same result, the same current
+  // criterion, nodes and messages.
+  void expectSortsAlike() {
     const auto sortWith = [](auto& sorting) {
       HxCDepSortNode::setComp(nullptr);
       const bool success = sorting.sort();
       return std::pair(success, HxCDepSortNode::getComp());
     };
     clearMessages();
-    return sortWith(m_Plain) == sortWith(m_Sorting) &&
-           std::ranges::equal(m_Sorting.getNodes(), m_Plain.result) &&
-           testing::Value(messages(),
-                          testing::ElementsAreArray(m_Plain.messages));
+    EXPECT_EQ(sortWith(m_Sorting), sortWith(m_Plain));
+    // By the order of add(); -1 for nodes left from before reinit().
+    const auto numbersOf = [&](const leda::array<Node>& nodes) {
+      std::vector<std::ptrdiff_t> numbers;
+      for (Node node : nodes) {
+        const auto found = std::ranges::find(m_Plain.nodes, node);
+        const bool isKnown = found != m_Plain.nodes.end();
+        numbers.push_back(isKnown ? found - m_Plain.nodes.begin() : -1);
+      }
+      return numbers;
+    };
+    const leda::array<Node> sorted = m_Sorting.getNodes();
+    EXPECT_EQ(numbersOf(sorted), numbersOf(m_Plain.result));
+    EXPECT_TRUE(std::ranges::equal(sorted, m_Plain.result));
+    EXPECT_THAT(messages(), testing::ElementsAreArray(m_Plain.messages));
   }
   KeyComp m_Comps[3] = {KeyComp(0), KeyComp(1), KeyComp(2)};
   HxCDependencySorting m_Sorting;
@@ -228,11 +239,11 @@ TEST_F(DependencySortingTest, DependentNodesComeInOrderBeforeIsolatedOnes) {
   for (const auto& row : rows) {
     SCOPED_TRACE(row.why);
     reinit();
-    EXPECT_TRUE(sortsAlike());  // nothing; forgets the result before
+    expectSortsAlike();  // no nodes; forgets the result before
     for (const char* c = row.added; *c; ++c) add(find(*c));
     for (const char* c = row.dependencies; *c; c += 2)
       depend(find(c[0]), find(c[1]));
-    EXPECT_TRUE(sortsAlike());
+    expectSortsAlike();
     std::string order;
     for (Node node : m_Sorting.getNodes())
       order += node == nullptr ? "-" : node->getName().cstring();
@@ -271,13 +282,16 @@ TEST_F(DependencySortingTest, IsolatedNodesSortAsInThePlainForm) {
       for (int i = 0; i < count; ++i)
         add(&nodes.emplace_back("n", false, key(i, count) / width, i * 7 % 3,
                                 i % 2));
-      EXPECT_TRUE(sortsAlike()) << why << ", " << count << " keys / " << width;
+      SCOPED_TRACE(testing::Message()
+                   << why << ", " << count << " keys / " << width);
+      expectSortsAlike();
+      if (HasFailure()) return;
     }
   }
 }
 
 // Any sequence of calls, with null, strangers, cycles and repeated sorts. Most
-// are small, so that all small graphs and patterns of equals are near.
+// graphs are small, so most small patterns of edges and equals occur.
 TEST_F(DependencySortingTest, RandomUseSortsAsInThePlainForm) {
   for (unsigned seed = 1; seed <= 3000; ++seed) {
     SCOPED_TRACE("seed " + std::to_string(seed));
@@ -309,7 +323,9 @@ TEST_F(DependencySortingTest, RandomUseSortsAsInThePlainForm) {
         if (mayFail || first < second) depend(first, second);
       }
       if (below(6) != 0) {
-        ASSERT_TRUE(sortsAlike()) << "round " << round;
+        SCOPED_TRACE(testing::Message() << "round " << round);
+        expectSortsAlike();
+        if (HasFailure()) return;
       }
       if (below(2) == 0) reinit();
       if (below(4) == 0) init(below(4));
@@ -317,9 +333,8 @@ TEST_F(DependencySortingTest, RandomUseSortsAsInThePlainForm) {
   }
 }
 
-// Rising but for one node, so that each step of the plain form splits off one
-// node: their square would take hours, and a recursion over them would burst
-// the stack of this thread.
+// Rising but for one node: every step of the plain form splits off one node, so
+// the plain form would take hours and burst the stack of this thread.
 TEST_F(DependencySortingTest, LargeBadInputNeedsLittleStackAndTime) {
   constexpr int kCount = 200'000;
   init(2);

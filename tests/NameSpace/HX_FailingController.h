@@ -9,7 +9,7 @@
 
 class HX_FailingController : public HX_CountingController {
  public:
-  /// Refuses that share of the blocks, chosen at random.
+  /// Refuses \p percent of the blocks, chosen at random.
   void setPercent(unsigned percent, unsigned seed) {
     m_Percent = percent;
     m_Random.seed(seed);

@@ -19,7 +19,7 @@ class LimitedNameSpaceTest : public HX_TestFixture {
   HX_OptionsExt m_Options;
 };
 
-// The set as its definition reads: every suffix is tried.
+// Plain form of the set: tries every suffix.
 struct PlainNames {
   bool derive(KyCXString& s, bool addResult, bool adaptLength) {
     HxCNames naming;
@@ -130,7 +130,7 @@ TEST_F(LimitedNameSpaceTest, AgreesWithTryingEachSuffix) {
   }
 }
 
-// Without a memory of what is taken this looks at 200 million names.
+// Without notes of the suffixes taken, 200 million lookups.
 TEST_F(LimitedNameSpaceTest, ManyNamesCompeteForTheVariantsOfOneHead) {
   constexpr int kCount = 20000;
   m_Options.setLimitVariableNameLength(true);

@@ -19,7 +19,7 @@ class StringIdServerTest : public HX_TestFixture {
   HxCXStringIdServer m_Ids;
 };
 
-// One bucket list per sum, searched from its front.
+// Plain form: a list per sum, searched from the front.
 struct PlainServer {
   int getId(const KyCXString& s) {
     if (s.isEmpty()) return 0;
@@ -46,7 +46,7 @@ TEST_F(StringIdServerTest, AgreesWithPlainBuckets) {
     memory.setPercent(seed == 6 ? 90 : 0, seed);
     std::map<int, const char*> texts;
     // Few characters make many equal sums; 0 ends the 8-bit form early, and
-    // both wide units have the same one.
+    // both wide units share an 8-bit form.
     const unsigned short units[] = {'a', 'b', 'c', 0xFF, 0x80, 0, 0x100, 0x101};
     for (int i = 0; i < 4000; ++i) {
       std::vector<unsigned short> text(random() % (seed % 2 == 0 ? 6 : 50));
@@ -75,7 +75,8 @@ TEST_F(StringIdServerTest, BootsAndShutsDownRepeatedlyAndReturnsAllMemory) {
   m_Ids.getId("ab");
   EXPECT_EQ(m_Ids.getId("ba"), 1219);
   int id = 5;
-  EXPECT_TRUE(m_Ids.findOrAdd("", id) && id == 0);
+  EXPECT_TRUE(m_Ids.findOrAdd("", id));
+  EXPECT_EQ(id, 0);
   EXPECT_TRUE(m_Ids.boot());
   HxCXStringIdServer copy(m_Ids);
   EXPECT_EQ(copy.getId("ba"), 1219);

@@ -2,20 +2,20 @@
 
 #include <cctype>
 #include <climits>
-#include <clocale>
 #include <cstdio>
 #include <cstring>
 #include <limits>
 #include <tuple>
 #include <utility>
 
+#include "support/HX_ForeignLocale.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
 
 class StringSupportTest : public HX_TestFixture {
  protected:
-  // The text of a new string, which is given back; "(null)" for null.
+  // Text of a new string, whose block is freed; "(null)" for null.
   std::string taken(char* text) {
     const std::string result = text == nullptr ? "(null)" : text;
     m_Controller.freeMemBlock(text);
@@ -55,11 +55,8 @@ TEST_F(StringSupportTest, NumbersAreWrittenInFull) {
     for (int precision : {-1, 0, 1, 2, 17, 1080}) {
       char expected[1500];
       std::snprintf(expected, sizeof expected, "%.*f", precision, value);
-      // A decimal comma must not show; where the locale is not installed,
-      // there is none.
-      std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
+      const HX_ForeignLocale foreign;
       EXPECT_EQ(taken(STR_DoubleToString(value, precision)), expected);
-      std::setlocale(LC_NUMERIC, "C");
     }
 }
 
@@ -105,13 +102,15 @@ TEST(StringSupportBlockTest, BlocksHoldDigitsDecimalsPointAndSpare) {
 }
 
 TEST_F(StringSupportTest, EqualityKnowsNullAndAsciiCase) {
-  // Two texts, whether they are equal, and whether they are without case.
+  // Two texts, equal with case, equal without case.
   const std::tuple<const char*, const char*, bool, bool> rows[] = {
       {nullptr, nullptr, true, true}, {nullptr, "", false, false},
       {"", nullptr, false, false},    {"Abc", "aBC", false, true},
       {"abc", "abc", true, true},     {"abc", "abcd", false, false},
       {"abcd", "abc", false, false},  {"\xC4", "\xE4", false, false},
-      {"[", "{", false, false},       {"@", "`", false, false}};
+      {"[", "{", false, false},       {"@", "`", false, false},
+      {"I", "i", false, true}};
+  const HX_ForeignLocale foreign;
   for (const auto& [a, b, equal, equalWithoutCase] : rows) {
     SCOPED_TRACE(testing::PrintToString(a) + testing::PrintToString(b));
     EXPECT_EQ(STR_StringsAreEqual(a, b, STR_CASE_SENSITIVE), equal);
@@ -120,11 +119,13 @@ TEST_F(StringSupportTest, EqualityKnowsNullAndAsciiCase) {
           STR_StringsAreEqual(a, b, static_cast<STR_case_sensitive_etp>(mode)),
           equalWithoutCase);
   }
-  EXPECT_TRUE(STR_IsNullOrEmpty(nullptr) && STR_IsNullOrEmpty(""));
+  EXPECT_TRUE(STR_IsNullOrEmpty(nullptr));
+  EXPECT_TRUE(STR_IsNullOrEmpty(""));
   EXPECT_FALSE(STR_IsNullOrEmpty(" "));
 }
 
 TEST_F(StringSupportTest, EachByteIsValidOrReplaced) {
+  const HX_ForeignLocale foreign;
   std::string all, valid, underscored, blanked;
   for (int code = 1; code < 256; ++code) {
     const char ch = static_cast<char>(code);

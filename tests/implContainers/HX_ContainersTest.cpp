@@ -10,6 +10,7 @@
 #include "implContainers/HX_IntervalSet.h"
 #include "implContainers/HX_LetterCode.h"
 #include "implContainers/HX_Number.h"
+#include "support/HX_ForeignLocale.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -94,6 +95,7 @@ TEST(HashTableTest, AgreesWithASetOfPointers) {
 }
 
 TEST(NumberTest, TextsFitOrAreEmpty) {
+  const HX_ForeignLocale foreign;
   const struct {
     double value;
     int precision;
