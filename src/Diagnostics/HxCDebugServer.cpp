@@ -6,16 +6,17 @@
 #include "Diagnostics/HxCDebugServer.h"
 
 #include <algorithm>
-#include <charconv>
 #include <cinttypes>
 #include <cstdarg>
 #include <cstdio>
 #include <cstring>
+#include <iterator>
 
 #include "Diagnostics/HX_TimingListener.h"
 #include "Diagnostics/implDiagnostics/HX_RawClock.h"
 #include "Diagnostics/implDiagnostics/HX_ReportText.h"
 #include "SystemServices/HX_BuildNumber.h"
+#include "implContainers/HX_Number.h"
 #include "platform/matlab/HX_MexInterface.h"
 #include "platform/os/HX_OsFile.h"
 #include "platform/strings/KyCXString.h"
@@ -99,10 +100,8 @@ void addClock(HX_ReportText& text, int index, std::int64_t calls,
   const double average =
       calls == 0 ? 0.0
                  : static_cast<double>(total) / static_cast<double>(calls);
-  // printf() would write the decimal point of the locale.
-  char digits[32] = "";
-  std::to_chars(digits, std::end(digits) - 1, average, std::chars_format::fixed,
-                3);
+  char digits[32];
+  HX_WriteFixed(digits, sizeof digits, average, 3);
   appendFormatted(
       text,
       "%3d %9" PRId64 " %10" PRId64 HX_MICROSECONDS " %8" PRId64 HX_MICROSECONDS

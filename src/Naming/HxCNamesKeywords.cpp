@@ -10,6 +10,7 @@
 #include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
 #include "Naming/HxCNamesScan.h"
+#include "implContainers/HX_LetterCode.h"
 #include "platform/model/HX_Options.h"
 #include "platform/model/HxCGlobal.h"
 #include "platform/model/HxCSymbol.h"
@@ -25,8 +26,6 @@ constexpr const char* kCKeywords[] = {
     "struct",   "switch", "typedef", "union",  "unsigned", "void",
     "volatile", "while"};
 static_assert(sizeof kCKeywords / sizeof *kCKeywords == 32);
-
-constexpr int kLetters = 26;
 
 using Dictionary =
     leda::dictionary<KyCXString, HxCNames::tagHxEDictEntryType, leda::ab_tree>;
@@ -59,17 +58,6 @@ bool comparesUnitByUnit() {
   for (int unit = 0; unit < 256; ++unit)
     different.insert(KyCXString(static_cast<char>(unit)), true);
   return different.size() == 257;
-}
-
-// Letters of a bijective base-26 numeral, least significant first.
-KyCXString letterCode(int index) {
-  KyCXString code;
-  for (;;) {
-    code += static_cast<char>('a' + index % kLetters);
-    index /= kLetters;
-    if (index == 0) return code;
-    --index;
-  }
 }
 
 }  // namespace
@@ -142,13 +130,13 @@ bool HxCNames::isFileNameValid(HxCCIdentifier& identifier) {
 
 void HxCNames::appendSuffix(KyCXString& name, int index) {
   HX_WithinMemory([&] {
-    const KyCXString code = letterCode(index < 0 ? 0 : index);
+    const HX_LetterCode code(index < 0 ? 0 : index);
     int kept = name.length();
     if (HxCGlobal::getOptions()->getLimitVariableNameLength())
       kept = std::min(kept, HxCSymbol::sm_MaxNameLength - code.length() - 1);
     KyCXString result = name.head(kept);
     result += '_';
-    result += code;
+    result += code.text();
     name = std::move(result);
   });
 }

@@ -1,15 +1,14 @@
 // Names of tasks and operating-system objects, and times in names.
 
-#include <charconv>
 #include <cmath>
 #include <cstdio>
-#include <iterator>
 
 #include "Control/ERR_Messages.h"
 #include "Control/HX_Memory.h"
 #include "Math/FPS_FloatingPointSupport.h"
 #include "Naming/HX_MacroRows.h"
 #include "Naming/HxCNames.h"
+#include "implContainers/HX_Number.h"
 
 namespace {
 
@@ -53,10 +52,8 @@ bool contains(const HxCCIdentifier& id, const KyCXString& text) {
 void reportImprecise(const HxCCIdentifier& id, const char* kind,
                      double seconds) {
   char value[400];  // the largest double has 309 digits before the point
-  // printf() would write the decimal point of the locale.
-  char digits[sizeof value] = "";
-  std::to_chars(digits, std::end(digits) - 1, seconds, std::chars_format::fixed,
-                10);
+  char digits[sizeof value];
+  HX_WriteFixed(digits, sizeof digits, seconds, 10);
   std::snprintf(value, sizeof value, "%12s", digits);
   ERR_Msg1207(messageRef(id), kind, value);
 }

@@ -9,6 +9,7 @@
 
 #include <charconv>
 #include <cstddef>
+#include <cstdint>
 #include <system_error>
 
 /// Writes \p value as "%.*f" with \p precision would, and a zero behind.
@@ -26,7 +27,8 @@ inline std::size_t HX_WriteFixed(char* text, std::size_t size, double value,
 
 /// Writes the decimal digits of \p value, after '-' if negative, and a zero
 /// behind. RETURNS and REQUIRES: as HX_WriteFixed().
-inline std::size_t HX_WriteInt(char* text, std::size_t size, int value) {
+inline std::size_t HX_WriteInt(char* text, std::size_t size,
+                               std::int64_t value) {
   const auto [end, error] = std::to_chars(text, text + size - 1, value);
   char* const stop = error == std::errc() ? end : text;
   *stop = 0;

@@ -7,12 +7,11 @@
 #ifndef DIAGNOSTICS_IMPLDIAGNOSTICS_HX_REPORTTEXT_H
 #define DIAGNOSTICS_IMPLDIAGNOSTICS_HX_REPORTTEXT_H
 
-#include <charconv>
 #include <cstdint>
-#include <iterator>
 #include <string>
 
 #include "Control/HX_Memory.h"
+#include "implContainers/HX_Number.h"
 
 /// Appending throws std::bad_alloc without memory: see HX_WithinMemory().
 using HX_ReportText = std::basic_string<char, std::char_traits<char>,
@@ -22,8 +21,8 @@ namespace hx_detail {
 
 /// Appends the decimal digits of \p number, with '-' in front if negative.
 inline void appendNumber(HX_ReportText& text, std::int64_t number) {
-  char digits[20];  // of -2^63
-  text.append(digits, std::to_chars(digits, std::end(digits), number).ptr);
+  char digits[21];  // of -2^63
+  text.append(digits, HX_WriteInt(digits, sizeof digits, number));
 }
 
 }  // namespace hx_detail
