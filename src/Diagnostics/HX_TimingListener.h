@@ -30,9 +30,9 @@ class HX_UTILS_API HX_TimingListener {
   /// run times.
   /// \param name  valid during the call
   /// \param start  microseconds since an arbitrary origin, equal for all runs
-  ///     of one clock. Before boot() a debug server uses the process clock, even
-  ///     while stop watches use the counter; the start of a run time across
-  ///     boot() has no meaning.
+  ///     of one clock. Before boot() a debug server uses the process clock,
+  ///     even while stop watches use the counter; the start of a run time
+  ///     across boot() has no meaning.
   /// \param duration  the accounted microseconds
   virtual void runEnded(const char* name, std::int64_t start,
                         std::int64_t duration) = 0;
