@@ -150,9 +150,11 @@ class ReportTest(unittest.TestCase):
         self.assertEqual(self.page.texts('.macros td:first-child'), ['$S', '_', '$B'])
         self.assertEqual(self.page.texts('.macros td:nth-child(2)'),
                          ['Sa2', '_', 'Throttle_Command_Saturation_and_Rate_Limiter'])
-        self.assertEqual(self.page.texts('.steps li'),
-                         ['expanded Sa2_Throttle_Command_Saturation_and_Rate_Limiter', 'shortened',
-                          "taken by 'throttle_cmd'", 'name in the code Sa2_Throttle_Co__d_Rate_Limit_a'])
+        expanded, shortened, taken, name = self.page.texts('.steps li')
+        self.assertEqual((expanded, shortened, name),
+                         ('expanded Sa2_Throttle_Command_Saturation_and_Rate_Limiter', 'shortened',
+                          'name in the code Sa2_Throttle_Co__d_Rate_Limit_a'))
+        self.assertRegex(taken, "^taken by .*throttle_cmd'")
         self.page.search('letter_P')
         self.page.find('.row').click()
         self.assertIn("warning 30303: The '$P' name macro", self.page.texts('.messages li')[0])
