@@ -1,7 +1,5 @@
 #include "SourceRef/HxCDdSrcRef.h"
 
-#include <utility>
-
 #include "Control/HX_Memory.h"
 #include "Strings/HX_StringParser.h"
 #include "platform/datadictionary/HX_DataDictionary.h"
@@ -23,11 +21,8 @@ HxCDdSrcRef::~HxCDdSrcRef() = default;
 const HxCDdSrcRef* HxCDdSrcRef::isDd() const { return this; }
 
 void HxCDdSrcRef::toString(KyCXString& text) const {
-  HX_WithinMemory([&] {
-    KyCXString readable;
-    HX_StringParser().processDDPath(pathOf(m_Handle), readable);
-    text = std::move(readable);
-  });
+  HX_WithinMemory(
+      [&] { HX_StringParser().processDDPath(pathOf(m_Handle), text); });
 }
 
 HxCSrcRef* HxCDdSrcRef::clone() const { return new HxCDdSrcRef(*this); }
