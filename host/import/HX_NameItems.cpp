@@ -152,7 +152,11 @@ void HX_NameItems::addState(const HX_ModelBlock& block, const Context& place) {
       add(item, "variable", block.id + "#state", block.id, place);
   if (name == nullptr) return;
   name->x = given;
-  setType(*name, {block.get("OutDataTypeStr"), "", ""}, place);
+  const char* initial = block.find("InitialCondition");
+  if (initial == nullptr) initial = block.find("InitialValue");
+  setType(*name,
+          {block.get("OutDataTypeStr"), initial == nullptr ? "" : initial, ""},
+          place);
 }
 
 void HX_NameItems::addParameters(const HX_ModelBlock& block,

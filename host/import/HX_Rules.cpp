@@ -69,8 +69,9 @@ void check(const std::string& file, const rapidjson::Document& document) {
                   textOf(member.name);
   }
   throw HX_ImportError(
-      file + ": " + std::string(place.GetString()) + "/: " + "expected " +
-      (keyword == "additionalProperties" ? "" : keyword + " ") + argument);
+      file + ": " + (place.GetSize() == 0 ? "/" : place.GetString()) +
+      ": expected " + (keyword == "additionalProperties" ? "" : keyword + " ") +
+      argument);
 }
 
 void readText(const Json& node, const char* field, std::string& text) {
