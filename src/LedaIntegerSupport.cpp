@@ -4,8 +4,8 @@
 
 namespace hx_detail {
 
-constinit leda::integer ledaLargestInt64;
-constinit leda::integer ledaSmallestInt64;
+leda::integer ledaLargestInt64;
+leda::integer ledaSmallestInt64;
 
 }  // namespace hx_detail
 

@@ -232,7 +232,7 @@ void HX_LimitedNameSpace::forgetTaken(const KyCXString& variant) {
 
 void HX_LimitedNameSpace::adaptStringLength(KyCXString& s) {
   s.shortenString(HxCSymbol::sm_MaxNameLength, 2, '_',
-                  KyCXString::ePositionMiddle);
+                  static_cast<KyCXString::ScEPosition>(1));
 }
 
 HX_LimitedNameSpace::Name* HX_LimitedNameSpace::find(

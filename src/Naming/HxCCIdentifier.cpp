@@ -11,11 +11,11 @@ namespace {
 
 void shorten(KyCXString& name) {
   name.shortenString(HxCSymbol::sm_MaxNameLength, 2, '_',
-                     KyCXString::ePositionMiddle);
+                     static_cast<KyCXString::ScEPosition>(1));
 }
 
 bool containsMacro(const KyCXString& text, char letter) {
-  for (int at = text.find('$'); at >= 0; at = text.find('$', at + 1))
+  for (int at = text.find('$', 0); at >= 0; at = text.find('$', at + 1))
     if (text[at + 1] == letter) return true;
   return false;
 }
@@ -87,7 +87,7 @@ bool HxCCIdentifier::setName(const KyCXString& name) {
 bool HxCCIdentifier::setTemplate(const KyCXString& text) {
   Name actual;
   Name formal;
-  const int colon = text.find(':');
+  const int colon = text.find(':', 0);
   const int second = colon < 0 ? -1 : text.find(':', colon + 1);
   if (colon < 0) {
     formal.raw = text;

@@ -34,6 +34,7 @@
 #include "Control/ERR_Messages.h"
 #include "Control/HX_Memory.h"
 #include "Control/HX_SelfCheck.h"
+#include "Control/HX_TextCalls.h"
 #include "FLAG.h"
 #include "Naming/HX_MacroRows.h"
 #include "Naming/HxCNamesScan.h"
@@ -263,12 +264,12 @@ KyCXString HxCNames::standInForm(const Scan& scan) {
 void HxCNames::scanTemplate(Scan& scan) {
   const KyCXString& form = scan.form();
   // A template too long for a text object makes a name too long for it.
-  if (form.length() >= kLongForm) scan.result.reserve(2 * form.length());
+  if (form.length() >= kLongForm) HX_Reserve(scan.result, 2 * form.length());
   while (scan.pos < form.length()) {
     const unsigned short unit = form[scan.pos];
     if (unit != '$') {
       // Text between macros is short: unit by unit is the fastest way.
-      scan.result.appendUnit(unit);
+      HX_AppendUnit(scan.result, form, scan.pos);
       ++scan.pos;
       continue;
     }
@@ -388,7 +389,8 @@ void HxCNames::keepForeignMacro(Scan& scan, unsigned short letter) {
   if (letter == 'E' && form[scan.pos] == '(') {
     const int length = findDollarELength(form, scan.pos);
     KyCXString argument = form.sub(scan.pos, scan.pos + length - 1);
-    scan.result += argument.makeCIdentifier(false);
+    argument.makeCIdentifier(false);
+    scan.result += argument;
     scan.pos += length;
   }
   if (!scan.suppressMessages) reportForeignMacro(scan, macro);
@@ -409,7 +411,9 @@ void HxCNames::reportForeignMacro(Scan& scan, const KyCXString& macro) {
   }
   KyCXString upper(macro);
   KyCXString lower(macro);
-  if (isKnown(upper.toUpper()) && isKnown(lower.toLower()))
+  upper.toUpper();
+  lower.toLower();
+  if (isKnown(upper) && isKnown(lower))
     shown = "'" + upper + "' and '" + lower + "'";
   ERR_Msg1202(scan.reportRef, shown.cstring(), raw.cstring());
 }

@@ -1,6 +1,7 @@
 // Extended macros "$(Name)", and the software component of a variable.
 
 #include "Control/ERR_Messages.h"
+#include "Control/HX_TextCalls.h"
 #include "Naming/HX_MacroRows.h"
 #include "Naming/HxCNames.h"
 #include "SourceRef/HxCDdSrcRef.h"
@@ -107,7 +108,7 @@ int HxCNames::evaluateExtendedNameMacro(
     const HxCSrcRef* reportRef, bool suppressMessages) {
   const int close = form.find(')', pos);
   if (close < 0) {
-    result.appendSub(form, pos, form.length() - 1);
+    HX_AppendSub(result, form, pos, form.length() - 1);
     return form.length();
   }
   const HX_Macro* macro = HX_FindMacro(form, pos);

@@ -20,7 +20,8 @@ void appendAsCIdentifier(KyCXString& result, const KyCXString& text) {
     return;
   }
   KyCXString name(text);
-  result += name.makeCIdentifier(false);
+  name.makeCIdentifier(false);
+  result += name;
 }
 
 }  // namespace
@@ -46,7 +47,9 @@ int HxCNames::evaluateLabelMacro(KyCXString& result,
     return kMacroLength;
   // A propagated label stands in angle brackets.
   KyCXString text(label);
-  text.trim(true, true).filterAngleBrackets().trim(true, true);
+  text.trim(true, true);
+  text.filterAngleBrackets();
+  text.trim(true, true);
   if (!text.isEmpty())
     appendAsCIdentifier(result, text);
   else if (block != nullptr)

@@ -24,6 +24,7 @@
 #include <utility>
 
 #include "Control/HX_Memory.h"
+#include "Control/HX_TextCalls.h"
 #include "FLAG.h"
 #include "Naming/HxCNames.h"
 #include "platform/datatypes/HX_DataType.h"
@@ -69,11 +70,12 @@ class MacroKey {
   Match match(const KyCXString& text, int position) const {
     if (m_Kind == HxCNames::eMacroKindAnyCase) {
       KyCXString found = text.sub(position, position + m_pLower->length() - 1);
-      return found.toLower() == *m_pLower ? Match::eValue : Match::eNone;
+      found.toLower();
+      return found == *m_pLower ? Match::eValue : Match::eNone;
     }
-    if (text.matchesAt(position, *m_pLower)) return Match::eValue;
+    if (HX_MatchesAt(text, position, *m_pLower)) return Match::eValue;
     if (m_Kind != HxCNames::eMacroKindCaseSelectsValue) return Match::eNone;
-    return text.matchesAt(position, m_Upper) ? Match::eUpper : Match::eNone;
+    return HX_MatchesAt(text, position, m_Upper) ? Match::eUpper : Match::eNone;
   }
 
  private:
@@ -165,7 +167,7 @@ bool HxCNames::substitutedText(const KyCXString& source,
                                const KyCXString& macro,
                                const KyCXString& replacement,
                                tagMacroKindEnum kind, KyCXString& result) {
-  int dollar = source.find('$');
+  int dollar = source.find('$', 0);
   if (dollar < 0) return false;
 
   const MacroKey key(macro, kind);
@@ -177,16 +179,19 @@ bool HxCNames::substitutedText(const KyCXString& source,
       next = endOfForeignMacro(source, dollar);
       continue;
     }
-    result.appendSub(source, copied, dollar - 1);
-    if (match == Match::eUpper)
-      result += KyCXString(replacement).toUpper();
-    else
+    HX_AppendSub(result, source, copied, dollar - 1);
+    if (match == Match::eUpper) {
+      KyCXString upper(replacement);
+      upper.toUpper();
+      result += upper;
+    } else {
       result += replacement;
+    }
     next = copied = dollar + macro.length() + 1;
     replaced = true;
   }
   if (!replaced) return false;
-  result.appendSub(source, copied, source.length() - 1);
+  HX_AppendSub(result, source, copied, source.length() - 1);
   return true;
 }
 

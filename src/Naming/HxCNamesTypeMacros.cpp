@@ -85,7 +85,8 @@ void HxCNames::evaluateLongTypeMacro(KyCXString& result,
                        kNamesErrorCode)) {
     text = getTypeNameInCode(scalar);
   }
-  result += text.makeCIdentifier(false);
+  text.makeCIdentifier(false);
+  result += text;
 }
 
 void HxCNames::evaluateBaseTypeMacro(KyCXString& result,
@@ -100,7 +101,8 @@ void HxCNames::evaluateBaseTypeMacro(KyCXString& result,
     return;
   }
   KyCXString text = baseTypeName(scalarOf(type));
-  result += text.makeCIdentifier(false);
+  text.makeCIdentifier(false);
+  result += text;
 }
 
 // The first question that holds decides; the base type may be missing.

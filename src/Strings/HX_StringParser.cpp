@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "Control/HX_Memory.h"
+#include "Control/HX_TextCalls.h"
 
 namespace {
 
@@ -59,7 +60,7 @@ KyCXString parsePairs(const KyCXString& str, const KyCXString& keyValueSep,
   const KyCXString lowKeyValueSep = lowered(keyValueSep);
   const KyCXString lowPairSep = lowered(pairSep);
   leda::array<KyCXString> lowKeys(keys);
-  for (KyCXString& key : lowKeys) key.toLower();
+  for (int i = 0; i < lowKeys.size(); ++i) lowKeys[i].toLower();
 
   const auto strippedOfBlanks = [](const KyCXString& text) {
     return stripped(text, " ", HX_StringParser::eRemoveBoth);
@@ -124,11 +125,11 @@ void HX_StringParser::divideKeywordEmbeddedString(
     const int length = lowStr.length();
     for (int pos = 0; pos < length;) {
       const int open = findOr(length, lowStr, start, pos);
-      rest.appendSub(str, pos, open - 1);
+      HX_AppendSub(rest, str, pos, open - 1);
       if (open == length) break;
       const int body = open + start.length();
       const int close = findOr(length, lowStr, stop, body);
-      inside.appendSub(str, body, close - 1);
+      HX_AppendSub(inside, str, body, close - 1);
       pos = close + stop.length();
     }
     embedded = std::move(inside);
@@ -149,9 +150,9 @@ void HX_StringParser::processDDPath(const KyCXString& path,
     const int second = path.find('/', slash + 1);
     const int object = (second < 0 ? slash : second) + 1;
     KyCXString description("User script object ");
-    description.appendSub(path, object, path.length() - 1);
+    HX_AppendSub(description, path, object, path.length() - 1);
     description += " of block ";
-    description.appendSub(path, block, slash - 1);
+    HX_AppendSub(description, path, block, slash - 1);
     text = std::move(description);
   });
 }
