@@ -59,13 +59,19 @@ class HX_PLATFORM_API HX_SimulinkTree {
     KyCXString parentPath;
   };
 
+  struct TextOrder {
+    bool operator()(const KyCXString& a, const KyCXString& b) const {
+      return a.compareWith(b) < 0;
+    }
+  };
+
   const Block* find(double handle) const;
   double findHandle(const mxArray* object) const;
 
   std::vector<Block> m_Blocks;  // the block of handle 1.0 first
   // By path and, unless a path says the same, by the 8-bit form of a path.
-  std::map<KyCXString, double> m_Handles;
-  std::map<KyCXString, double> m_NarrowHandles;
+  std::map<KyCXString, double, TextOrder> m_Handles;
+  std::map<KyCXString, double, TextOrder> m_NarrowHandles;
 };
 
 #endif  // PLATFORM_MATLAB_HX_SIMULINKTREE_H
