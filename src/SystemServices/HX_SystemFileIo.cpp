@@ -11,7 +11,7 @@ HX_SystemFileIo::~HX_SystemFileIo() {
 bool HX_SystemFileIo::open(const KyCXString& name, const KyCXString& mode,
                            std::FILE*& file) {
   // The entry comes first: no file stays open without an entry.
-  leda::list_item<std::FILE*> entry;
+  auto entry = m_Files.first();
   if (!HX_WithinMemory([&] { entry = m_Files.append(nullptr); })) return false;
   std::FILE* opened = std::fopen(name.cstring(), mode.cstring());
   if (opened == nullptr) {
