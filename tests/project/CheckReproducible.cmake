@@ -7,7 +7,7 @@
 #         -P CheckReproducible.cmake
 cmake_minimum_required(VERSION 3.25)
 set(objects CMakeFiles/hx_utils.dir/src/FLAG.cpp.o
-            platform/CMakeFiles/hx_platform.dir/messages/HX_MessageHandler.cpp.o
+            platform/messages/CMakeFiles/hx_platform_messages.dir/HX_MessageHandler.cpp.o
             host/CMakeFiles/hx_codegen.dir/program/HX_Version.cpp.o)
 set(parts src platform host)
 
