@@ -99,6 +99,17 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
     eDictUserTypeName = 2   ///< message 410
   };
 
+  /// Answer of checkCVariableName().
+  enum HxEVariableNameTag : int {
+    eVariableNameValid = 0,
+    eVariableNameEmpty = 1,
+    eVariableNameCKeyword = 2,      ///< word of kind eDictCKeyword
+    eVariableNameBaseType = 3,      ///< word of kind eDictBaseTypeName
+    eVariableNameUserType = 4,      ///< word of kind eDictUserTypeName
+    eVariableNameOtherWord = 5,     ///< word of another kind
+    eVariableNameNoCIdentifier = 6  ///< no word, and no C identifier
+  };
+
   /// Base time unit of the operating system.
   enum tagHxEOsekTimeBase : int { eOsekTimeBaseUs = 1, eOsekTimeBaseMs = 4 };
 
@@ -205,10 +216,13 @@ class HX_UTILS_API HxCNames : public HX_Allocated {
   /// assertion fails and nothing is entered.
   void addToKeywordDict(const KyCXString& word, tagHxEDictEntryType type);
 
-  /// RETURNS: true if \p name may be used as a C variable: not empty, no word
-  /// of the dictionary, a valid C identifier. A word of the dictionary is
-  /// reported with message 408, 409 or 410 (error). Without a dictionary an
-  /// internal assertion fails, and the C rules alone answer.
+  /// RETURNS: the first reason in the order of the enumeration why \p name may
+  /// not be used as a C variable. Reports and asserts nothing; without a
+  /// dictionary no text is a word.
+  static HxEVariableNameTag checkCVariableName(const KyCXString& name);
+  /// RETURNS: true if checkCVariableName() finds \p name valid. A word of the
+  /// dictionary is reported with message 408, 409 or 410 (error). Without a
+  /// dictionary an internal assertion fails for a \p name that is not empty.
   bool isStringValidCVariableName(const KyCXString& name);
 
   /// RETURNS: true if \p name, a file name without extension, is not empty and

@@ -87,33 +87,45 @@ void HxCNames::shutdown() {
 
 void HxCNames::addToKeywordDict(const KyCXString& word,
                                 tagHxEDictEntryType type) {
-  if (!HX_Assert(s_pKeywordDict != nullptr, kNamesErrorCode)) return;
   HX_WithinMemory([&] {
+    if (!HX_Assert(s_pKeywordDict != nullptr, kNamesErrorCode)) return;
     s_pKeywordDict->insert(word, type);
     noteWord(word);
   });
 }
 
-bool HxCNames::isStringValidCVariableName(const KyCXString& name) {
-  if (name.isEmpty()) return false;
-  if (!HX_Assert(s_pKeywordDict != nullptr, kNamesErrorCode))
-    return name.isValidCIdentifier();
-  if (!mayBeWord(name)) return name.isValidCIdentifier();
-  const auto entry = s_pKeywordDict->lookup(name);
-  if (!entry) return name.isValidCIdentifier();
-  switch (s_pKeywordDict->inf(entry)) {
-    case eDictCKeyword:
-      ERR_Msg408(name.cstring());
-      return false;
-    case eDictBaseTypeName:
-      ERR_Msg409(name.cstring());
-      return false;
-    case eDictUserTypeName:
-      ERR_Msg410(name.cstring());
-      return false;
+HxCNames::HxEVariableNameTag HxCNames::checkCVariableName(
+    const KyCXString& name) {
+  if (name.isEmpty()) return eVariableNameEmpty;
+  if (s_pKeywordDict != nullptr && mayBeWord(name)) {
+    if (const auto entry = s_pKeywordDict->lookup(name)) {
+      switch (s_pKeywordDict->inf(entry)) {
+        case eDictCKeyword:
+          return eVariableNameCKeyword;
+        case eDictBaseTypeName:
+          return eVariableNameBaseType;
+        case eDictUserTypeName:
+          return eVariableNameUserType;
+      }
+      return eVariableNameOtherWord;
+    }
   }
-  HX_DebugCheck(false, "0");
-  return false;
+  return name.isValidCIdentifier() ? eVariableNameValid
+                                   : eVariableNameNoCIdentifier;
+}
+
+bool HxCNames::isStringValidCVariableName(const KyCXString& name) {
+  const HxEVariableNameTag answer = checkCVariableName(name);
+  // A message may take memory.
+  HX_WithinMemory([&] {
+    if (answer != eVariableNameEmpty)
+      HX_Assert(s_pKeywordDict != nullptr, kNamesErrorCode);
+    if (answer == eVariableNameCKeyword) ERR_Msg408(name.cstring());
+    if (answer == eVariableNameBaseType) ERR_Msg409(name.cstring());
+    if (answer == eVariableNameUserType) ERR_Msg410(name.cstring());
+    HX_DebugCheck(answer != eVariableNameOtherWord, "0");
+  });
+  return answer == eVariableNameValid;
 }
 
 bool HxCNames::isFileNameValid(KyCXString& name) {
