@@ -1,4 +1,4 @@
-// A model small enough to know by heart, and the expansion of one template.
+// Small model, and the expansion of one template.
 
 #ifndef NAMING_HX_NAMINGFIXTURE_H
 #define NAMING_HX_NAMINGFIXTURE_H
@@ -31,7 +31,7 @@ class HxCNamesTestAccess {
                           unsigned int retained) {
     return names.evaluateDdObjectNameMacro(result, retained, 0x200, "Gain");
   }
-  /// The number of the base and its unit, at first "0?".
+  /// Number of the base, and unit; "0?" without an answer.
   static std::string osekBaseTime(double value) {
     auto base = static_cast<HxCNames::tagHxEOsekTimeBase>(0);
     KyCXString unit("?");
@@ -72,6 +72,10 @@ class HX_NamingFixture : public HX_TestFixture {
     HX_DdTree::instance().clear();
   }
 
+  /// Message 7 with the error code of the engine.
+  static constexpr const char* kAssertion =
+      "7/3 Internal error. Error code: HxCNames[0-9]+\\..*";
+
   /// An identifier with the template \p form for \p srcRef.
   static Id identifier(const std::string& form, const HxCSrcRef* srcRef) {
     Id id(form.c_str());
@@ -82,7 +86,7 @@ class HX_NamingFixture : public HX_TestFixture {
     return identifier(form, gain.getSrcRef());
   }
 
-  /// What \p form becomes for \p srcRef, or else for the block gain.
+  /// Expansion of \p form for \p srcRef, by default for the block gain.
   std::string expand(const std::string& form, const HxCSrcRef* srcRef,
                      unsigned int retained = 0, unsigned int provisional = 0) {
     return expandId(identifier(form, srcRef), retained, provisional);
@@ -97,7 +101,7 @@ class HX_NamingFixture : public HX_TestFixture {
     return shown(id);
   }
 
-  /// Both names, as "formal:actual" where they differ, and the numbers of the
+  /// The name, or "formal:actual" for different names, and the numbers of the
   /// messages since the last call: "x_$Q 1203".
   std::string shown(const Id& id) {
     const std::string formal = id.getCookedName(Id::eFormalName).cstring();
@@ -106,9 +110,9 @@ class HX_NamingFixture : public HX_TestFixture {
            std::exchange(m_Numbers, "");
   }
 
-  /// What is noted of both names: R if it may change, L, E and N if it uses
-  /// that macro. "RL:" is a formal name with two notes and an actual one
-  /// without any.
+  /// Notes of both names: R for a name that may change, L, E and N for the use
+  /// of a macro. "RL:" is a formal name with two notes and an actual name
+  /// without notes.
   static std::string notedOf(const Id& id) {
     const auto notes = [&id](Id::HxENameTypeTag name) {
       return std::string(id.getIdentifierChangeable(name) ? "R" : "") +
@@ -119,7 +123,7 @@ class HX_NamingFixture : public HX_TestFixture {
     return notes(Id::eFormalName) + ":" + notes(Id::eActualName);
   }
 
-  /// What stands between the blanks of \p text.
+  /// Parts of \p text between blanks.
   static std::vector<std::string> words(const std::string& text) {
     std::istringstream stream(text);
     return {std::istream_iterator<std::string>(stream), {}};
@@ -135,7 +139,7 @@ class HX_NamingFixture : public HX_TestFixture {
   SC_State chartState{1, 4, "Mode chart", &chart};
   SC_Model event{2, 7, "go#"};
   HxCNames names;
-  // For the next expansions, and told of the last one.
+  // Input and output of the expansions.
   HX_DataType* type = nullptr;
   bool quiet = false;
   bool complete = false;

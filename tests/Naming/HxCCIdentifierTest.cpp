@@ -11,7 +11,7 @@ class CIdentifierTest : public HX_NamingFixture {
   static constexpr auto kActual = Id::eActualName;
   static constexpr auto kFormal = Id::eFormalName;
 
-  /// The raw names, the cooked ones, what is noted and the level.
+  /// Raw names, cooked names, notes and level.
   std::string all(Id id) {
     const KyCXString raw =
         id.getRawName(kFormal) + ":" + id.getRawName(kActual);
@@ -30,7 +30,11 @@ TEST_F(CIdentifierTest, SetNameSplitsFormalAndActual) {
       {":b", ":b :b : 0", true},
       {"::", ":  : 0", false}};
   Id id("old:one");
+  HX_BdBlock ivBlock("iv");
   for (const auto& [name, result, twoPartsAtMost] : rows) {
+    id.setSourceRef(gain.getSrcRef());
+    id.setDdSourceRef(gain.getSrcRef());
+    id.setSourceIVBlock(&ivBlock);
     id.setCookLevel(Id::eCookLevelFull);
     id.setDollarXValue("x");
     id.setSignalLabel("label");
@@ -40,8 +44,46 @@ TEST_F(CIdentifierTest, SetNameSplitsFormalAndActual) {
     EXPECT_EQ(all(id), result);
     KyCXString rest;
     id.getDollarXValue(rest);
-    EXPECT_EQ(rest + id.getSignalLabel(), "");
+    EXPECT_EQ(rest, "");
+    EXPECT_EQ(id.getSignalLabel(), "");
     EXPECT_TRUE(id.isFormalNameActive());
+    EXPECT_EQ(id.getSourceRef(), nullptr);
+    EXPECT_EQ(id.getDdSourceRef(), nullptr);
+    EXPECT_EQ(id.getSourceIVBlock(), nullptr);
+  }
+}
+
+TEST_F(CIdentifierTest, CopiesHaveEveryField) {
+  HX_BdBlock ivBlock("iv");
+  const HxCDdSrcRef ddRef(1);
+  Id id = identifier("a:b");
+  id.setCookedName("c", kFormal);
+  id.setCookedName("d", kActual);
+  id.activateActualName();
+  id.setDdSourceRef(&ddRef);
+  id.setSourceIVBlock(&ivBlock);
+  id.setSignalLabel("label");
+  id.setDollarXValue("x");
+  Id assigned("other");
+  for (int bit = 0; bit < 8; ++bit) {
+    const auto name = bit < 4 ? kFormal : kActual;
+    id.setIdentifierChangeable(bit % 4 == 0, name);
+    id.setDollarLUsed(bit % 4 == 1, name);
+    id.setDollarEUsed(bit % 4 == 2, name);
+    id.setDollarNUsed(bit % 4 == 3, name);
+    id.setCookLevel(bit % 2 == 0 ? Id::eCookLevelSymbol : Id::eCookLevelFull);
+    assigned = id;
+    Id made(assigned);
+    EXPECT_EQ(all(made), all(id));
+    EXPECT_EQ(all(assigned), all(id));
+    EXPECT_FALSE(made.isFormalNameActive());
+    EXPECT_EQ(made.getSourceRef(), gain.getSrcRef());
+    EXPECT_EQ(made.getDdSourceRef(), &ddRef);
+    EXPECT_EQ(made.getSourceIVBlock(), &ivBlock);
+    EXPECT_EQ(made.getSignalLabel(), "label");
+    KyCXString x;
+    made.getDollarXValue(x);
+    EXPECT_EQ(x, "x");
   }
 }
 
@@ -84,7 +126,7 @@ TEST_F(CIdentifierTest, ChangesTouchTheNamesTheySay) {
   EXPECT_EQ(all(id), "p-f-1-s:p-a-1-s p-f_1-s:p-a_1-s : 0");
   id.setCookedName("new", kFormal);
   EXPECT_EQ(all(id), "p-f-1-s:p-a-1-s new:p-a_1-s : 0");
-  // Equal are those whose raw active names are.
+  // The raw active names decide about equality.
   EXPECT_TRUE(id == Id("p-f-1-s:b"));
   id.activateActualName();
   EXPECT_FALSE(id == Id("p-f-1-s:b"));

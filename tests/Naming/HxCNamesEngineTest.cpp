@@ -9,12 +9,14 @@ namespace {
 using testing::_;
 using testing::ElementsAre;
 using testing::EndsWith;
+using testing::HasSubstr;
+using testing::MatchesRegex;
 using testing::StartsWith;
 
 class NameEngineTest : public HX_NamingFixture {};
 
-// The scan written plainly for templates over "$", "B", "Q", "(", ")" and
-// letters without a meaning, with the numbers of its messages.
+// Plain scan of templates over "$", "B", "Q", "(", ")" and letters without a
+// meaning, with the numbers of the messages.
 std::string plainExpansion(const std::string& form) {
   std::string result, numbers;
   for (std::size_t at = 0, end; at < form.size(); at = end) {
@@ -65,6 +67,14 @@ TEST_F(NameEngineTest, MacrosThatMeanNothingHereStayAndAreReported) {
   check("$E(a(b)-c)x", "$E_a_b__c_x", "'$E'", true);
   for (const std::string name : {"task", "Time2ms", "", "Type ", "$"})
     check("a$(" + name + ")b", "a__" + name + "_b", "$" + name, false);
+  Id cooked = identifier("$S:raw");
+  for (const auto name : {Id::eFormalName, Id::eActualName})
+    cooked.setCookedName("$P$Q$(Task)$(Foo)", name);
+  clearMessages();
+  expandId(cooked);
+  for (const std::string& message : messages())
+    EXPECT_THAT(message, HasSubstr(" macro in the $S name template is "));
+  EXPECT_EQ(messages().size(), 4U);
   std::string known =
       "Task ISR Msg Ctr Event MsgVar PObj Section Module FunctionName "
       "DataVariantName PageNumber VariantItemName Time Period Offset";
@@ -106,6 +116,15 @@ TEST_F(NameEngineTest, ContextFollowsTheReferences) {
   EXPECT_EQ(expand("$I", nullptr), "o");
   HxCGlobal::setIvData(&ivData);
   EXPECT_EQ(expand("$I$S", nullptr), "pSp0");
+  HX_BcPartitionContext nameless("");
+  for (HX_BcPartitionContext* context :
+       {&nameless, static_cast<HX_BcPartitionContext*>(nullptr)}) {
+    HX_BdPartition without(context);
+    HxCIvData other(&without);
+    HxCGlobal::setIvData(&other);
+    EXPECT_EQ(expand("$I", nullptr), "o");
+  }
+  HxCGlobal::setIvData(&ivData);
   EXPECT_EQ(expand("$C_$B_$I_$O", mode.getSrcRef()), "Cc4_Mode_c_Mode_chart");
   event.setHierarchy("a.b");
   EXPECT_EQ(expand("$C_$B_$H_$O", object), "Cc7_Mode_a.b_go_");
@@ -116,9 +135,19 @@ TEST_F(NameEngineTest, ContextFollowsTheReferences) {
             "Speed_Gain_Sa3_$Q 1203");
   EXPECT_THAT(messages().back(), EndsWith("[car/Ctrl/Speed Gain]"));
   gain.setNamedThroughParent(true);
-  EXPECT_EQ(expand("$B_$S"), "Ctrl_Sa3");
-  car.setSubsystem("r", 0x80000000U);  // reads as signed
-  EXPECT_EQ(expand("$S", car.getSrcRef()), "Sr0");
+  EXPECT_EQ(expand("$B_$S$Q"), "Ctrl_Sa3$Q 1203");
+  EXPECT_THAT(messages().back(), EndsWith("[car/Ctrl/Speed Gain]"));
+  // The parent, not the block, is asked for a chart.
+  HX_StateflowBlock inner("Inner", &mode);
+  SC_State innerState(3, 5, "Inner chart", &chart);
+  inner.setChartState(&innerState);
+  EXPECT_EQ(expand("$O", inner.getSrcRef()), "Inner_chart");
+  inner.setNamedThroughParent(true);
+  EXPECT_EQ(expand("$O", inner.getSrcRef()), "Mode_chart");
+  for (const unsigned int number : {0x80000000U, 0xFFFFFFFFU}) {
+    car.setSubsystem("r", number);  // reads as signed
+    EXPECT_EQ(expand("$S", car.getSrcRef()), "Sr0");
+  }
   car.setSubsystem("", 0x7FFFFFFFU);
   EXPECT_EQ(expand("$S", car.getSrcRef()), "S2147483647");
 }
@@ -132,6 +161,7 @@ TEST_F(NameEngineTest, EmptyTemplateTakesTheDefaultOfItsObject) {
   quiet = true;
   EXPECT_EQ(expand(""), "Sa3_Speed_Gain");
   EXPECT_EQ(expand("", nullptr), "_S__B 7");
+  EXPECT_THAT(messages().back(), MatchesRegex(kAssertion));
 }
 
 TEST_F(NameEngineTest, ActualNameFollowsTheFormalOne) {
@@ -145,7 +175,7 @@ TEST_F(NameEngineTest, ActualNameFollowsTheFormalOne) {
       {"a:b$R", "a:b", ":R"},
       {"a$R:b", "a:b", "R:"},
       {"a:a$R$R", "a", ":R"},
-      // A copy has no scan of its own, but the expanded text may say it.
+      // The expanded text answers for a copy.
       {"$L$N", "Speed_GainCtrl", "LN:R"},
       {"$L$N:$L$N$R", "Speed_GainCtrl", "LN:R"},
       {"$L$N:$R$L$N", "Speed_GainCtrl", "LN:R"},
@@ -155,6 +185,16 @@ TEST_F(NameEngineTest, ActualNameFollowsTheFormalOne) {
     EXPECT_EQ(expand(form), result);
     EXPECT_EQ(noted, notes) << form;
   }
+}
+
+TEST_F(NameEngineTest, FlagsSetBeforeStay) {
+  Id id = identifier("a:b");
+  for (const auto name : {Id::eFormalName, Id::eActualName}) {
+    id.setIdentifierChangeable(true, name);
+    id.setDollarEUsed(true, name);
+  }
+  expandId(id);
+  EXPECT_EQ(noted, "RE:RE");
 }
 
 TEST_F(NameEngineTest, OnlyLevelTwoIsLeftAloneAndReached) {

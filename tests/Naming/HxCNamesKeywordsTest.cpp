@@ -4,7 +4,10 @@
 
 namespace {
 
+using testing::Each;
 using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::MatchesRegex;
 
 class KeywordsTest : public HX_NamingFixture {
  protected:
@@ -38,10 +41,11 @@ TEST_F(KeywordsTest, TheLastEntryOfAWordCounts) {
   EXPECT_FALSE(isValid("UInt8"));
   names.addToKeywordDict("UInt8", HxCNames::eDictUserTypeName);
   names.addToKeywordDict("int", HxCNames::eDictUserTypeName);
-  EXPECT_FALSE(isValid("UInt8") || isValid("int"));
+  EXPECT_FALSE(isValid("UInt8"));
+  EXPECT_FALSE(isValid("int"));
   HxCNames::boot();
   EXPECT_TRUE(isValid("UInt8"));
-  const std::string odd(64, 'w');  // longer than what is noted
+  const std::string odd(64, 'w');  // longer than the filter counts
   names.addToKeywordDict(odd.c_str(),
                          static_cast<HxCNames::tagHxEDictEntryType>(3));
   const auto& reports = recordDebugReports();
@@ -59,7 +63,30 @@ TEST_F(KeywordsTest, WithoutADictionaryEveryUseIsAsserted) {
   names.addToKeywordDict("x", HxCNames::eDictCKeyword);
   EXPECT_TRUE(isValid("int"));
   EXPECT_FALSE(isValid("1"));
+  EXPECT_FALSE(isValid(""));
   EXPECT_EQ(messages().size(), 3U);
+  EXPECT_THAT(messages(), Each(MatchesRegex(kAssertion)));
+}
+
+TEST_F(KeywordsTest, TheReasonIsToldWithoutAMessage) {
+  names.addToKeywordDict("Base", HxCNames::eDictBaseTypeName);
+  names.addToKeywordDict("a-b", HxCNames::eDictUserTypeName);
+  names.addToKeywordDict("odd", static_cast<HxCNames::tagHxEDictEntryType>(3));
+  recordDebugReports();
+  const std::pair<const char*, HxCNames::HxEVariableNameTag> rows[] = {
+      {"x", HxCNames::eVariableNameValid},
+      {"", HxCNames::eVariableNameEmpty},
+      {"int", HxCNames::eVariableNameCKeyword},
+      {"Base", HxCNames::eVariableNameBaseType},
+      {"a-b", HxCNames::eVariableNameUserType},
+      {"odd", HxCNames::eVariableNameOtherWord},
+      {"a+b", HxCNames::eVariableNameNoCIdentifier}};
+  for (const auto& [text, answer] : rows)
+    EXPECT_EQ(HxCNames::checkCVariableName(text), answer) << text;
+  HxCNames::shutdown();
+  EXPECT_EQ(HxCNames::checkCVariableName("int"), HxCNames::eVariableNameValid);
+  EXPECT_THAT(recordDebugReports(), IsEmpty());
+  EXPECT_THAT(messages(), IsEmpty());
 }
 
 TEST_F(KeywordsTest, FileNamesAreCheckedCharacterByCharacter) {
@@ -77,7 +104,7 @@ TEST_F(KeywordsTest, FileNamesAreCheckedCharacterByCharacter) {
   EXPECT_FALSE(names.isFileNameValid(id));
 }
 
-// The code behind this one: the first letter counts fastest.
+// The next code: the first letter counts fastest.
 void countUp(std::string& code) {
   for (char& letter : code) {
     if (++letter <= 'z') return;
@@ -97,7 +124,7 @@ TEST_F(KeywordsTest, SuffixesCountInLettersBehindWhatFits) {
     const std::size_t room = isLimited ? 30 - code.size() : length;
     ASSERT_EQ(name.cstring(),
               std::string(std::min(length, room), 'n') + "_" + code);
-    if (index >= 0) countUp(code);  // a negative one counts as 0
+    if (index >= 0) countUp(code);  // a negative index counts as 0
   }
 }
 

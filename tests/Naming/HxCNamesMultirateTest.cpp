@@ -9,6 +9,7 @@
 namespace {
 
 using testing::ElementsAre;
+using testing::EndsWith;
 using testing::HasSubstr;
 
 class MultirateTest : public HX_NamingFixture {
@@ -47,7 +48,7 @@ TEST_F(MultirateTest, TimesAreRoundedAndReportedWhereTheyAreUsed) {
       {"$(Period1d)", kLargest, 0, "2147483647 1206"},
       {"$(Offset1d)", 0, -HUGE_VAL, "2147483647 1206"},
       {"$(Period1d)", std::nan(""), 0, "2147483647 1206"}};
-  // Its decimal comma must not show; nothing happens where it is not installed.
+  // The decimal comma must not show. Without the locale nothing happens.
   std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
   for (const auto& [form, period, offset, result] : rows)
     EXPECT_EQ(time(form, period, offset), result) << form;
@@ -80,8 +81,12 @@ TEST_F(MultirateTest, EachUnitHasItsMacros) {
       const std::string all = text + "/1/" + text + "_1";
       const double period = count * seconds;
       EXPECT_EQ(time(form, period, seconds), all);
-      for (const double off : {-0.49 * seconds, 0.49 * seconds})
+      for (const double off : {-0.49 * seconds, 0.49 * seconds}) {
         EXPECT_EQ(time(form, period + off, seconds), all + " 1206 1206");
+        EXPECT_THAT(messages().back(),
+                    HasSubstr("'Period' with the time base " + unit + " is"));
+        clearMessages();
+      }
       if (unit.find('0') != unit.npos) continue;
       EXPECT_EQ(time("$(Period)", period, 0), text + unit.substr(1));
     }
@@ -99,6 +104,32 @@ TEST_F(MultirateTest, NoncyclicTasksHaveNoTime) {
                           "[car/Ctrl/Speed Gain]"));
 }
 
+TEST_F(MultirateTest, MessagesShowTheActiveRawNameAndSomeReference) {
+  const HxCDdSrcRef ddRef(HX_DdTree::instance().add("//DD0/Pool/K"));
+  Id id("$(Time)$(Task):$(Task)_$(Time1s)$(Period)");
+  id.setDdSourceRef(&ddRef);
+  id.activateActualName();
+  for (const bool cyclic : {false, true}) {
+    Id named(id);
+    names.replaceMultirateTaskISRName(named, Id(), Id(), true);
+    names.replaceMultirateTimeName(named, 0.1234567, 0, cyclic);
+  }
+  const std::string raw = "$(Task)_$(Time1s)$(Period)";
+  const std::string ofTask =
+      "1204/2 The $Task name macro is used in the task "
+      "name template " +
+      raw +
+      ". This is not allowed. "
+      "[//DD0/Pool/K]";
+  EXPECT_THAT(messages(),
+              ElementsAre(ofTask,
+                          "1205/2 A time/period/offset name macro is used in a "
+                          "noncyclic task. Name template: " +
+                              raw + " [//DD0/Pool/K]",
+                          ofTask, EndsWith("time base. [//DD0/Pool/K]"),
+                          EndsWith("$(Time) name macro. [//DD0/Pool/K]")));
+}
+
 TEST_F(MultirateTest, TasksAndIsrsStandInForEachOther) {
   const Id task("fast task:fast task"), isr("irq-1:irq-1");
   const auto replace = [&](const Id& used, bool isTaskName) {
@@ -108,6 +139,10 @@ TEST_F(MultirateTest, TasksAndIsrsStandInForEachOther) {
   };
   EXPECT_EQ(replace(task, false), "fast_task/irq_1:x");
   EXPECT_EQ(replace(Id(), false), "irq_1/irq_1:x");
+  Id half("fast task:");  // the active name decides
+  EXPECT_EQ(replace(half, false), "fast_task/irq_1:x");
+  half.activateActualName();
+  EXPECT_EQ(replace(half, false), "irq_1/irq_1:x");
   EXPECT_EQ(replace(task, true), "__Task_/irq_1:x 1204");
   EXPECT_THAT(messages(),
               ElementsAre("1204/2 The $Task name macro is used in the task "
@@ -127,16 +162,15 @@ TEST_F(MultirateTest, ObjectsAreMadeCIdentifiers) {
   names.replaceMultirateMsgName(id, value);
   names.replaceMultirateCtrName(id, value);
   EXPECT_EQ(shown(id), "a_ba_ba_ba_ba_b$(MsgVar):x");
-  // Of a text, what $(MsgVar) stands for; its macros count as used.
-  const std::tuple<const char*, const char*, const char*> rows[] = {
-      {"abc", "<1>:x", ":"},      {"msg#7;", "<7>:x", ":"},
-      {"a#b#12x", "<12>:x", ":"}, {"a#", "<>:x", ":"},
-      {"#a b;", "<a b>:x", ":"},  {"", "<1>:x", ":"},
-      {"a#$N;", "<$N>:x", "N:"}};
-  for (const auto& [message, result, notes] : rows) {
-    Id variable("<$(MsgVar)>:x");
+  // Text, text of $(MsgVar), notes of the macros in the text.
+  const std::tuple<const char*, std::string, const char*> rows[] = {
+      {"abc", "1", ":"},    {"msg#7;", "7", ":"},  {"a#b#12x", "12", ":"},
+      {"a#", "", ":"},      {"#a b;", "a b", ":"}, {"", "1", ":"},
+      {"a#$N;", "$N", "N:"}};
+  for (const auto& [message, text, notes] : rows) {
+    Id variable("<$(MsgVar)>:$(MsgVar)");
     names.replaceMultirateMsgVarName(variable, message);
-    EXPECT_EQ(shown(variable), result) << message;
+    EXPECT_EQ(shown(variable), "<" + text + ">:" + text + "$R") << message;
     variable.setCookLevel(Id::eCookLevelFull);
     EXPECT_EQ(notedOf(variable), notes);
   }

@@ -31,12 +31,13 @@ TEST_F(SubstitutionTest, EveryShortTemplateIsSubstitutedAsPlainly) {
 }
 
 TEST_F(SubstitutionTest, FlagsAndLevelsAreTakenOver) {
-  // Template and level, macro, value and level -> names, what is noted, level.
+  // Template and level, macro, value and level -> names, notes, level.
   const char* const rows[][4] = {
       {"a:$b 0", "m", "v:$N 0", "a:$b : 0"},  // the value's active name counts
       {"a:b 0", "m", "$L$E$N: 0", "a:b LEN: 0"},
       {"a:b 0", "m", "v:w 1", "a:b : 1"},  // only level 1 raises, only level 0
       {"a:b 2", "m", "v:w 1", "a:b : 2"},
+      {"a:b 3", "m", "v:w 1", "a:b : 3"},
       {"a:b 0", "m", "v:w 2", "a:b : 0"},
       {"a:b 3", "E", "v:w 0", "a:b : 1"},  // E sets level 1 in any case
       {"$e:b 2", "e", "v:w 0", "v:b E: 1"},
@@ -89,8 +90,10 @@ TEST_F(SubstitutionTest, FileNamesExpandWhatIsKnownWithoutAnObject) {
       {"$B_$S$R", false, true, "Speed_Gain_Sa3", true},
       {"$L$H$O$C$D$T$X", false, true, "$L$H$O$C$D$T$X", false},
       {"$(Type)", false, true, "$(Type)", false}};
+  HX_BdBlock ivBlock("iv", gain.getSrcRef());  // counts as no object
   for (const auto& [form, ofModel, hasBlock, result, isComplete] : rows) {
     Id id = identifier(form, hasBlock ? gain.getSrcRef() : nullptr);
+    if (!ofModel) id.setSourceIVBlock(&ivBlock);
     EXPECT_EQ(names.handleFileNameMacro(id, ofModel), isComplete) << form;
     EXPECT_EQ(shown(id), result);
   }
