@@ -322,22 +322,26 @@ const HxCNames::MacroRow* HxCNames::findMacro(unsigned short letter) {
                  &Scan::suppressMessages>},
   };
   static constexpr int kCodes = 128;
+  // Letter -> position in kRows, from 1; 0: no row. Not pointers, because the
+  // sanitizers of g++ do not compare pointers at compile time.
   static constexpr auto kRowOfLetter = [] {
-    std::array<const MacroRow*, kCodes> rows{};
+    std::array<std::uint8_t, kCodes> rows{};
+    std::uint8_t position = 0;
     for (const MacroRow& row : kRows)
-      rows[static_cast<unsigned char>(row.text[1])] = &row;
+      rows[static_cast<unsigned char>(row.text[1])] = ++position;
     return rows;
   }();
   static_assert(
       [] {
         for (const HX_Macro& macro : hx_macros::kLetters)
-          if ((kRowOfLetter[static_cast<unsigned char>(macro.text[1])] !=
-               nullptr) != (macro.stage == hx_macros::kTemplate))
+          if ((kRowOfLetter[static_cast<unsigned char>(macro.text[1])] != 0) !=
+              (macro.stage == hx_macros::kTemplate))
             return false;
         return true;
       }(),
       "the rows are the letters of the template stage");
-  return letter < kCodes ? kRowOfLetter[letter] : nullptr;
+  if (letter >= kCodes || kRowOfLetter[letter] == 0) return nullptr;
+  return &kRows[kRowOfLetter[letter] - 1];
 }
 
 // $$
