@@ -59,3 +59,17 @@ int HX_FailingHeap::liveBlocks() const { return s_Live - m_LiveAtStart; }
                                        const std::nothrow_t&) noexcept {
   release(block);
 }
+// The sanitizers replace the forms for arrays, which would not call the above.
+[[gnu::noinline]] void* operator new[](std::size_t size) {
+  return operator new(size);
+}
+[[gnu::noinline]] void* operator new[](std::size_t size,
+                                       const std::nothrow_t&) noexcept {
+  return allocate(size);
+}
+[[gnu::noinline]] void operator delete[](void* block) noexcept {
+  release(block);
+}
+[[gnu::noinline]] void operator delete[](void* block, std::size_t) noexcept {
+  release(block);
+}
