@@ -1,6 +1,7 @@
 #include "host/import/HX_NameItems.h"
 
-#include <cmath>
+#include <charconv>
+#include <map>
 
 #include "host/import/HX_Dictionary.h"
 #include "host/import/HX_Literals.h"
@@ -52,8 +53,7 @@ bool isWiringOfChart(const HX_ModelBlock& block) {
 
 std::string numberText(double value) {
   char text[32];
-  std::snprintf(text, sizeof text, "%.12g", value);
-  return text;
+  return {text, std::to_chars(text, text + sizeof text, value).ptr};
 }
 
 }  // namespace
@@ -159,17 +159,21 @@ void HX_NameItems::addState(const HX_ModelBlock& block, const Context& place) {
           place);
 }
 
+// By name: the order in the file has no influence. Of equal names the first
+// holder counts.
 void HX_NameItems::addParameters(const HX_ModelBlock& block,
                                  const Context& place) {
-  for (const std::string& parameter : m_Rules.parameters()) {
-    for (const pugi::xml_node holder :
-         {block.node, block.node.child("InstanceData"), block.linked}) {
-      const char* text = HX_FindParameter(holder, parameter);
-      if (text == nullptr) continue;
-      addParameter(block, place, parameter, HX_Trimmed(text));
-      break;
+  std::map<std::string_view, std::string_view> found;
+  for (const pugi::xml_node holder :
+       {block.node, block.node.child("InstanceData"), block.linked}) {
+    for (const pugi::xml_node p : holder.children("P")) {
+      const std::string_view parameter = p.attribute("Name").value();
+      if (m_Rules.parameters().find(parameter) != m_Rules.parameters().end())
+        found.emplace(parameter, p.child_value());
     }
   }
+  for (const auto& [parameter, text] : found)
+    addParameter(block, place, parameter, HX_Trimmed(text));
 }
 
 void HX_NameItems::addParameter(const HX_ModelBlock& block,
