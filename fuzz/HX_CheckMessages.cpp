@@ -1,4 +1,4 @@
-// Each row of the catalogue with arbitrary arguments.
+// Every row of the catalogue with arbitrary arguments.
 #include <cstdio>
 #include <cstdlib>
 #include <iterator>
@@ -14,7 +14,7 @@ namespace {
 constexpr int kRows = static_cast<int>(std::size(kErrCatalogue));
 constexpr ERR_CatalogueRow kUnknown{4711, 0, "", 0, ""};
 
-// A row with its severity and source; gives the text that it must have.
+// A row with severity and source; emit() returns the expected text.
 struct Report {
   ERR_CatalogueRow row;
   int severity;
@@ -27,7 +27,7 @@ struct Report {
     ERR_EmitErrorMessage(severity, srcRef, row.number, arguments...);
     return text;
   }
-  // With what fits the row; texts that it does not ask for do no harm.
+  // With arguments that fit the row. Surplus texts do no harm.
   std::string emitFrom(HX_Bytes& bytes) const {
     std::string kinds, lines[4];
     const char* rest = row.text;

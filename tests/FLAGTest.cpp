@@ -16,7 +16,7 @@ using testing::StartsWith;
 
 enum : unsigned int { kA = 1, kB = 2, kC = 4, kD = 8 };
 
-// A excludes B, C and D, whose name is missing; D's bit 4 has no row.
+// A excludes B, C and D. C and D have no name. D excludes bit 4, without a row.
 const FLAG_flag_info kRows[] = {
     {kB | kC | kD, "A"}, {kA, "B"}, {kA, ""}, {kA | 16, nullptr}};
 
@@ -81,7 +81,7 @@ TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
   const struct {
     const char* why;
     unsigned int held, flag;
-    int conflicts;               // what CheckFlag and SaveSetFlag return
+    int conflicts;               // results of CheckFlag and SaveSetFlag
     unsigned int saved, forced;  // the field after SaveSetFlag, ForceSetFlag
     bool asserts;
     std::string reported;  // empty for no report
@@ -97,7 +97,8 @@ TEST_F(FLAGTest, ConflictsAreReportedAndDecideTheSetting) {
        kNoRow, kNoRow, kNoRow, true, "<unknown flag name> excludes flag(s): "},
       {"flag 0 has row 0", kB, 0, kB, kB, kB, false, "A excludes flag(s): B "},
       {"no row", kA, kNoRow, 0, kA, kA | kNoRow, true, ""}};
-  unsigned int field, seen;  // the latter by who receives the last message
+  unsigned int field,
+      seen;  // seen: as the receiver of the message finds the field
   HX_MessageHandler::instance().setSink(
       [&](const HX_Message&) { seen = field; });
   const auto assertion =

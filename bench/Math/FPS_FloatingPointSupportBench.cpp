@@ -1,5 +1,5 @@
-// Each floating-point operation beside the bare calls of the C run-time that it
-// must make. One item is one call.
+// Floating-point operations beside the bare calls of the C run-time in them.
+// An item is a call.
 
 #include "Math/FPS_FloatingPointSupport.h"
 
@@ -14,7 +14,7 @@
 
 namespace {
 
-// Half of them integers, as periods and limits often are.
+// Half of the values are integers, as many periods and limits are.
 std::vector<double> values(double scale) {
   std::mt19937_64 random(20260722);
   std::vector<double> result(1024);
@@ -35,7 +35,7 @@ void measure(benchmark::State& state, Operation operation) {
                           static_cast<std::int64_t>(xs.size()));
 }
 
-// One line per operation: its benchmark and that of its bare calls.
+// A line per operation: benchmark of the operation and of the bare calls.
 #define HX_BENCH(name, ours, bare)                 \
   void BM_FPS_##name(benchmark::State& state) {    \
     measure(state, [](double x) { return ours; }); \
@@ -68,7 +68,7 @@ HX_BENCH(ASinh, FPS_ASinh(x), std::log(std::sqrt(x)));
 HX_BENCH(ACosh, FPS_ACosh(x), std::log(std::sqrt(x)));
 HX_BENCH(ATanh, FPS_ATanh(x / 2048.0), std::log(x));
 
-// The report of every step is part of the divisor; the bare chain makes it too.
+// The divisor reports every step; the bare chain makes the same reports.
 void BM_FPS_GreatestCommonDivisor(benchmark::State& state) {
   for (auto _ : state) {
     double pair[] = {48000.0, 44100.0};

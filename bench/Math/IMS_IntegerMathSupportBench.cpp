@@ -1,5 +1,5 @@
 // Divisors, multiples, logarithms and conversions to and from big integers,
-// each beside the libraries' own. One item is one operand, or one pair of them.
+// beside the operations of other libraries. An item is an operand or a pair.
 
 #include "Math/IMS_IntegerMathSupport.h"
 

@@ -1,8 +1,8 @@
-// Sets of references beside vectors that skip what they hold already.
+// Sets of references beside vectors that skip references already present.
 //
-// One item is one set: made empty, filled with the given number of different
-// references, walked once, and destroyed. The last group measures how the
-// server's references come with their number: one item is one reference.
+// An item is a set: made empty, filled with the given number of different
+// references, walked once, and destroyed. The last group measures the cost of a
+// reference of the server by the number of references: an item is a reference.
 
 #include <benchmark/benchmark.h>
 
@@ -45,7 +45,7 @@ void walk(const Set& set, std::uintptr_t& sum) {
   });
 }
 
-// The same through the iterator that callers of the library's own kind use.
+// The same through an iterator, as callers of the library walk a set.
 struct IteratedSet : HxCSrcRefSet {};
 void walk(const IteratedSet& set, std::uintptr_t& sum) {
   const std::unique_ptr<HX_Iterator<const HxCSrcRef*>> it(set.createIterator());
@@ -105,7 +105,7 @@ BENCHMARK(BM_SrcRefSet_BuildAndWalk)->HX_SIZES;
 BENCHMARK(BM_SrcRefSet_BuildAndIterate)->HX_SIZES;
 BENCHMARK(BM_StdVector_BuildAndWalk)->HX_SIZES;
 BENCHMARK(BM_InlinedVector_BuildAndWalk)->HX_SIZES;
-// Few enough that the C heap does not return their pages after each round.
+// Few references, so that the C heap keeps the pages between rounds.
 BENCHMARK(BM_SrcRefServer_GetSrcRef)->Arg(64)->Arg(512);
 
 }  // namespace

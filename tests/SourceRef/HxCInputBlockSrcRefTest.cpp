@@ -11,14 +11,14 @@
 
 namespace {
 
-// Counts the reads and spoils one of them.
+// Model that counts reads and spoils a single read.
 class FaultyTree : public HX_SimulinkTree {
  public:
   mxArray* getParameter(const mxArray* object,
                         const KyCXString& parameter) const override {
     if (reads++ != spoiledRead)
       return HX_SimulinkTree::getParameter(object, parameter);
-    // A structure is neither a name nor a handle, and no block's.
+    // A structure is no name, no handle and no block.
     return givesNull ? nullptr : mxCreateStructMatrix(1, 1, {});
   }
 
@@ -28,7 +28,7 @@ class FaultyTree : public HX_SimulinkTree {
 };
 
 constexpr std::size_t kBlocks = 40;
-constexpr std::size_t kNone = kBlocks;  // what a model has for a parent
+constexpr std::size_t kNone = kBlocks;  // the parent of a model
 
 class InputBlockTest : public HX_TestFixture {
  protected:
@@ -38,7 +38,7 @@ class InputBlockTest : public HX_TestFixture {
     GLB_SetFullSystemPath("");
   }
 
-  // The text of a block and the number of reads that it took.
+  // The text of a block and the number of reads for the text.
   std::string textOf(double handle) {
     HX_BlockDataBase blocks;
     blocks.setSlBlockHandle(7, handle);
@@ -61,7 +61,7 @@ class InputBlockTest : public HX_TestFixture {
     for (;;) {
       const int spoiled = m_Tree.spoiledRead - reads;
       reads += 4;
-      // An unknown parent is noticed only by the step that asks it.
+      // An unknown parent fails in the next step only.
       const int noticed = m_Tree.givesNull ? 4 : 3;
       const bool success =
           block != kNone && (spoiled < 0 || spoiled >= noticed);
@@ -83,8 +83,8 @@ class InputBlockTest : public HX_TestFixture {
   std::vector<std::string> m_Expected;  // reports
 };
 
-// Every block of a damaged model, some of whose parents form loops, while one
-// of the reads fails.
+// Every block of a damaged model, in which some parents form loops. In every
+// climb a single read fails.
 TEST_F(InputBlockTest, TextIsTheJoinedNamesFromTheSystemDown) {
   const unsigned seed = HX_Seed();
   SCOPED_TRACE(seed);

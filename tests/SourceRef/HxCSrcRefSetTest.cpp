@@ -24,7 +24,7 @@ using IteratorPtr = std::unique_ptr<HX_Iterator<const HxCSrcRef*>>;
 
 using SrcRefSetTest = HX_TestFixture;
 
-// Compares all that a set tells with the plain form.
+// Compares all answers of a set with the plain form.
 void expectHolds(const HxCSrcRefSet& set, const SrcRefs& expected) {
   ASSERT_EQ(set.getSrcRefCnt(), static_cast<int>(expected.size()));
   EXPECT_EQ(set.getASrcRef(), expected.empty() ? nullptr : expected.front());
@@ -43,7 +43,7 @@ void expectHolds(const HxCSrcRefSet& set, const SrcRefs& expected) {
   }
 }
 
-// Every second step one of the next three blocks is missing. A refused step
+// In every second step one of the next three blocks is missing. A refused step
 // changes nothing; a set of at most one reference asks for no block.
 TEST_F(SrcRefSetTest, RandomWalkAgreesWithAPlainVector) {
   HX_CountingController memory;
@@ -146,8 +146,8 @@ class SrcRefKindsTest : public HX_TestFixture {
 };
 
 TEST_F(SrcRefKindsTest, ServerSortsTheReferencesOfASet) {
-  // The references of a set; of them a block, one of the data dictionary and
-  // another.
+  // The references of a set; the results for blocks, for the data dictionary
+  // and for the rest.
   const std::string rows[][2] = {{"", "000"},
                                  {"bxi", "bxi"},
                                  {"xwip", "0wp"},
@@ -176,7 +176,7 @@ TEST_F(SrcRefKindsTest, ServerSortsTheReferencesOfASet) {
 
 TEST_F(SrcRefKindsTest, PairsAreCompared) {
   // d both from the data dictionary, D different, u both from user scripts, n
-  // neither; o only one, followed by which: 7 where it is not written.
+  // none from a user script; o only one, then the number: 7 if not written.
   const std::string rows[][2] = {{"xy", "dDu7"}, {"xx", "du7"},  {"xw", "dD7"},
                                  {"wx", "dD7"},  {"vw", "dDn7"}, {"wW", "d7"},
                                  {"w0", "o0"},   {"0w", "o1"},   {"wp", "o0"},

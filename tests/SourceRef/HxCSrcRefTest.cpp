@@ -30,7 +30,7 @@ std::string textOf(const HxCSrcRef& ref) {
   return text.cstring();
 }
 
-// One letter per kind query that names this reference.
+// A letter for every kind query that answers the reference.
 std::string kindsOf(const HxCSrcRef& ref) {
   const HxCSrcRef* self = &ref;
   std::string kinds;
@@ -59,10 +59,10 @@ std::string cloneLooks(const HxCSrcRef& original) {
   return looks(*std::unique_ptr<HxCSrcRef>(original.clone()), original);
 }
 
-// Before any other reference of this program.
+// The first reference of the program.
 const int kFirstNumber = HxCSrcRef().getSrcRefId();
 
-// other: what an assignment overwrites.
+// other: overwritten by an assignment.
 template <class T>
 void expectRules(const T& original, T other, const std::string& own,
                  const std::string& cloned) {
@@ -175,7 +175,7 @@ TEST_F(SrcRefTest, DumpWritesOneSectionWithTheText) {
   EXPECT_EQ(ref.dump(&dump, true), &dump);
 }
 
-// The dump() for const objects writes nothing, so nobody may call it.
+// The dump() for const objects writes nothing: a call must not compile.
 template <class T>
 constexpr bool kIsDumped = requires(T& ref, HX_Dump* dump) {
   ref.dump(dump, true);
@@ -183,8 +183,8 @@ constexpr bool kIsDumped = requires(T& ref, HX_Dump* dump) {
 static_assert(kIsDumped<HxCSrcRef> && !kIsDumped<const HxCSrcRef> &&
               kIsDumped<HxCDdSrcRef> && !kIsDumped<const HxCDdSrcRef>);
 
-// References with texts too long to live inside a string, so that each copy
-// asks for memory.
+// References with texts longer than a string holds inside: every copy asks for
+// memory.
 struct LongModel {
   LongModel() {
     state.setSFName(text);

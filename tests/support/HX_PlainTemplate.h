@@ -18,8 +18,8 @@ inline std::vector<std::string> HX_TextsUpTo(std::size_t length,
   return texts;
 }
 
-/// The end of what starts at \p at: a character, "$" and a character, "$(" up
-/// to ")" or the end, or "$E" and its group in parentheses.
+/// The end of the token at \p at: a character, "$" and a character, "$(" up to
+/// ")" or the end, or "$E" and the group in parentheses.
 inline std::size_t HX_PlainTokenEnd(const std::string& form, std::size_t at) {
   if (form[at] != '$') return at + 1;
   const char letter = at + 1 < form.size() ? form[at + 1] : '\0';
@@ -45,7 +45,7 @@ inline std::string HX_InCase(std::string text, int (*change)(int)) {
   return text;
 }
 
-/// What HxCNames::substAllDollarZByValue() makes of one name.
+/// The result of HxCNames::substAllDollarZByValue() for one name.
 /// \param kind  HxCNames::tagMacroKindEnum
 inline std::string HX_PlainSubstitution(const std::string& form,
                                         const std::string& macro,
