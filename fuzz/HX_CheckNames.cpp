@@ -1,4 +1,4 @@
-// Names of an arbitrary model on their whole road from template to C name.
+// Names of an arbitrary model on the whole road from template to C name.
 #include <cmath>
 #include <cstdlib>
 #include <set>
@@ -105,7 +105,7 @@ KyCXString bothNames(const Id& id) {
          id.getCookedName(Id::eActualName);
 }
 
-// What one name is for.
+// Arguments of one name.
 struct Item {
   Item(Model& model, HX_Bytes& bytes)
       : isFormalActive(model.choices.flag()),
@@ -150,7 +150,8 @@ struct Item {
   unsigned int provisional = 0;
 };
 
-// A name is the sum of what its literal texts and macros give by themselves.
+// A name is the sum of the expansions of the literal texts and macros in the
+// template.
 void checkSum(const Item& item, const std::string& form) {
   if (form.empty()) return;  // stands for a default
   HxCNames names;
@@ -170,9 +171,9 @@ void checkSum(const Item& item, const std::string& form) {
   HX_Require(item.expand(names, whole) == complete, "complete as the parts");
   HX_Require(whole.getCookedName(Id::eFormalName) == sum,
              "the parts give " + std::string(sum.cstring()));
-  HX_Require(whole.getIdentifierChangeable(Id::eFormalName) == changeable &&
-                 messageCount() == 2 * messages,
-             "changeable as the parts, with their messages");
+  HX_Require(whole.getIdentifierChangeable(Id::eFormalName) == changeable,
+             "changeable as the parts");
+  HX_Require(messageCount() == 2 * messages, "the messages of the parts");
 }
 
 void checkSubstitution(int kind, const Item& item, std::string form) {
@@ -203,7 +204,7 @@ void substitute(Model& model, HX_Bytes& bytes, const Item& item, Id& id) {
   names.replaceMultirateMsgVarName(id, item.x);
 }
 
-// Expanded and made a C name of at most the length allowed.
+// Expands and makes a C name of at most the length allowed.
 void checkRoad(Model& model, const Item& item, Id& id) {
   HxCNames names;
   const bool isFile = model.choices.below(8) == 7;
@@ -214,8 +215,9 @@ void checkRoad(Model& model, const Item& item, Id& id) {
   expand();
   const KyCXString once = bothNames(id);
   const std::size_t messages = messageCount();
-  HX_Require(expand() && bothNames(id) == once && messageCount() == messages,
-             "a name expanded in full is left alone");
+  HX_Require(expand(), "a name expanded in full is complete");
+  HX_Require(bothNames(id) == once, "a name expanded in full is left alone");
+  HX_Require(messageCount() == messages, "no message about a name left alone");
   id.makeCIdentifier();
   id.adaptSize();
   const bool mayBeLong = !id.getIdentifierChangeable(Id::eActiveName) ||
@@ -232,12 +234,19 @@ void checkRoad(Model& model, const Item& item, Id& id) {
   HX_Require(bothNames(again) == bothNames(id), "a C name is left alone");
 }
 
-// The variant of a name that is no word of C and was not given before.
+// Derives a variant of a name: no word of C, and not given before.
 void checkVariant(HX_LimitedNameSpace& taken, std::set<std::string>& given,
                   const KyCXString& wanted, bool isLimited) {
   HxCNames names;
   KyCXString variant = wanted;
-  for (int i = 0; !names.isStringValidCVariableName(variant); ++i) {
+  const auto isFree = [&names](const KyCXString& text) {
+    const bool isValid =
+        HxCNames::checkCVariableName(text) == HxCNames::eVariableNameValid;
+    HX_Require(names.isStringValidCVariableName(text) == isValid,
+               "the report and the silent answer agree");
+    return isValid;
+  };
+  for (int i = 0; !isFree(variant); ++i) {
     variant = wanted;
     names.appendSuffix(variant, i);
   }
@@ -251,7 +260,7 @@ void checkVariant(HX_LimitedNameSpace& taken, std::set<std::string>& given,
 
 }  // namespace
 
-// The first line chooses, then come the texts of the model and of each name.
+// The first line chooses; the texts of the model and of all names follow.
 void HX_CheckNames(HX_Bytes& bytes) {
   constexpr int kNames = 40;
   Model model(bytes);

@@ -1,5 +1,5 @@
-// Expansion and substitution of name templates, the keyword check and suffixes.
-// One item of work is one name, unless a comment says otherwise.
+// Expansion and substitution of name templates, keyword check and suffixes.
+// Item of work: one name, unless a comment says otherwise.
 
 #include "Naming/HxCNames.h"
 
@@ -26,7 +26,7 @@ namespace {
 constexpr auto kFormal = HxCCIdentifier::eFormalName;
 constexpr auto kActual = HxCCIdentifier::eActualName;
 
-// "Sa3_Gain_Ctrl_plant_ab" from four macros, the values at hand in the model.
+// "Sa3_Gain_Ctrl_plant_ab" from four macros with values in the model.
 struct Model {
   Model() {
     GLB_SetModelName("plant");
@@ -57,7 +57,7 @@ void BM_HxCNames_ExpandFourMacros(benchmark::State& state) {
 }
 BENCHMARK(BM_HxCNames_ExpandFourMacros);
 
-// One item is one macro.
+// Item of work: one macro.
 void BM_HxCNames_ExpandManyMacros(benchmark::State& state) {
   KyCXString form;
   for (int i = 0; i < state.range(0); ++i) form += i % 2 == 0 ? "$B" : "_$M";
@@ -87,8 +87,8 @@ void BM_Fmt_ExpandFourNamed(benchmark::State& state) {
 }
 BENCHMARK(BM_Fmt_ExpandFourNamed);
 
-// A macro late in the template, found or absent. The peer searches one text,
-// we search both names of the identifier.
+// Macro late in the template, found or absent. The peer searches one text, the
+// library both names of the identifier.
 constexpr char kLateForm[] = "$S_a_rather_long_$B_$M_name_$x";
 
 void BM_HxCNames_Substitute(benchmark::State& state) {
@@ -137,7 +137,7 @@ void BM_HxCNames_AppendSuffix(benchmark::State& state) {
 }
 BENCHMARK(BM_HxCNames_AppendSuffix);
 
-// One item is one task's name with three time macros.
+// Item of work: the name of a task with three time macros.
 void BM_HxCNames_MultirateTime(benchmark::State& state) {
   HxCNames names;
   const HxCCIdentifier form("T_$(Time1ms)_$(Period)_$(Offset10us)");
@@ -160,7 +160,7 @@ constexpr std::string_view kC90[] = {
     "struct",   "switch", "typedef", "union",  "unsigned", "void",
     "volatile", "while"};
 
-// What is asked for: the names of a model, of which a few are reserved.
+// Questions: the names of a model, a few reserved words among them.
 std::vector<std::string> questions() {
   std::vector<std::string> result;
   for (int i = 0; i < 1000; ++i) {
@@ -171,7 +171,7 @@ std::vector<std::string> questions() {
   return result;
 }
 
-// Words that a target's headers reserve beside the keywords.
+// Words reserved by the headers of a target beside the keywords.
 std::vector<std::string> moreWords(std::size_t count) {
   std::vector<std::string> result;
   for (std::size_t i = 0; i < count; ++i)
@@ -206,7 +206,7 @@ bool isIdentifier(const std::string& text) {
   return !text.empty() && (text[0] < '0' || text[0] > '9');
 }
 
-// The same questions and the same whole answer: no word, and an identifier.
+// Peer with the same questions and the same answer: no word, an identifier.
 void BM_UnorderedSet_IsReserved(benchmark::State& state) {
   std::unordered_set<std::string> set;
   for (std::string_view word : kC90) set.emplace(word);
@@ -226,7 +226,7 @@ void BM_UnorderedSet_IsReserved(benchmark::State& state) {
 }
 BENCHMARK(BM_UnorderedSet_IsReserved)->Arg(32)->Arg(200);
 
-// A perfect hash of the 32 keywords alone, found when it is compiled.
+// Perfect hash of the 32 keywords alone, found at compile time.
 struct PerfectHash {
   static constexpr unsigned kSlots = 256;
   static constexpr unsigned slot(std::string_view text, unsigned seed) {

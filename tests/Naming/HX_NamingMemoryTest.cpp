@@ -100,6 +100,19 @@ TEST_F(NamingMemoryTest, AnIdentifierChangesAsAWholeOrNotAtAll) {
   }
 }
 
+TEST_F(NamingMemoryTest, WithoutAControllerBlockNothingIsMadeOrExpanded) {
+  Id id = identifier("$O", mode.getSrcRef());
+  HX_CountingController controller;
+  controller.fail();
+  EXPECT_EQ(new HxCNames, nullptr);
+  EXPECT_EQ(new Id("x"), nullptr);
+  // The chart cannot make a reference to itself.
+  EXPECT_FALSE(names.createNameFromForm(id, nullptr, 0, 0, false));
+  EXPECT_EQ(shown(id), "$O:$O$R");
+  EXPECT_EQ(id.getCookLevel(), Id::eCookLevelRaw);
+  EXPECT_TRUE(id.isFormalNameActive());
+}
+
 TEST_F(NamingMemoryTest, SeveralMacrosAreReplacedOneByOne) {
   static HxCSymbol symbol(kLong, HxCSymbol::eFunction);
   symbol.setDollarX(kLong);
