@@ -1,3 +1,5 @@
+// Lookup in the macro table: no macro text is the beginning of another text.
+
 #include "Naming/HX_MacroTable.h"
 
 #include "Naming/HX_MacroRows.h"

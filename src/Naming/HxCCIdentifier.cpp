@@ -1,3 +1,7 @@
+// Fields of an identifier. An operation on several texts makes all new texts
+// first and moves the new texts in last: missing memory leaves no half-set
+// name.
+
 #include "Naming/HxCCIdentifier.h"
 
 #include <utility>

@@ -1,4 +1,4 @@
-// Keyword dictionary, validity of names, and suffixes that make them distinct.
+// Keyword dictionary, validity of names, and suffixes of distinct names.
 
 #include <algorithm>
 #include <cstdint>

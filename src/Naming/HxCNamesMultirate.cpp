@@ -1,4 +1,15 @@
 // Names of tasks and operating-system objects, and times in names.
+//
+// A time is written as a count of units. The unit is fixed by the macro, or the
+// largest generic unit up to the value with a whole count.
+//
+// Example: 90 s, rounded to whole microseconds.
+//   us 90000000   ms 90000   s 90   m 1.5   (h and d lie above the value)
+//   The count of m is not whole: "90s".
+//
+// Invariants:
+// 1. A macro that the names do not hold causes neither work nor a message.
+// 2. A message goes out only behind the replacement.
 
 #include <cmath>
 #include <cstdio>
