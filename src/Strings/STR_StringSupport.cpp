@@ -23,8 +23,8 @@ void release(char* s) {
   if (s != nullptr) pHXMemory->freeMemBlock(s);
 }
 
-int digitCount(std::int64_t number) {
-  int count = 1;
+std::size_t digitCount(std::int64_t number) {
+  std::size_t count = 1;
   while (number /= 10) ++count;
   return count;
 }
@@ -37,9 +37,9 @@ std::size_t blockSize(double value, int precision, int decimals) {
   constexpr int kLongest = std::numeric_limits<int>::max() - 20;
   if (value > -2147483649.0 && value < 2147483648.0 && precision >= 0 &&
       precision < kLongest) {
-    const int sign = value < 0.0 ? 1 : 0;
-    const int digits = digitCount(static_cast<std::int64_t>(value));
-    return static_cast<std::size_t>(digits + precision + 3 + sign);
+    const std::size_t sign = value < 0.0 ? 1 : 0;
+    const std::size_t digits = digitCount(static_cast<std::int64_t>(value));
+    return digits + static_cast<std::size_t>(precision) + 3 + sign;
   }
   const int length = std::snprintf(nullptr, 0, "%.*f", decimals, value);
   // Of more than INT_MAX characters the C library says -1, but 0 for a
