@@ -7,25 +7,22 @@
 
 class HxCSrcRef;
 
-/// What is known of base types as a whole.
-class HX_BaseTypeServer {
+/// The base types as a whole.
+class HX_BaseTypeServer : public HX_BaseTypeServerStandIn {
  public:
-  /// The type that bit fields are declared with; null if there is none.
+  /// The type that bit fields are declared with; null for none.
   HX_DataType* getBitfieldBaseType() const { return m_pBitfieldBase; }
-  void setBitfieldBaseType(HX_DataType* type) { m_pBitfieldBase = type; }
-
- private:
-  HX_DataType* m_pBitfieldBase = nullptr;
 };
 
 /// Owns the server of the base types; types are not owned.
 class HX_DataTypeServer {
  public:
-  /// The element type of an array (of arrays), any other type itself.
+  /// The element type of an array (of arrays); any other type is returned.
   HX_DataType* getAsScalar(HX_DataType* type, const HxCSrcRef*) const {
     while (type->getElement() != nullptr) type = type->getElement();
     return type;
   }
+  /// Never null.
   HX_BaseTypeServer* getBaseServer() { return &m_BaseServer; }
 
  private:

@@ -17,7 +17,7 @@ class HX_NumericalType {
         m_IsSigned(isSigned) {}
   virtual ~HX_NumericalType() = default;
 
-  /// As given to the constructor.
+  /// The closed range, the bits with the sign bit, the signedness.
   virtual double getMaximum() const { return m_Maximum; }
   virtual double getMinimum() const { return m_Minimum; }
   virtual int getBitWidth() const { return m_BitWidth; }

@@ -10,13 +10,14 @@ class HxCSrcRef;
 /// The source reference is not owned; null for a block without an origin.
 class HX_BdBlock {
  public:
-  /// \param rawName  the name before it is made a C identifier
+  /// Stores the arguments.
   explicit HX_BdBlock(const KyCXString& rawName,
                       const HxCSrcRef* srcRef = nullptr)
       : m_RawName(rawName), m_pSrcRef(srcRef) {}
 
-  /// As given to the constructor.
+  /// The name before the change to a C identifier.
   const KyCXString& getRawName() const { return m_RawName; }
+  /// Null for a block without an origin.
   const HxCSrcRef* getSrcRef() const { return m_pSrcRef; }
 
  private:

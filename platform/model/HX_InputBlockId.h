@@ -16,7 +16,7 @@ class HX_InputBlockId {
   HX_InputBlockId(HX_BlockDataBase& blocks, int blockId)
       : m_pBlocks(&blocks), m_BlockId(blockId) {}
 
-  /// As given to the constructor.
+  /// The number of the block, and the table with the handle of the block.
   int getBlockId() const { return m_BlockId; }
   HX_BlockDataBase& getBlockDataBase() const { return *m_pBlocks; }
 

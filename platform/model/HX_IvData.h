@@ -8,9 +8,9 @@
 /// What holds for a whole partition.
 class HX_BcPartitionContext {
  public:
-  /// \param id  the identifier of its subsystem, the value of $I
+  /// \param id  the identifier of the subsystem, the value of $I
   explicit HX_BcPartitionContext(const KyCXString& id) : m_Id(id) {}
-  /// As given to the constructor.
+  /// The identifier of the subsystem.
   const KyCXString& getSubsystemIdentifier() const { return m_Id; }
 
  private:
@@ -23,7 +23,7 @@ class HX_BdPartition {
   /// \param context  may be null
   explicit HX_BdPartition(HX_BcPartitionContext* context)
       : m_pContext(context) {}
-  /// As given to the constructor.
+  /// Null for a partition without a context.
   HX_BcPartitionContext* getPartitionContext() const { return m_pContext; }
 
  private:
@@ -35,7 +35,7 @@ class HxCIvData {
  public:
   /// \param root  may be null
   explicit HxCIvData(HX_BdPartition* root) : m_pRoot(root) {}
-  /// As given to the constructor.
+  /// Null before the view is partitioned.
   HX_BdPartition* getIvHxRootPartition() const { return m_pRoot; }
 
  private:

@@ -14,8 +14,10 @@ class HX_StateflowBlock : public HX_Block {
 
   HX_StateflowBlock* isStateflowBlock() override { return this; }
 
-  /// The state that stands for the whole chart.
+  /// The state that stands for the whole chart; may be null.
   SC_State* getChartState() const { return m_pChartState; }
+
+  /// Not called by the library.
   void setChartState(SC_State* state) { m_pChartState = state; }
 
  private:

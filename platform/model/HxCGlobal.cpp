@@ -27,7 +27,7 @@ Global& global() {
 
 HX_OptionsExt* HxCGlobal::getOptions() { return global().options; }
 
-void HxCGlobal::setOptions(HX_OptionsExt* options) {
+void HX_GlobalStandIn::setOptions(HX_OptionsExt* options) {
   global().options = options != nullptr ? options : &global().defaultOptions;
 }
 
@@ -35,19 +35,21 @@ HX_SlBlockHandlesDB* HxCGlobal::getSlBlockHandlesDB() {
   return global().handles;
 }
 
-void HxCGlobal::setSlBlockHandlesDB(HX_SlBlockHandlesDB* handles) {
+void HX_GlobalStandIn::setSlBlockHandlesDB(HX_SlBlockHandlesDB* handles) {
   global().handles = handles != nullptr ? handles : &global().defaultHandles;
 }
 
 HxCIvData* HxCGlobal::getIvData() { return global().ivData; }
 
-void HxCGlobal::setIvData(HxCIvData* ivData) { global().ivData = ivData; }
+void HX_GlobalStandIn::setIvData(HxCIvData* ivData) {
+  global().ivData = ivData;
+}
 
 HX_DataTypeServer* HxCGlobal::getDataTypeServer() {
   return global().dataTypeServer;
 }
 
-void HxCGlobal::setDataTypeServer(HX_DataTypeServer* server) {
+void HX_GlobalStandIn::setDataTypeServer(HX_DataTypeServer* server) {
   global().dataTypeServer = server;
 }
 

@@ -3,40 +3,33 @@
 #ifndef PLATFORM_MODEL_HXCSYMBOL_H
 #define PLATFORM_MODEL_HXCSYMBOL_H
 
-#include <string>
-
+#include "platform/model/HX_ModelStandIn.h"
 #include "platform/strings/KyCXString.h"
 
 class HX_DataType;
 
-/// The data type is not owned; null for a symbol without one.
-class HxCSymbol {
+/// A name with a kind.
+class HxCSymbol : public HX_SymbolStandIn {
  public:
-  /// The longest generated name, in characters: what ISO C90 guarantees for
-  /// internal identifiers (5.2.4.1).
+  /// The longest generated name, in characters: the length that ISO C90
+  /// guarantees for internal identifiers (5.2.4.1).
   static constexpr int sm_MaxNameLength = 31;
 
-  /// What a symbol stands for.
+  /// Kinds of symbols.
   enum HxESymbolKindTag { eVariable = 1, eConstant = 2, eFunction = 3 };
 
-  /// \param kind  a HxESymbolKindTag, or a number of the host's own
-  HxCSymbol(const KyCXString& name, int kind, HX_DataType* dataType = nullptr)
-      : m_Name(name), m_Kind(kind), m_pDataType(dataType) {}
+  using HX_SymbolStandIn::HX_SymbolStandIn;
 
-  /// As given to the constructor.
+  /// The name in the code.
   const KyCXString& getName() const { return m_Name; }
+  /// A HxESymbolKindTag, or a number of the host.
   int getKind() const { return m_Kind; }
+  /// Null for a symbol without a type.
   HX_DataType* getDataType() const { return m_pDataType; }
 
-  /// The text for the macro $X, owned by the symbol; never null.
+  /// The text for the macro $X; never null.
+  /// OWNERSHIP: the symbol's.
   char* getDollarX() { return m_DollarX.data(); }
-  void setDollarX(const char* text) { m_DollarX = text; }
-
- private:
-  KyCXString m_Name;
-  int m_Kind;
-  HX_DataType* m_pDataType;
-  std::string m_DollarX;
 };
 
 #endif  // PLATFORM_MODEL_HXCSYMBOL_H

@@ -10,11 +10,11 @@ class SC_Chart;
 /// The chart is not owned and never null.
 class SC_State : public SC_Model {
  public:
-  /// See SC_Model; \p chart must not be null.
+  /// REQUIRES: \p chart is not null.
   SC_State(int id, int number, const KyCXString& name, SC_Chart* chart)
       : SC_Model(id, number, name), m_pChart(chart) {}
 
-  /// As given to the constructor.
+  /// The chart around the state; never null.
   SC_Chart* getChart() const { return m_pChart; }
 
  private:
