@@ -1,10 +1,10 @@
-#include <clocale>
 #include <cmath>
 #include <limits>
 #include <tuple>
 #include <utility>
 
 #include "Naming/HX_NamingFixture.h"
+#include "support/HX_ForeignLocale.h"
 
 namespace {
 
@@ -48,11 +48,11 @@ TEST_F(MultirateTest, TimesAreRoundedAndReportedWhereTheyAreUsed) {
       {"$(Period1d)", kLargest, 0, "2147483647 1206"},
       {"$(Offset1d)", 0, -HUGE_VAL, "2147483647 1206"},
       {"$(Period1d)", std::nan(""), 0, "2147483647 1206"}};
-  // The decimal comma must not show. Without the locale nothing happens.
-  std::setlocale(LC_NUMERIC, "de_DE.UTF-8");
-  for (const auto& [form, period, offset, result] : rows)
-    EXPECT_EQ(time(form, period, offset), result) << form;
-  std::setlocale(LC_NUMERIC, "C");
+  {
+    const HX_ForeignLocale foreign;
+    for (const auto& [form, period, offset, result] : rows)
+      EXPECT_EQ(time(form, period, offset), result) << form;
+  }
   auto reported = messages();
   reported.resize(4);  // of the first five rows
   EXPECT_THAT(
