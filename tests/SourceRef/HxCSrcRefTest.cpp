@@ -226,7 +226,9 @@ bool formsTexts() {
     if (!isFormed && text != "before") s_IsHalfDone = true;
     done = done && isFormed;
   }
-  return done;
+  KyCXString path("before");
+  s_Model->object.getDdPath(path);
+  return done && path == s_Model->texts[4];
 }
 
 bool keepsPlaces() {
