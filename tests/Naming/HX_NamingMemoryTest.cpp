@@ -54,6 +54,8 @@ bool isWhole() {
 class NamingMemoryTest : public HX_NamingFixture {};
 
 TEST_F(NamingMemoryTest, AnIdentifierChangesAsAWholeOrNotAtAll) {
+  const unsigned short units[] = {0x4F60, 0x597D};
+  const KyCXString wide(units, 2);
   const KyCXString text(kLong);
   s_text = &text;
   const Id other(kLong);
@@ -88,6 +90,7 @@ TEST_F(NamingMemoryTest, AnIdentifierChangesAsAWholeOrNotAtAll) {
   for (const std::string& form : {longForm + ":$N$S_" + kLong, longForm}) {
     Id before = identifier(form);
     before.activateActualName();
+    before.setSignalLabel(wide);
     before.setIdentifierChangeable(true, Id::eActualName);
     for (const auto& [why, change] : operations) {
       Step step{why, change, before, before};
