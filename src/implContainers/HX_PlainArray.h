@@ -28,6 +28,7 @@ class HX_PlainArray {
   unsigned size() const { return m_Size; }
   /// Valid until the next append().
   const Value& operator[](unsigned index) const { return m_Values[index]; }
+  Value& operator[](unsigned index) { return m_Values[index]; }
   /// For loops over all values; valid until the next append().
   const Value* begin() const { return m_Values; }
   const Value* end() const { return m_Values + m_Size; }
