@@ -4,9 +4,9 @@
 #   awk -f script/words.awk LIMIT FILE...        one line per file over LIMIT
 #   awk -v TOTAL=src -f script/words.awk LIMIT FILE...   all files as one text
 #
-# LIMIT is in pointers per 100 words. Of sources only lines that are comments
-# count, of Markdown only text outside code blocks. Texts below 60 words are
-# too short to judge. Exit code 1 if a line was printed.
+# LIMIT is in pointers per 100 words. Of sources, scripts (script/NAME) and CMake
+# files only comment lines count, of Markdown only text outside code blocks.
+# Texts below 60 words are too short to judge. Exit code 1 if a line was printed.
 
 BEGIN {
   limit = ARGV[1]
@@ -30,6 +30,7 @@ FNR == 1 {
   if (NR > 1 && TOTAL == "") judge(last)
   last = FILENAME
   prose = FILENAME ~ /\.md$/
+  hashed = FILENAME ~ /CMakeLists\.txt$|\.cmake$|^script\//
   fenced = 0
 }
 
@@ -38,7 +39,8 @@ prose && /^ *```/ {
   next
 }
 prose && fenced { next }
-!prose && !/^[ \t]*\/\// { next }
+!prose && !hashed && !/^[ \t]*\/\// { next }
+hashed && !/^[ \t]*#[^!]/ { next }
 
 {
   text = tolower($0)
