@@ -10,10 +10,10 @@ class KyCXString;
 /// Outputs are written only where the result is true.
 class HX_PLATFORM_API HX_DataDictionary {
  public:
-  /// True if there is such an object.
+  /// True for the handle of an object.
   static bool isValidDdHandle(unsigned long handle);
-  /// The path from "//DD0" down, and its last part. \return false if there is
-  /// no such object
+  /// The path from "//DD0" down; the last part of the path.
+  /// RETURNS: false, with the text unchanged, for no handle of an object.
   static bool getObjectFullPathName(unsigned long handle, KyCXString& path);
   static bool getObjectName(unsigned long handle, KyCXString& name);
 };

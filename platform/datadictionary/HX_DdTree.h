@@ -1,7 +1,7 @@
-// The objects of the data dictionary, as a tree of paths.
+// The objects of the data dictionary, as a tree of paths: fills the stand-in.
 //
 //   HX_DdTree& tree = HX_DdTree::instance();
-//   tree.add("//DD0/Pool/Variables/Ctrl/speed");      // parents come with it
+//   tree.add("//DD0/Pool/Variables/Ctrl/speed");      // and the parents
 //   auto c = tree.add("//DD0/Pool/Autosar/SoftwareComponents/Engine",
 //                     HX_DdTree::kSoftwareComponent);
 //   tree.addReference(tree.add(tree.path(c) + "/RelatedVariables"),
@@ -16,43 +16,45 @@
 
 #include "platform/HX_PlatformExport.h"
 
-/// Paths begin with "//DD0"; a path that begins with one '/' counts from there.
+/// Paths begin with "//DD0"; a path with a single '/' in front counts from
+/// "//DD0".
 /// Names compare by character. Handles count from 1 and stay until clear().
 class HX_PLATFORM_API HX_DdTree {
  public:
-  /// A handle that no object has.
+  /// The handle of no object.
   static constexpr unsigned long kInvalidHandle = ~0UL;
   /// The kind of software components.
   static constexpr unsigned short kSoftwareComponent = 145;
 
-  /// A property that refers to another object by its path below the pool.
+  /// A property that refers to an object by the path below the pool.
   struct Reference {
-    std::string property;  ///< its name
+    std::string property;  ///< name of the property
     std::string path;      ///< without a '/' in front
   };
 
-  /// The one tree of the process.
+  /// The tree of the process. The end of the process does not destroy the tree.
   static HX_DdTree& instance();
   /// Deletes all objects.
   void clear();
 
-  /// The handle of the object at \p path, which is made if it is new, like
-  /// every missing object above it (with kind 0).
+  /// Makes the object at \p path unless present, and every missing object above
+  /// with kind 0. A \p kind other than 0 also changes a present object.
+  /// RETURNS: the handle of the object.
   unsigned long add(const std::string& path, unsigned short kind = 0);
-  /// Adds a property, whether or not there is one of that name; needs a valid
-  /// handle.
+  /// Adds a property; several properties may have the same name.
+  /// REQUIRES: a valid handle.
   void addReference(unsigned long handle, const std::string& property,
                     const std::string& path);
 
-  /// kInvalidHandle if there is no such object.
+  /// kInvalidHandle for an unknown path; whether a handle is known.
   unsigned long find(const std::string& path) const;
   bool isValid(unsigned long handle) const;
 
-  /// These need a valid handle.
+  /// REQUIRES: a valid handle.
   const std::string& path(unsigned long handle) const;
   std::string name(unsigned long handle) const;
   const std::vector<Reference>& references(unsigned long handle) const;
-  /// Handles of the children of one kind, in the order of their making.
+  /// Handles of the children of one kind, in the order of creation.
   std::vector<unsigned long> children(unsigned long handle,
                                       unsigned short kind) const;
 
@@ -60,7 +62,7 @@ class HX_PLATFORM_API HX_DdTree {
   struct Object {
     std::string path;
     unsigned short kind;
-    std::vector<unsigned long> children;  // in the order of their making
+    std::vector<unsigned long> children;  // in the order of creation
     std::vector<Reference> references;
   };
 

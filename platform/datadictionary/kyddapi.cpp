@@ -23,6 +23,7 @@ Heap& heap() {
 
 void* allocate(std::size_t size) {
   void* block = std::malloc(size);
+  if (block == nullptr) return nullptr;
   heap().blocks.insert(block);
   ++heap().balance;
   return block;
@@ -30,6 +31,7 @@ void* allocate(std::size_t size) {
 
 char* handOut(const std::string& text) {
   auto* copy = static_cast<char*>(allocate(text.size() + 1));
+  if (copy == nullptr) return nullptr;
   std::memcpy(copy, text.c_str(), text.size() + 1);
   return copy;
 }
@@ -44,7 +46,7 @@ const HX_DdTree::Reference* referenceAt(unsigned long handle, long index) {
 
 }  // namespace
 
-// A block that is not known (any more) is only counted, never freed.
+// An unknown block, or a block returned before, is counted and not freed.
 void DDAPIHeapFree(void* block) {
   if (block == nullptr) return;
   --heap().balance;
@@ -77,6 +79,10 @@ KYSDDHandleNode* KYCDDObject::GetChildObjects(unsigned short kind, long& count,
   count = static_cast<long>(children.size());
   auto* nodes = static_cast<KYSDDHandleNode*>(
       allocate(children.size() * sizeof(KYSDDHandleNode)));
+  if (nodes == nullptr) {
+    count = 0;
+    return nullptr;
+  }
   for (std::size_t i = 0; i < children.size(); ++i) {
     nodes[i].next = i + 1 < children.size() ? &nodes[i + 1] : nullptr;
     nodes[i].handle = children[i];
@@ -97,7 +103,7 @@ bool KYCDDObject::ReadRefPathFromDDK(long index, char*& path,
   if (reference == nullptr) return false;
   path = handOut(reference->path);
   length = static_cast<unsigned long>(reference->path.size());
-  return true;
+  return path != nullptr;
 }
 
 bool KYCDDObject::GetPropertyName(char*& name, unsigned short& length,
@@ -106,7 +112,7 @@ bool KYCDDObject::GetPropertyName(char*& name, unsigned short& length,
   if (reference == nullptr) return false;
   name = handOut(reference->property);
   length = static_cast<unsigned short>(reference->property.size());
-  return true;
+  return name != nullptr;
 }
 
 bool KYCDDObject::GetName(char*& name, unsigned short& length) const {
@@ -114,7 +120,7 @@ bool KYCDDObject::GetName(char*& name, unsigned short& length) const {
   const std::string own = HX_DdTree::instance().name(m_Handle);
   name = handOut(own);
   length = static_cast<unsigned short>(own.size());
-  return true;
+  return name != nullptr;
 }
 
 KYCDDObject KYCDDSoftwareComponent::GetRelatedVariables(

@@ -1,23 +1,24 @@
 // The client interface of the data dictionary.
 //
-// Every text and every list that it hands out belongs to the caller, who
-// returns it with DDAPIHeapFree(); a list is returned as a whole by its head.
+// OWNERSHIP: texts and lists handed out belong to the caller, who returns them
+// with DDAPIHeapFree(); the head of a list returns the whole list. Without
+// memory a text is null and the result false, a list is empty.
 
 #ifndef PLATFORM_DATADICTIONARY_KYDDAPI_H
 #define PLATFORM_DATADICTIONARY_KYDDAPI_H
 
 #include "platform/HX_PlatformExport.h"
 
-/// Returns what the interface handed out; null is ignored.
+/// Returns a text or a list of the interface; null is ignored.
 HX_PLATFORM_API void DDAPIHeapFree(void* block);
 
-/// Blocks handed out and not returned yet; a block returned twice counts as
-/// one less each time.
+/// Not called by the library: the number of blocks handed out and not returned
+/// yet. A block returned twice counts twice.
 HX_PLATFORM_API int DDAPIHeapBalance();
 
 namespace kyddapi {
 
-/// A handle in a list of them.
+/// An element of a list of handles.
 struct KYSDDHandleNode {
   KYSDDHandleNode* next;  ///< null at the end
   unsigned long handle;   ///< of an object
@@ -29,7 +30,7 @@ class HX_PLATFORM_API KYCDDObject {
   /// The handle -1 (all bits set) makes an unconnected object.
   explicit KYCDDObject(unsigned long handle) : m_Handle(handle) {}
 
-  /// False, and unconnected from then on, if there is no such object.
+  /// RETURNS: false for no object; the connection is gone then.
   bool ConnectToDDObject(const char* path);
   bool ConnectToDDObject(unsigned long handle);
   unsigned long GetHandle() const { return m_Handle; }
@@ -40,14 +41,14 @@ class HX_PLATFORM_API KYCDDObject {
   KYSDDHandleNode* GetChildObjects(unsigned short kind, long& count,
                                    unsigned short& error) const;
 
-  /// Number of the properties that refer to other objects.
+  /// The number of properties that refer to objects.
   long GetNumOfProps() const;
-  /// The path that property \p index refers to; the last argument is reserved.
-  /// \return false, with nothing handed out, for an index that does not exist
+  /// The path in property \p index; the last argument is reserved.
+  /// RETURNS: false, with nothing handed out, for an index out of range.
   bool ReadRefPathFromDDK(long index, char*& path, unsigned long& length,
                           unsigned short reserved) const;
-  /// The name of property \p index, and its length in bytes. \return false,
-  /// with nothing handed out, for an index that does not exist
+  /// The name of property \p index, and the length of the name in bytes.
+  /// RETURNS: false, with nothing handed out, for an index out of range.
   bool GetPropertyName(char*& name, unsigned short& length, long index) const;
   /// The object's own name; false for an unconnected object.
   bool GetName(char*& name, unsigned short& length) const;
@@ -56,13 +57,13 @@ class HX_PLATFORM_API KYCDDObject {
   unsigned long m_Handle;
 };
 
-/// An object that is a software component; the kind is not checked.
+/// A software component; the kind of the object is not checked.
 class HX_PLATFORM_API KYCDDSoftwareComponent : public KYCDDObject {
  public:
   using KYCDDObject::KYCDDObject;
 
-  /// The list of the variables that belong to the component, one property
-  /// each; unconnected if the component has none.
+  /// The list of the variables of the component, one property per variable;
+  /// unconnected for a component without a list.
   KYCDDObject GetRelatedVariables(unsigned short& error) const;
 };
 

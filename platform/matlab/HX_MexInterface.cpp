@@ -4,6 +4,8 @@
 #include <cstdarg>
 #include <cstdio>
 #include <map>
+#include <memory>
+#include <new>
 #include <string>
 #include <utility>
 
@@ -33,15 +35,19 @@ int mexPrintf(const char* format, ...) {
   va_start(args, format);
   std::va_list again;
   va_copy(again, args);
-  const int length = std::vsnprintf(nullptr, 0, format, args);
+  int length = std::vsnprintf(nullptr, 0, format, args);
   va_end(args);
-  if (length >= 0) {
-    std::string text(static_cast<std::size_t>(length), '\0');
-    std::vsnprintf(text.data(), text.size() + 1, format, again);
-    if (commandWindow())
-      commandWindow()(text.c_str());
-    else
-      std::fputs(text.c_str(), stdout);
+  if (length >= 0 && !commandWindow()) {
+    std::vprintf(format, again);
+  } else if (length >= 0) {
+    const auto size = static_cast<std::size_t>(length) + 1;
+    const std::unique_ptr<char[]> text(new (std::nothrow) char[size]);
+    if (text != nullptr) {
+      std::vsnprintf(text.get(), size, format, again);
+      commandWindow()(text.get());
+    } else {
+      length = -1;
+    }
   }
   va_end(again);
   return length;

@@ -19,7 +19,8 @@ class KyCXString;
 #endif
 
 /// Prints to the command window, formatted as by printf().
-/// RETURNS: the number of bytes printed; negative for a format that fails.
+/// RETURNS: the number of bytes printed; negative for a format that fails
+/// and without memory.
 HX_PLATFORM_API int mexPrintf(const char* format, ...) HX_PRINTF_LIKE(1, 2);
 
 /// Calls the MATLAB function \p name. The \p outputs places of \p output are

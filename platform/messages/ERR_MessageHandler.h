@@ -1,4 +1,4 @@
-// What the library calls of the generator's message handler.
+// The calls of the library to the message handler of the generator.
 
 #ifndef PLATFORM_MESSAGES_ERR_MESSAGEHANDLER_H
 #define PLATFORM_MESSAGES_ERR_MESSAGEHANDLER_H
@@ -9,16 +9,16 @@ class HxCSrcRef;
 
 /// Reports the catalogue row \p messageNumber.
 ///
-/// \param severity  0 note, 1 warning, 2 error, 3 fatal error; 4 to 7 are
-///   their counterparts for messages that only a developer needs.
+/// \param severity  0 note, 1 warning, 2 error, 3 fatal error; 4 to 7 the
+///   same for messages to developers.
 /// \param srcRef  the item concerned, null for none; read during the call only.
-/// The further arguments are those that the row's text formats. Always
+/// The further arguments are formatted by the text of the row. Always
 /// returns, whatever the severity.
 HX_PLATFORM_API void ERR_EmitErrorMessage(int severity, const HxCSrcRef* srcRef,
                                           int messageNumber, ...);
 
-/// The highest severity class reported so far: 0 nothing or notes, 1 warning,
-/// 2 error, 3 fatal error. Internal severities count as their counterparts.
+/// The highest severity reported so far: 0 nothing or notes, 1 warning,
+/// 2 error, 3 fatal error. Severities 4 to 7 count as 0 to 3.
 HX_PLATFORM_API int ERR_get_errstatus();
 
 /// True while internal information is to be shown to a developer.
@@ -29,7 +29,7 @@ HX_PLATFORM_API bool ShowInternalInfo();
 HX_PLATFORM_API int HX_DebugReport(const char* file, int line,
                                    const char* expression);
 
-/// Stops in the debugger that the process runs under.
+/// Stops in the debugger of the process.
 HX_PLATFORM_API void HX_DebugBreak();
 
 #endif  // PLATFORM_MESSAGES_ERR_MESSAGEHANDLER_H

@@ -6,6 +6,7 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
+#include <new>
 
 #include "Control/ERR_Catalogue.h"
 #include "SourceRef/HxCSrcRef.h"
@@ -15,8 +16,8 @@
 
 namespace {
 
-// While it lives, this thread writes numbers with a decimal point, whatever the
-// locale of the process.
+// Numbers are written with a decimal point in every locale of the process, as
+// long as an object of the class lives.
 class PlainNumbers {
  public:
   PlainNumbers() {
@@ -56,21 +57,24 @@ void HX_MessageHandler::clear() {
 
 void HX_MessageHandler::emit(int severity, const HxCSrcRef* srcRef, int row,
                              std::va_list arguments) {
+  m_Status = std::max(m_Status, severity & 3);
+  const ERR_CatalogueRow* entry = ERR_FindRow(row);
   HX_Message message;
   message.row = row;
+  message.id = entry == nullptr ? 0 : entry->id;
   message.severity = severity;
   message.srcRef = srcRef;
-  if (srcRef != nullptr) {
-    KyCXString source;
-    srcRef->toString(source);
-    message.source = source.cstring();
+  try {
+    if (srcRef != nullptr) {
+      KyCXString source;
+      srcRef->toString(source);
+      message.source = source.cstring();
+    }
+    if (entry != nullptr) message.text = format(entry->text, arguments);
+    m_Messages.push_back(message);
+  } catch (const std::bad_alloc&) {
+    // The sink still hears of the message, with the texts that are there.
   }
-  if (const ERR_CatalogueRow* entry = ERR_FindRow(row)) {
-    message.id = entry->id;
-    message.text = format(entry->text, arguments);
-  }
-  m_Status = std::max(m_Status, severity & 3);
-  m_Messages.push_back(message);
   if (m_Sink) m_Sink(message);
 }
 

@@ -1,4 +1,4 @@
-// The message handler as a host sees it: what was reported, and where it goes.
+// The message handler for a host: the messages so far, and where messages go.
 //
 //   HX_MessageHandler& handler = HX_MessageHandler::instance();
 //   handler.setSink([](const HX_Message& m) { log << m.text << '\n'; });
@@ -19,7 +19,7 @@ class HxCSrcRef;
 template <class>
 union HX_NeverDestroyed;
 
-/// One reported message. Texts are ISO-8859-1.
+/// A reported message. Texts are ISO-8859-1.
 struct HX_Message {
   int row = 0;       ///< row of the catalogue
   int id = 0;        ///< the number a user sees; 0 if the row is not known
@@ -29,11 +29,11 @@ struct HX_Message {
   std::string text;                   ///< formatted
 };
 
-/// Records every message and hands it on. The recorded ones are kept until
+/// Records every message and hands the message on. Records are kept until
 /// clear().
 class HX_PLATFORM_API HX_MessageHandler {
  public:
-  /// Receives a message; it is valid during the call only.
+  /// Receives a message; the message is valid during the call only.
   using Sink = std::function<void(const HX_Message&)>;
   /// Receives file, line and expression; answers 1 to debug.
   using DebugReport = std::function<int(const char*, int, const char*)>;
@@ -49,21 +49,22 @@ class HX_PLATFORM_API HX_MessageHandler {
   /// See ERR_get_errstatus().
   int errorStatus() const { return m_Status; }
 
-  /// Each message goes to \p sink once, after it was recorded. The default
-  /// writes one line to standard error; an empty sink drops them.
+  /// Every message goes to \p sink once, after the record. The default writes a
+  /// line to standard error; an empty sink drops messages.
   void setSink(Sink sink) { m_Sink = std::move(sink); }
   static void writeToStandardError(const HX_Message& message);
 
-  /// What ShowInternalInfo() answers: whether debug checks report.
+  /// The answer of ShowInternalInfo(): whether debug checks report.
   void setShowInternalInfo(bool show) { m_ShowInternalInfo = show; }
   bool showInternalInfo() const { return m_ShowInternalInfo; }
 
-  /// Replaces the line on standard error that a debug report writes.
+  /// Replaces the line of a debug report on standard error.
   void setDebugReport(DebugReport report) { m_DebugReport = std::move(report); }
   int debugReport(const char* file, int line, const char* expression);
 
-  /// Formats and records one message; see ERR_EmitErrorMessage(). Numbers have
-  /// a decimal point in every locale.
+  /// Formats and records a message; see ERR_EmitErrorMessage(). Numbers have a
+  /// decimal point in every locale. Without memory the message is not recorded;
+  /// status and sink take the message, whose texts may be missing then.
   void emit(int severity, const HxCSrcRef* srcRef, int row,
             std::va_list arguments);
 

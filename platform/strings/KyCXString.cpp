@@ -37,7 +37,7 @@ char narrowed(unsigned short unit) {
   return static_cast<char>(unit > 0xFF ? '?' : unit);
 }
 
-// Which characters may stand in a C identifier.
+// The characters of C identifiers.
 constexpr auto kIdentifierCharacters = [] {
   std::array<bool, 256> table{};
   for (unsigned char c = 'a'; c <= 'z'; ++c) table[c] = table[c - 32] = true;
@@ -46,7 +46,7 @@ constexpr auto kIdentifierCharacters = [] {
   return table;
 }();
 
-// Digits of a magnitude; zeros in front up to the digits of the largest one.
+// Digits of a magnitude; zeros in front up to the digits of \p largest.
 struct Digits {
   Digits(unsigned long magnitude, unsigned long largest, int base,
          bool shortest) {
@@ -319,6 +319,11 @@ KyCXString& KyCXString::replace(const KyCXString& what, const KyCXString& by) {
 
 KyCXString& KyCXString::makeCIdentifier(bool collapse) {
   if (isValidCIdentifier()) return *this;
+  if (isDigit((*this)[0])) {
+    KyCXString named = KyCXString('_') + *this;
+    named.makeCIdentifier(collapse);
+    return *this = std::move(named);
+  }
   changeUnits([collapse](auto begin, auto end) {
     auto* out = begin;
     bool inRun = false;
@@ -334,7 +339,6 @@ KyCXString& KyCXString::makeCIdentifier(bool collapse) {
     }
     return out;
   });
-  if (isDigit((*this)[0])) *this = KyCXString('_') + *this;
   return *this;
 }
 
@@ -387,7 +391,7 @@ void KyCXString::release() {
   m_Capacity = kInlineCapacity;
 }
 
-// Grows by at least half, so that repeated appending stays linear.
+// Grows by at least half, because repeated appending must stay linear.
 void KyCXString::makeRoom(int capacity) {
   if (capacity <= m_Capacity) return;
   capacity = std::max(capacity, m_Capacity + m_Capacity / 2);
@@ -409,7 +413,6 @@ void KyCXString::setLength(int length) {
 
 // \p text may lie inside this object.
 void KyCXString::assignNarrow(const char* text, int length) {
-  delete[] std::exchange(m_Wide, nullptr);
   if (length > m_Capacity) {
     char* room = new char[sizeOf(length) + 1];
     std::memcpy(room, text, sizeOf(length));
@@ -419,6 +422,7 @@ void KyCXString::assignNarrow(const char* text, int length) {
   } else {
     std::memmove(m_Text, text, sizeOf(length));
   }
+  delete[] std::exchange(m_Wide, nullptr);
   setLength(length);
 }
 
@@ -450,7 +454,7 @@ void KyCXString::appendNarrow(const char* text, int length) {
   setLength(total);
 }
 
-// Wide texts are rare: appending to one copies it whole.
+// Wide texts are rare: appending copies the whole text.
 void KyCXString::appendUnits(const KyCXString& text, int from, int count) {
   Units units;
   units.reserve(sizeOf(m_Length) + sizeOf(count));
@@ -459,8 +463,8 @@ void KyCXString::appendUnits(const KyCXString& text, int from, int count) {
   assignUnits(units.data(), static_cast<int>(units.size()));
 }
 
-// Applies \p change, which rewrites [begin, end) and returns the new end, to
-// the units in the form in which they are held.
+// Applies \p change to the units, in 8 or 16 bits as they are held. \p change
+// rewrites [begin, end) and returns the new end.
 template <class Change>
 void KyCXString::changeUnits(Change change) {
   if (m_Wide == nullptr) {

@@ -1,9 +1,12 @@
 // The generator's string class: a sequence of 16-bit units.
 //
-// A text of up to 39 units of ISO-8859-1, which is nearly every name, lives
-// inside the object and never asks for memory. Texts whose units all lie below
-// 256 are held as 8-bit text, so cstring() is free; a text with a larger unit
-// keeps its 16-bit units and its 8-bit form side by side.
+// A text of up to 39 units of ISO-8859-1, as nearly every name, lives inside
+// the object and never asks for memory. A text with all units below 256 is held
+// as 8-bit text, and cstring() is free; a text with a larger unit keeps the
+// 16-bit units and the 8-bit form side by side.
+//
+// Without memory operations throw std::bad_alloc and leave the text as before
+// the call.
 //
 //   KyCXString name("speed");
 //   name += "_";
@@ -21,10 +24,10 @@
 #include "platform/HX_PlatformExport.h"
 #include "platform/containers/array.h"
 
-/// A value type. Positions count from 0; a range includes both its ends.
+/// A value type. Positions count from 0; a range includes both ends.
 /// Comparison is by unit value, never by locale. Letter case and white space
-/// are those of ASCII: the letters A-Z and a-z; blank, tab, line feed, vertical
-/// tab, form feed and carriage return.
+/// are the ones of ASCII: the letters A-Z and a-z; blank, tab, line feed,
+/// vertical tab, form feed and carriage return.
 class HX_PLATFORM_API KyCXString {
  public:
   /// Where shortenString() takes the text out.
@@ -35,9 +38,9 @@ class HX_PLATFORM_API KyCXString {
   };
 
   KyCXString() noexcept { m_Inline[0] = 0; }
-  /// The ISO-8859-1 text up to its terminating zero; null gives an empty text.
+  /// The ISO-8859-1 text up to the terminating zero; null gives an empty text.
   KyCXString(const char* text);
-  /// One character.
+  /// A single character.
   explicit KyCXString(char character);
   /// \p length units starting at \p units; none for a negative length.
   KyCXString(const unsigned short* units, int length);
@@ -72,11 +75,11 @@ class HX_PLATFORM_API KyCXString {
   /// Never null; valid until the next change of this object.
   const char* cstring() const { return m_Text; }
 
-  /// Makes room for \p length units below 256, so that appending up to there
-  /// asks for no more memory. The text stays.
+  /// Makes room for \p length units below 256, because appending up to
+  /// there then asks for no memory. The text stays.
   void reserve(int length) { makeRoom(length); }
 
-  /// Appends \p text, which may be this object itself.
+  /// Appends \p text, possibly the same object.
   KyCXString& operator+=(const KyCXString& text) {
     const int room = m_Capacity - m_Length;
     if (m_Wide != nullptr || text.m_Wide != nullptr || text.m_Length > room)
@@ -96,29 +99,29 @@ class HX_PLATFORM_API KyCXString {
     m_Text[m_Length] = 0;
     return *this;
   }
-  /// Appends one unit.
+  /// Appends a unit.
   KyCXString& appendUnit(unsigned short unit) {
     if (unit > 0xFF) return appendText(KyCXString(&unit, 1));
     return *this += static_cast<char>(unit);
   }
-  /// Appends what sub() of \p text would give, without the copy.
+  /// Appends the result of sub() of \p text without a copy.
   KyCXString& appendSub(const KyCXString& text, int from, int to);
 
   /// The position of the first occurrence of \p text at or after \p from, -1
-  /// if there is none. A negative \p from counts as 0; the empty text is found
+  /// without one. A negative \p from counts as 0; the empty text is found
   /// at every \p from up to the length.
   int find(const KyCXString& text, int from = 0) const;
   int find(char character, int from = 0) const;
   bool contains(const KyCXString& text) const { return find(text, 0) >= 0; }
   bool startsWith(const KyCXString& text) const { return matchesAt(0, text); }
-  /// True if \p text stands at \p position, which may lie outside the text.
+  /// True if \p text stands at \p position, inside the text or outside.
   bool matchesAt(int position, const KyCXString& text) const {
     if (!text.isEmpty() && (*this)[position] != text[0]) return false;
     return matchesWholeAt(position, text);
   }
 
-  /// The units from \p from to \p to, both included; of a range that reaches
-  /// outside the text the part inside it, empty if there is none.
+  /// The units in the closed range [\p from, \p to]. A range that reaches
+  /// outside the text means the part inside; the part may be empty.
   KyCXString sub(int from, int to) const;
   /// The first \p count units; empty for a negative count.
   KyCXString head(int count) const {
@@ -134,18 +137,18 @@ class HX_PLATFORM_API KyCXString {
   KyCXString& toUpper();
   /// Removes white space at the chosen ends.
   KyCXString& trim(bool leading, bool trailing);
-  /// Removes one pair of angle brackets that encloses the whole text.
+  /// Removes a pair of angle brackets around the whole text.
   KyCXString& filterAngleBrackets();
-  /// Writes \p by for each white space character or, with \p collapse, for
-  /// each run of them.
+  /// Writes \p by for every white space character or, with \p collapse, for
+  /// every run of white space.
   KyCXString& replaceWhiteSpace(char by, bool collapse);
-  /// Replaces every occurrence of \p what, from the left, never looking into a
-  /// replacement; an empty \p what changes nothing.
+  /// Replaces every occurrence of the first text, from the left, never looking
+  /// into a replacement; an empty first text changes nothing.
   KyCXString& replace(const KyCXString& what, const KyCXString& by);
 
-  /// Writes '_' for each unit that may not stand in a C identifier (with
-  /// \p collapse for each run of them) and puts '_' before a leading digit.
-  /// A text that is not empty thereby becomes a valid identifier.
+  /// Writes '_' for every unit that may not stand in a C identifier (with
+  /// \p collapse for every run of such units) and puts '_' before a leading
+  /// digit. Every nonempty text becomes a valid identifier.
   KyCXString& makeCIdentifier(bool collapse);
   /// A letter or '_' first, then letters, digits and '_' (ISO C, 6.4.2.1,
   /// without universal character names).
@@ -153,8 +156,8 @@ class HX_PLATFORM_API KyCXString {
   /// A letter, a digit or '_'.
   static bool isValidForCIdentifier(const unsigned short& unit);
 
-  /// Cuts a text that is longer than \p maxLength to exactly that length; a
-  /// text that fits stays as it is. The units around \p position are replaced
+  /// Cuts a text longer than \p maxLength to exactly \p maxLength units; a text
+  /// that fits stays. The units around \p position are replaced
   /// by \p fillCount times \p fill: at the front the end of the text survives,
   /// in the middle both ends (the end at most one unit shorter), at the back
   /// the front. Where \p maxLength leaves no room beside the fill, the last
@@ -163,10 +166,10 @@ class HX_PLATFORM_API KyCXString {
                             ScEPosition position);
 
   /// Negative, 0 or positive as this text goes before, equals or goes after
-  /// \p other: by the first unit that differs, else the shorter first.
+  /// \p other: by the first different unit, else the shorter first.
   int compareWith(const KyCXString& other) const;
 
-  /// By units, as compareWith() has it.
+  /// By units, like compareWith().
   friend bool operator==(const KyCXString& a, const KyCXString& b) {
     if (a.m_Length != b.m_Length) return false;
     if (a.m_Wide == nullptr && b.m_Wide == nullptr)
@@ -174,7 +177,7 @@ class HX_PLATFORM_API KyCXString {
                          static_cast<std::size_t>(a.m_Length)) == 0;
     return a.compareWith(b) == 0;
   }
-  /// By units, as compareWith() has it.
+  /// By units, like compareWith().
   friend bool operator<(const KyCXString& a, const KyCXString& b) {
     return a.compareWith(b) < 0;
   }
@@ -184,7 +187,7 @@ class HX_PLATFORM_API KyCXString {
     sum += b;
     return sum;
   }
-  /// The same; \p a lends its memory.
+  /// The same; the sum takes the memory of \p a.
   friend KyCXString operator+(KyCXString&& a, const KyCXString& b) {
     a += b;
     return static_cast<KyCXString&&>(a);
@@ -213,7 +216,7 @@ class HX_PLATFORM_API KyCXString {
   char* m_Text = m_Inline;           // 8-bit form, zero-terminated
   unsigned short* m_Wide = nullptr;  // units; null while all are below 256
   int m_Length = 0;
-  int m_Capacity = kInlineCapacity;  // of m_Text, without its final zero
+  int m_Capacity = kInlineCapacity;  // of m_Text, without the final zero
   char m_Inline[kInlineCapacity + 1];
 };
 

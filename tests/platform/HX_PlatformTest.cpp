@@ -3,6 +3,7 @@
 
 #include <climits>
 #include <limits>
+#include <new>
 #include <set>
 
 #include "Control/ERR_Catalogue.h"
@@ -16,6 +17,7 @@
 #include "platform/messages/ERR_MessageHandler.h"
 #include "platform/messages/HX_MessageHandler.h"
 #include "platform/os/HX_OsClock.h"
+#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -158,6 +160,81 @@ TEST_F(PlatformTest, NumbersAreWrittenInTheWidthAsked) {
   EXPECT_EQ(KyCXString(~0UL, true, false).length(), int{2 * sizeof(long)});
   EXPECT_EQ(KyCXString(1UL, false, false).length(),
             sizeof(long) == 4 ? 10 : 20);
+}
+
+// Changes of a text that ask for memory: of 100 units below 256, and of as many
+// with a larger unit among them.
+using Change = void (*)(KyCXString& text, const KyCXString& wide);
+constexpr Change kChanges[] = {
+    [](auto& text, auto& wide) { text = wide; },
+    [](auto& text, auto&) { text = std::string(200, 'z').c_str(); },
+    [](auto& text, auto& wide) { text += wide; },
+    [](auto& text, auto&) { text += std::string(200, 'z').c_str(); },
+    [](auto& text, auto& wide) { text.appendSub(wide, 1, 98); },
+    [](auto& text, auto&) { text.appendUnit(0x3B1); },
+    [](auto& text, auto& wide) { text.replace("b", wide); },
+    [](auto& text, auto&) { text.replaceWhiteSpace('_', true); },
+    [](auto& text, auto&) { text.makeCIdentifier(false); },
+    [](auto& text, auto&) { text.trim(true, true); },
+    [](auto& text, auto&) { text.toUpper(); },
+    [](auto& text, auto&) {
+      text.shortenString(90, 2, '_', KyCXString::ePositionMiddle);
+    },
+    [](auto& text, auto&) {
+      leda::array<KyCXString> parts;
+      text.split('b', parts);
+      text = parts[0];
+    }};
+
+TEST_F(PlatformTest, TextsStayAsTheyWereWithoutMemory) {
+  const KyCXString narrow(("1 " + std::string(96, 'a') + "b ").c_str());
+  const unsigned short kUnit = 0x416;
+  const KyCXString wide = narrow.head(50) + KyCXString(&kUnit, 1) + narrow;
+  int changed = 0;
+  int number = 0;
+  for (const Change change : kChanges) {
+    ++number;
+    for (const KyCXString* start : {&narrow, &wide}) {
+      KyCXString wanted(*start);
+      change(wanted, wide);
+      for (int missing = 0;; ++missing) {
+        KyCXString text(*start);
+        bool isDone = false;
+        try {
+          const HX_FailingHeap heap(missing, false);
+          change(text, wide);
+          isDone = true;
+        } catch (const std::bad_alloc&) {
+        }
+        ASSERT_EQ(text, isDone ? wanted : *start)
+            << "change " << number << " block " << missing;
+        if (isDone) break;
+        ++changed;
+      }
+    }
+  }
+  EXPECT_GT(changed, 20);
+}
+
+TEST_F(PlatformTest, MessagesWithoutMemoryReachStatusAndSink) {
+  HX_MessageHandler& handler = HX_MessageHandler::instance();
+  const std::string argument(100, 'x');
+  int heard = 0;
+  int id = 0;
+  handler.setSink([&](const HX_Message& message) {
+    ++heard;
+    id = message.id;
+  });
+  const auto recorded = handler.messages().size();
+  for (int missing = 0; missing < 2; ++missing) {
+    const HX_FailingHeap heap(missing, true);
+    ERR_EmitErrorMessage(2, nullptr, 1292, argument.c_str());
+  }
+  ERR_EmitErrorMessage(0, nullptr, 1292, argument.c_str());
+  EXPECT_EQ(heard, 3);
+  EXPECT_EQ(id, ERR_FindRow(1292)->id);
+  EXPECT_EQ(handler.messages().size(), recorded + 1);
+  EXPECT_EQ(ERR_get_errstatus(), 2);
 }
 
 TEST_F(PlatformTest, TheSinkHearsOnceAndUnknownRowsHaveNoText) {
