@@ -5,15 +5,15 @@
 //     return s_registry.value;
 //   }
 //
-// A host's static objects may still call the platform layer from their
-// destructors. The order of destruction is not ours to choose, so nothing that
-// such a call reaches has a destructor that runs.
+// Destructors of a host's static objects may still call the platform layer, and
+// the order of destruction is not ours to choose. Therefore objects within
+// reach of these calls have no destructor at the end of the process.
 
 #ifndef PLATFORM_HX_NEVERDESTROYED_H
 #define PLATFORM_HX_NEVERDESTROYED_H
 
 /// Constructs the value and never runs the destructor of T. The value lies
-/// inside the object, so leak checkers see everything the value owns.
+/// inside the object: leak checkers see all blocks of the value.
 template <class T>
 union HX_NeverDestroyed {
   HX_NeverDestroyed() : value() {}

@@ -1,4 +1,4 @@
-// Marks what the platform layer exports from its shared object.
+// Marks the exports of the shared object of the platform layer.
 
 #ifndef PLATFORM_HX_PLATFORMEXPORT_H
 #define PLATFORM_HX_PLATFORMEXPORT_H

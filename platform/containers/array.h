@@ -34,10 +34,10 @@ class array {
     return m_Elements[static_cast<std::size_t>(index)];
   }
 
-  /// Keeps the elements that still fit; new ones are value-initialised.
+  /// Keeps the elements below \p size; new elements are value-initialised.
   void resize(int size) { m_Elements.resize(static_cast<std::size_t>(size)); }
 
-  /// For loops over all elements, in the order of their indices.
+  /// For loops over all elements, in the order of the indices.
   auto begin() { return m_Elements.begin(); }
   auto end() { return m_Elements.end(); }
   auto begin() const { return m_Elements.begin(); }

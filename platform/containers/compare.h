@@ -1,4 +1,4 @@
-// The order that the ordered containers use.
+// The order of the ordered containers.
 //
 // A type with an order of its own overloads leda::compare, before or after the
 // include of a container; all other types are ordered by operator<.
@@ -10,11 +10,11 @@
 
 namespace leda {
 
-// Stands for a key in the call that looks for an overload of compare(). As a
+// Stands for a key in a call that looks for an overload of compare(). As a
 // class of namespace leda, the argument makes the compiler look for overloads
 // where a container is used, not where the container is declared: the order of
 // the includes does not matter. Converts to the type of the key and to no
-// other, because an overload for another type is not meant.
+// different type, because an overload for a different type is not meant.
 template <class Key>
 class KeyToCompare {
  public:
@@ -36,7 +36,7 @@ inline constexpr bool kIsKeyToCompare<KeyToCompare<Key>> = true;
 
 }  // namespace detail
 
-/// Negative if \p a goes before \p b, 0 if they are equal, else positive.
+/// Negative if \p a goes before \p b, 0 for equal keys, else positive.
 template <class T>
 requires(!detail::kIsKeyToCompare<T>) int compare(const T& a, const T& b) {
   if (a < b) return -1;
@@ -45,7 +45,7 @@ requires(!detail::kIsKeyToCompare<T>) int compare(const T& a, const T& b) {
 
 namespace detail {
 
-// The order of two keys: by the overload for Key if there is one in namespace
+// The order of two keys: by the overload for Key, if one stands in namespace
 // leda or in the namespace of Key, else by operator<.
 template <class Key>
 int compareKeys(const Key& a, const Key& b) {

@@ -1,4 +1,4 @@
-// An ordered dictionary: each key at most once, ascending by leda::compare.
+// An ordered dictionary: a key at most once, ascending by leda::compare.
 //
 //   leda::dictionary<KyCXString, int, leda::ab_tree> d;
 //   d.insert("a", 1);
@@ -53,14 +53,15 @@ class dictionary {
   item lookup(const Key& key) const { return at(map().find(key)); }
   bool defined(const Key& key) const { return m_Map.count(key) != 0; }
 
-  /// Enters \p key; an entry already there gets \p inf.
+  /// Enters \p key; a present entry gets \p inf.
   item insert(const Key& key, const Inf& inf) {
     return item(m_Map.insert_or_assign(key, inf).first);
   }
-  /// Nothing happens if \p key is not there.
+  /// Nothing happens without an entry of \p key.
   void del(const Key& key) { m_Map.erase(key); }
 
-  /// The key, and the information, of an entry; \p it must not be null.
+  /// The key and the information of an entry.
+  /// REQUIRES: \p it is not null.
   const Key& key(item it) const { return it.m_Place->first; }
   const Inf& inf(item it) const { return it.m_Place->second; }
   Inf& operator[](item it) { return it.m_Place->second; }

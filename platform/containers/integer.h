@@ -1,4 +1,4 @@
-// Integers of any size, for values that no built-in type holds.
+// Integers of any size, for values beyond the built-in types.
 //
 //   leda::integer big = (leda::integer(1) << 70) + leda::integer("-12");
 //   big.to_string();       // "1180591620717411303412"
@@ -21,7 +21,7 @@
 
 namespace leda {
 
-/// A value type. There is one zero, which has the sign 0.
+/// A value type. Zero has the sign 0.
 class HX_PLATFORM_API integer {
  public:
   constexpr integer() = default;
@@ -32,11 +32,11 @@ class HX_PLATFORM_API integer {
         m_IsNegative(value < 0) {}
   constexpr integer(unsigned int value) : m_Small(value) {}
 
-  /// Reads decimal digits with an optional sign in front; any other text gives
-  /// 0.
+  /// Reads decimal digits with an optional sign in front. Any different text
+  /// gives 0.
   explicit integer(const char* text);
 
-  /// The same value, in memory of its own.
+  /// The same value, in separate memory.
   integer(const integer& other)
       : m_Small(other.m_Small), m_IsNegative(other.m_IsNegative) {
     if (other.m_pLarge) copyLarge(other);
@@ -48,12 +48,12 @@ class HX_PLATFORM_API integer {
 
   /// -1, 0 or 1.
   int sign() const { return m_IsNegative ? -1 : used_words() != 0; }
-  /// The words of the magnitude up to its highest that is not 0; none for 0.
+  /// The words of the magnitude up to the highest nonzero word; none for 0.
   int used_words() const {
     if (m_pLarge) return static_cast<int>(m_pLarge->size());
     return (m_Small != 0) + (m_Small >> 32 != 0);
   }
-  /// Word \p i of the magnitude, the least significant one being word 0; 0 from
+  /// Word \p i of the magnitude, word 0 being the least significant; 0 from
   /// used_words() on. \p i must not be negative.
   std::uint32_t contents(int i) const {
     if (m_pLarge) return largeWord(i);
@@ -69,13 +69,13 @@ class HX_PLATFORM_API integer {
     }
     return shifted(bits);
   }
-  /// The value with the other sign.
+  /// The value with the opposite sign.
   integer operator-() const {
     integer result(*this);
     result.m_IsNegative = !m_IsNegative && used_words() != 0;
     return result;
   }
-  /// Exact: there are no bounds.
+  /// Exact, without bounds.
   friend integer operator+(const integer& a, const integer& b) {
     if (a.m_pLarge || b.m_pLarge) return sum(a, b);
     if (a.m_IsNegative == b.m_IsNegative) {
@@ -88,7 +88,7 @@ class HX_PLATFORM_API integer {
     return integer(b.m_Small - a.m_Small,
                    b.m_IsNegative && a.m_Small != b.m_Small);
   }
-  /// Exact: there are no bounds.
+  /// Exact, without bounds.
   friend integer operator-(const integer& a, const integer& b) {
     return a + -b;
   }
@@ -98,7 +98,7 @@ class HX_PLATFORM_API integer {
       return b.m_IsNegative <=> a.m_IsNegative;
     const auto order =
         a.m_pLarge || b.m_pLarge ? compareLarge(a, b) : a.m_Small <=> b.m_Small;
-    // An ordering compares with the literal 0 alone, which is no pointer.
+    // An ordering compares with the literal 0 alone, no pointer.
     // NOLINTNEXTLINE(modernize-use-nullptr)
     return a.m_IsNegative ? 0 <=> order : order;
   }
@@ -121,7 +121,7 @@ class HX_PLATFORM_API integer {
   static integer sum(const integer& a, const integer& b);
   static std::strong_ordering compareLarge(const integer& a, const integer& b);
 
-  std::uint64_t m_Small = 0;        // the magnitude if there are no words
+  std::uint64_t m_Small = 0;        // the magnitude unless there are words
   std::unique_ptr<Words> m_pLarge;  // 3 words or more, the highest not 0
   bool m_IsNegative = false;
 };

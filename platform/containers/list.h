@@ -1,4 +1,4 @@
-// A doubly linked list whose items stay valid while other items come and go.
+// A doubly linked list. Items stay valid while neighbours come and go.
 //
 //   leda::list<int> l;
 //   l.append(1);
@@ -13,7 +13,7 @@
 
 namespace leda {
 
-/// A place in a list, or null. Valid until its own element is deleted.
+/// A place in a list, or null. Valid until the element at the place is deleted.
 template <class T>
 class list_item {
  public:
@@ -42,10 +42,10 @@ class list {
   /// A place in a list of this type.
   using item = list_item<T>;
 
-  /// The number of elements, and whether it is 0.
+  /// Whether the list is empty; the number of elements.
   bool empty() const { return m_Elements.empty(); }
   int size() const { return static_cast<int>(m_Elements.size()); }
-  /// Deletes all elements, and with them their items.
+  /// Deletes all elements; their items become invalid.
   void clear() { m_Elements.clear(); }
 
   /// The first item, null for an empty list.
@@ -54,26 +54,30 @@ class list {
   item last() const {
     return empty() ? item() : item(std::prev(elements().end()));
   }
-  /// The item after \p it, null after the last one.
+  /// The item after \p it, null after the last item.
   item succ(item it) const { return at(std::next(it.m_Place)); }
 
-  /// The element at \p it, which must not be null.
+  /// The element at \p it.
+  /// REQUIRES: \p it is not null.
   T& operator[](item it) { return *it.m_Place; }
   const T& operator[](item it) const { return *it.m_Place; }
   const T& contents(item it) const { return *it.m_Place; }
   /// The first element; the list must not be empty.
   const T& front() const { return m_Elements.front(); }
 
-  /// Puts a copy of \p element at the end. \return its place
+  /// Puts a copy of \p element at the end.
+  /// RETURNS: the place of the copy.
   item append(const T& element) {
     return item(m_Elements.insert(m_Elements.end(), element));
   }
-  /// Puts a copy of \p element before \p it, which must not be null. \return
-  /// its place
+  /// Puts a copy of \p element before \p it.
+  /// REQUIRES: \p it is not null.
+  /// RETURNS: the place of the copy.
   item insert_before(const T& element, item it) {
     return item(m_Elements.insert(it.m_Place, element));
   }
-  /// Deletes the element at \p it, which must not be null.
+  /// Deletes the element at \p it.
+  /// REQUIRES: \p it is not null.
   void del_item(item it) { m_Elements.erase(it.m_Place); }
 
   /// Removes and returns the first element; the list must not be empty.
@@ -88,8 +92,8 @@ class list {
   auto end() const { return m_Elements.end(); }
 
  private:
-  // Items of a constant list still name changeable places; only a list that
-  // may be changed hands out changeable elements.
+  // Items of a constant list still name changeable places; only a changeable
+  // list hands out changeable elements.
   std::list<T>& elements() const {
     return const_cast<std::list<T>&>(m_Elements);
   }

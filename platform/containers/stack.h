@@ -12,7 +12,7 @@ namespace leda {
 template <class T>
 class stack {
  public:
-  /// The number of elements, and whether it is 0.
+  /// Whether the stack is empty; the number of elements.
   bool empty() const { return m_Elements.empty(); }
   int size() const { return static_cast<int>(m_Elements.size()); }
   /// Puts a copy of \p element on top.

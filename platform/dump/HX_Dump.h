@@ -8,7 +8,7 @@
 class HX_Dumpable;
 class KyCXString;
 
-/// A host derives one class per output format.
+/// A host derives a class per output format.
 class HX_PLATFORM_API HX_Dump {
  public:
   virtual ~HX_Dump();
@@ -16,7 +16,7 @@ class HX_PLATFORM_API HX_Dump {
   /// Opens the section of \p object, headed by \p className.
   virtual void openObject(const HX_Dumpable* object,
                           const KyCXString& className) = 0;
-  /// One entry of the open section; \p level is its indentation.
+  /// One entry of the open section; \p level is the indentation.
   virtual void writeEntry(const KyCXString& label, const KyCXString& value,
                           int level) = 0;
   /// Closes the section of \p object.

@@ -1,4 +1,4 @@
-// The base of everything that can show itself in a developer dump.
+// The base class of objects in a developer dump.
 
 #ifndef PLATFORM_DUMP_HX_DUMPABLE_H
 #define PLATFORM_DUMP_HX_DUMPABLE_H

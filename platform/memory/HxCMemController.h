@@ -1,7 +1,7 @@
 // The generator's memory controller.
 //
 //   HxCMemController controller;
-//   pHXMemory = &controller;   // the library allocates through it from now on
+//   pHXMemory = &controller;   // the library allocates there from now on
 //   ...
 //   pHXMemory = nullptr;       // and from the C heap again
 
@@ -10,8 +10,8 @@
 
 #include "platform/HX_PlatformExport.h"
 
-/// Hands out blocks of the C heap; a host derives its own controller. A block
-/// must be freed by the controller that allocated it.
+/// Hands out blocks of the C heap; a host derives a controller. The controller
+/// that allocated a block frees the block.
 class HX_PLATFORM_API HxCMemController {
  public:
   HxCMemController() = default;
@@ -19,8 +19,8 @@ class HX_PLATFORM_API HxCMemController {
   HxCMemController& operator=(const HxCMemController&) = delete;
   virtual ~HxCMemController();
 
-  /// \p size bytes, aligned for every type and owned by the caller; null if
-  /// there is no memory.
+  /// \p size bytes, aligned for every type and owned by the caller; null
+  /// without memory.
   virtual void* allocMemBlock(unsigned long size);
   /// Takes a block back; null is ignored.
   virtual void freeMemBlock(void* block);

@@ -1,6 +1,6 @@
-// Where the clocks of HX_OsClock.h take their time from.
+// The source of time of the clocks in HX_OsClock.h.
 //
-// A test derives a source whose time it sets by hand:
+// A test derives a source and sets the time by hand:
 //
 //   MyClock clock;
 //   HX_ClockSource::install(&clock);
@@ -14,19 +14,19 @@
 
 #include "platform/HX_PlatformExport.h"
 
-/// What the clocks of the process ask. A host may put its own source in place.
+/// Asked by the clocks of the process. A host may install a source.
 class HX_PLATFORM_API HX_ClockSource {
  public:
   virtual ~HX_ClockSource();
 
   /// Milliseconds since the process started.
   virtual std::int64_t processClock() = 0;
-  /// Ticks per second of the counter; 0 if there is no counter.
+  /// Ticks per second of the counter; 0 without a counter.
   virtual std::int64_t counterFrequency() = 0;
   virtual std::int64_t counter() = 0;
 
   /// Makes \p source the source of every clock; null stands for the system's
-  /// own clocks. The source is not owned.
+  /// own clocks. OWNERSHIP: the host's.
   static void install(HX_ClockSource* source) { s_pSource = source; }
   static HX_ClockSource* installed() { return s_pSource; }
 

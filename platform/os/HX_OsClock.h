@@ -18,11 +18,11 @@ HX_PLATFORM_API std::int64_t HX_ProcessClock();
 inline constexpr std::int64_t kSystemCounterFrequency = 1'000'000'000 / 64;
 
 /// Ticks per second of the high-resolution counter.
-/// \return 1 if there is such a counter, else 0 with \p frequency untouched.
+/// RETURNS: 1; without a counter 0, with \p frequency untouched.
 HX_PLATFORM_API int QueryPerformanceFrequency(std::int64_t* frequency);
 
-/// The ticks of the high-resolution counter, which never runs backwards.
-/// \return 1 if there is such a counter, else 0 with \p ticks untouched.
+/// The ticks of the high-resolution counter. The counter never runs backwards.
+/// RETURNS: 1; without a counter 0, with \p ticks untouched.
 HX_PLATFORM_API int QueryPerformanceCounter(std::int64_t* ticks);
 
 #endif  // PLATFORM_OS_HX_OSCLOCK_H

@@ -8,13 +8,13 @@
 
 #include "platform/HX_PlatformExport.h"
 
-/// Names a thread; it is not to be closed.
+/// Names a thread. A handle is not closed.
 using HX_ThreadHandle = void*;
 
 /// Levels with a name.
 inline constexpr int THREAD_PRIORITY_LOWEST = -2;
 inline constexpr int THREAD_PRIORITY_NORMAL = 0;
-/// What GetThreadPriority() answers when it cannot tell.
+/// The answer of GetThreadPriority() for an unknown thread.
 inline constexpr int THREAD_PRIORITY_ERROR_RETURN = 0x7fffffff;
 
 /// The calling thread; null if the system gives no handle.
@@ -24,8 +24,8 @@ HX_PLATFORM_API HX_ThreadHandle GetCurrentThread();
 HX_PLATFORM_API int GetThreadPriority(HX_ThreadHandle thread);
 
 /// Sets the priority level of \p thread.
-/// \return 1 if the system accepted it; 0 for a level that does not exist or
-/// that the process may not set.
+/// RETURNS: 1; 0 for a level that does not exist or that the process may not
+/// set.
 HX_PLATFORM_API int SetThreadPriority(HX_ThreadHandle thread, int priority);
 
 #endif  // PLATFORM_OS_HX_OSTHREAD_H

@@ -16,8 +16,8 @@ void setWord(std::string& bytes, std::size_t at, std::size_t value) {
   std::memcpy(&bytes[at], &word, sizeof word);
 }
 
-// A node with its value and its children, which are nodes already. Empty if it
-// or one of its children is too large.
+// A node with a value and children, nodes already. Empty if the node or a child
+// is too large.
 std::string node(const std::string& name, const std::string& value,
                  const std::vector<std::string>& children = {}) {
   std::string bytes(4, '\0');

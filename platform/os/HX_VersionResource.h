@@ -1,4 +1,4 @@
-// The version information that a host gives its modules.
+// Version information of modules, set by a host.
 //
 //   HX_VersionResource resource;
 //   resource.setVersions({6, 1, 0, 0}, {6, 1, 0, 17});
@@ -7,15 +7,15 @@
 //   HX_LoadModule("hx_codegen", "/opt/generator/bin/hx_codegen",
 //                 resource.block());
 //
-// The block is the 8-bit form of a version resource: a tree of nodes, each
+// The block is the 8-bit form of a version resource: a tree of nodes of
 //
-//   bytes of the node with its children   16 bits
+//   bytes of the node with the children   16 bits
 //   bytes of the value                    16 bits
 //   name                                  zero-terminated
-//   value, children                       each at a multiple of four bytes
+//   value, children                       all at multiples of four bytes
 //
-// with the root VS_VERSION_INFO and below it StringFileInfo (a table of texts
-// per language and code page) and VarFileInfo.
+// with the root VS_VERSION_INFO and below the root StringFileInfo (a table of
+// texts per language and code page) and VarFileInfo.
 
 #ifndef PLATFORM_OS_HX_VERSIONRESOURCE_H
 #define PLATFORM_OS_HX_VERSIONRESOURCE_H
@@ -28,7 +28,7 @@
 
 #include "platform/HX_PlatformExport.h"
 
-/// A value type; what was not set is not in the block.
+/// A value type. The block holds only what was set.
 class HX_PLATFORM_API HX_VersionResource {
  public:
   /// The four parts of a version, the most significant first.
@@ -36,9 +36,9 @@ class HX_PLATFORM_API HX_VersionResource {
 
   /// Sets the fixed part of the resource.
   void setVersions(const Version& product, const Version& file);
-  /// The first translation is the one that readers take.
+  /// Readers take the first translation.
   void addTranslation(std::uint16_t language, std::uint16_t codePage);
-  /// \p text is of ISO-8859-1; an earlier text of that name is replaced.
+  /// \p text is of ISO-8859-1; an earlier text of the name is replaced.
   void setText(std::uint16_t language, std::uint16_t codePage,
                const std::string& name, const std::string& text);
 
@@ -53,7 +53,7 @@ class HX_PLATFORM_API HX_VersionResource {
 };
 
 /// Makes \p name a loaded module with the file \p path, in place of an earlier
-/// module of that name. The file itself is not looked at.
+/// module of the same name. The file itself is not looked at.
 /// \param versionBlock  of HX_VersionResource::block(); empty for a file that
 ///     has no version information
 HX_PLATFORM_API void HX_LoadModule(const std::string& name,

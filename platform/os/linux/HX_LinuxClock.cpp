@@ -59,8 +59,8 @@ std::int64_t age() {
   return std::max<std::int64_t>(ticksOf(CLOCK_BOOTTIME) - startTicks, 0);
 }
 
-// The first call fixes the origin: static objects may be constructed before
-// those of this file, and the clock must not run backwards for them.
+// The first call fixes the origin, because a static object of a different file
+// may ask before the static objects of this file exist.
 std::int64_t processStart() {
   static const std::int64_t s_start = monotonicTicks() - age();
   return s_start;

@@ -10,10 +10,10 @@ namespace {
 constexpr mode_t kReadWriteForAll = 0666;  // reduced by the process's umask
 
 // No buffer and no stream object between the text and the file: a log line
-// costs the three system calls it needs.
+// costs three system calls.
 bool writeOnce(const char* name, int mode, const char* text,
                std::size_t length) {
-  // Read and write, so that the file must grant what the "+" modes ask for.
+  // Read and write, because the "+" modes ask for both rights.
   const int file =
       open(name, O_RDWR | O_CREAT | O_CLOEXEC | mode, kReadWriteForAll);
   if (file < 0) return false;

@@ -1,5 +1,5 @@
 // Priority levels are nice values of the thread: on Linux the nice value
-// belongs to a thread and is reached through its thread id.
+// belongs to a thread and is reached through the thread id.
 
 #include <errno.h>
 #include <sys/resource.h>

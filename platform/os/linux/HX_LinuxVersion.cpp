@@ -1,5 +1,5 @@
-// Modules carry no version information on this system: the host says what is
-// loaded, and the calls read the blocks it gave.
+// Modules carry no version information on this system: the host names the
+// loaded modules, and the calls read the blocks of the host.
 
 #include <algorithm>
 #include <cstring>
@@ -42,8 +42,8 @@ const std::string* findBlock(const char* path) {
   return nullptr;
 }
 
-// One node of a block. A node that does not fit into its surroundings is
-// invalid, and so is everything below and behind it.
+// A node of a block. A node larger than the bytes around the node is invalid,
+// and so are all nodes below and behind.
 class Node {
  public:
   Node(const char* start, std::size_t available) : m_Start(start) {
@@ -70,7 +70,7 @@ class Node {
                       [](char a, char b) { return lower(a) == lower(b); });
   }
 
-  // The child of that name, invalid if there is none.
+  // The child of the name, invalid if not found.
   Node child(const char* name, std::size_t length) const {
     std::size_t at = aligned(m_ValueAt + m_ValueSize);
     while (at < m_Size) {
