@@ -424,6 +424,7 @@ void KyCXString::assignNarrow(const char* text, int length) {
   }
   delete[] std::exchange(m_Wide, nullptr);
   setLength(length);
+  delete[] std::exchange(m_Wide, nullptr);
 }
 
 // \p units may lie inside this object.

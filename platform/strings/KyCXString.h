@@ -55,7 +55,8 @@ class HX_PLATFORM_API KyCXString {
     if (ownsMemory()) release();
   }
 
-  /// Copies, moves, or reads as the constructors do.
+  /// Copies, moves, or reads as the constructors do. Without memory, that is
+  /// with std::bad_alloc, the text stays as before.
   KyCXString& operator=(const KyCXString& other);
   KyCXString& operator=(KyCXString&& other) noexcept;
   KyCXString& operator=(const char* text);
