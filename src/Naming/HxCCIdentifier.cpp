@@ -24,12 +24,9 @@ bool containsMacro(const KyCXString& text, char letter) {
   return false;
 }
 
-// Copies first: an assignment that runs out of memory may leave half a text.
+// The string class keeps a text whose assignment runs out of memory.
 void assign(KyCXString& target, const KyCXString& text) {
-  HX_WithinMemory([&] {
-    KyCXString copy(text);
-    target = std::move(copy);
-  });
+  HX_WithinMemory([&] { target = text; });
 }
 
 }  // namespace

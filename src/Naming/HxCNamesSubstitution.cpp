@@ -127,7 +127,8 @@ bool HxCNames::replaceAll(HxCCIdentifier& id, const KyCXString& macro,
                                         value.m_Formal.cooked, kind, text);
   const bool inActual = substAllDollarZByValue(id, macro, value, kind,
                                                HxCCIdentifier::eActualName);
-  inherit(id, macro, value);
+  // The actual name, put into itself, may use more macros now.
+  if (&value == &id) inherit(id, macro, value);
   if (inFormal) storeSubstituted(id, macro, std::move(text), kFormal);
   return inActual || inFormal;
 }
