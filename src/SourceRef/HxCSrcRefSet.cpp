@@ -92,8 +92,15 @@ bool HxCSrcRefSet::addToNonEmpty(const HxCSrcRef* srcRef) {
 }
 
 bool HxCSrcRefSet::appendNew(const HxCSrcRef* srcRef) {
-  if (!m_IsSingle)
-    return HX_WithinMemory([&] { m_Content.list->refs.push_back(srcRef); });
+  if (!m_IsSingle) {
+    auto& refs = m_Content.list->refs;
+    const std::size_t size = refs.size();
+    if (size == refs.capacity() &&
+        !HX_WithinMemory([&refs, size] { refs.reserve(2 * size); }))
+      return false;
+    refs.push_back(srcRef);
+    return true;
+  }
   if (m_Content.one == nullptr) {
     m_Content.one = srcRef;
     return true;

@@ -24,6 +24,8 @@ class KyCXString;
 /// the call does not give them. After the message a failed debug check "0"
 /// follows.
 ///
+/// If memory runs out, the report goes on with an empty file and cause.
+///
 /// While verbose() is false, notes, warnings and errors report nothing and draw
 /// no source reference number. A deadly fall-through is never silent: while
 /// verbose() is false, an internal assertion fails (message 7, fatal error).
