@@ -151,9 +151,8 @@ void HxCNames::createBothNamesFromForm(HxCCIdentifier& id, HX_DataType* type,
                              suppressMessages);
     formal.cooked = std::move(text);
   } else {
-    KyCXString copy(text);
+    actual.cooked = text;  // without memory the text stays as before
     formal.cooked = std::move(text);
-    actual.cooked = std::move(copy);
     actual.flags.changeable =
         formal.flags.changeable || follows == Follows::eChangeable;
     // At the level before the expansion: below the threshold of a getter the
