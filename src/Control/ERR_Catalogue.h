@@ -102,14 +102,13 @@ inline constexpr const char* kInternalMessages = "Internals message";
   ROW(1292, 99023, kInternalMessages, 5, (const char* text), (text),           \
       "INTERNAL: %s")
 
-/// Ascending by number.
-inline constexpr ERR_CatalogueRow kErrCatalogue[] = {
 /// A message as a row of the table.
 #define ERR_ROW(number, id, category, severity, parameters, arguments, text) \
   {number, id, category, severity, text},
-    ERR_MESSAGES(ERR_ROW)
+
+/// Ascending by number.
+inline constexpr ERR_CatalogueRow kErrCatalogue[] = {ERR_MESSAGES(ERR_ROW)};
 #undef ERR_ROW
-};
 
 /// The index of the row with this number, -1 if the library does not emit it.
 constexpr int ERR_FindIndex(int number) {
