@@ -237,8 +237,13 @@ void HX_LimitedNameSpace::adaptStringLength(KyCXString& s) {
 
 HX_LimitedNameSpace::Name* HX_LimitedNameSpace::find(
     const KyCXString& text) const {
-  const auto* slot = m_Names.find(
-      hashOf(text), [&](const Name* name) { return name->text == text; });
+  return find(text, hashOf(text));
+}
+
+HX_LimitedNameSpace::Name* HX_LimitedNameSpace::find(const KyCXString& text,
+                                                     int hash) const {
+  const auto* slot =
+      m_Names.find(hash, [&](const Name* name) { return name->text == text; });
   return slot == nullptr ? nullptr : slot->value;
 }
 
@@ -251,11 +256,12 @@ HX_LimitedNameSpace::Name* HX_LimitedNameSpace::findDefined(
 // Throws std::bad_alloc, with nothing changed.
 HX_LimitedNameSpace::Name* HX_LimitedNameSpace::findOrMake(
     const KyCXString& text) {
-  Name* name = find(text);
+  const int hash = hashOf(text);
+  Name* name = find(text, hash);
   if (name != nullptr) return name;
   name = new Name(text);
   if (name == nullptr) throw std::bad_alloc();
-  if (m_Names.add(hashOf(text), name) != nullptr) return name;
+  if (m_Names.add(hash, name) != nullptr) return name;
   delete name;
   throw std::bad_alloc();
 }

@@ -85,6 +85,7 @@ class HX_UTILS_API HX_LimitedNameSpace : public HX_Allocated {
   void adaptStringLength(KyCXString& s);
 
   Name* find(const KyCXString& text) const;
+  Name* find(const KyCXString& text, int hash) const;
   Name* findDefined(const KyCXString& text) const;
   Name* findOrMake(const KyCXString& text);
   void copyNames(const HX_LimitedNameSpace& other);
