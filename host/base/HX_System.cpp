@@ -4,7 +4,10 @@
 #include <unistd.h>
 
 #include <csignal>
+#include <cstdlib>
+#include <cstring>
 #include <iterator>
+#include <new>
 
 namespace fs = std::filesystem;
 
@@ -15,8 +18,33 @@ constexpr int kEndSignalCount = static_cast<int>(std::size(kEndSignals));
 
 struct sigaction s_Before[kEndSignalCount];
 volatile std::sig_atomic_t s_Waiting = 0;  // last delayed signal
+void* s_MemoryKept = nullptr;
+bool s_DidMemoryEnd = false;
 
 }  // namespace
+
+void HX_WriteError(const char* text) {
+  std::size_t length = std::strlen(text);
+  while (length > 0) {
+    const auto written = write(STDERR_FILENO, text, length);
+    if (written <= 0) return;
+    text += written;
+    length -= static_cast<std::size_t>(written);
+  }
+}
+
+void HX_KeepMemoryBack() {
+  constexpr std::size_t kEnough = 1 << 20;
+  s_MemoryKept = std::malloc(kEnough);
+  std::set_new_handler([] {
+    s_DidMemoryEnd = true;
+    std::free(s_MemoryKept);
+    s_MemoryKept = nullptr;
+    throw std::bad_alloc();
+  });
+}
+
+bool HX_DidMemoryEnd() { return s_DidMemoryEnd; }
 
 void HX_PrepareProcess() {
   std::signal(SIGPIPE, SIG_IGN);

@@ -12,6 +12,16 @@
 /// never becomes the standard output.
 void HX_PrepareProcess();
 
+/// Writes to the standard error output without asking for memory.
+void HX_WriteError(const char* text);
+
+/// Keeps memory back for the way out: when the memory ends, that memory is
+/// freed and std::bad_alloc is thrown once.
+void HX_KeepMemoryBack();
+
+/// Whether the memory ended at any time, also where the failure was handled.
+bool HX_DidMemoryEnd();
+
 /// Whether a person may read the standard error output.
 bool HX_IsErrorOutputTerminal();
 

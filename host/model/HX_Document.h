@@ -1,44 +1,44 @@
-// A model document: JSON in the form that host/model.schema.json describes.
+// The text of a model document, and the places of faults in the text.
 //
 //   HX_Document document("cruise_control.json", folder);
-//   for (const HX_Json& name : HX_FieldOrEmpty(document.root, "names"))
-//     if (isTaken(name["id"])) document.fail(name["id"], "another id");
-//
-// What a schema cannot tell (ids that repeat or lead nowhere) is up to the
-// reader.
+//   document.faults.add(end, "7", "a text");
+//   document.throwIfFaulty();
+//   // cruise_control.json:12:15: /names/3/id: found 7, expected a text
 
 #ifndef HOST_MODEL_HX_DOCUMENT_H
 #define HOST_MODEL_HX_DOCUMENT_H
 
 #include <filesystem>
-#include <nlohmann/json.hpp>
-#include <stdexcept>
+#include <map>
 #include <string>
 
-using HX_Json = nlohmann::json;
-
-/// What is wrong with a document: one line with file, place and expectation.
-class HX_DocumentError : public std::runtime_error {
- public:
-  using std::runtime_error::runtime_error;
-};
+#include "host/base/HX_Faults.h"
 
 struct HX_Document {
-  /// Throws HX_DocumentError for a file that cannot be read, is no JSON, or
-  /// does not have the form of the schema.
-  /// \param file  as the user wrote it, counted from \p folder
-  HX_Document(const std::string& file, const std::filesystem::path& folder);
+  /// Reads the file. Throws HX_InputError if the file cannot be read.
+  /// \param name  as the user wrote the name, counted from \p folder
+  HX_Document(const std::string& name, const std::filesystem::path& folder);
 
-  /// Throws the error "<file>: <place>: expected <expectation>"; the place is
-  /// the JSON pointer (RFC 6901) of \p value, which lies in the document.
-  [[noreturn]] void fail(const HX_Json& value,
-                         const std::string& expectation) const;
+  /// Throws HX_DocumentError with a line for each fault, if there are faults:
+  /// "FILE:LINE:COLUMN: POINTER: found FOUND, expected EXPECTED".
+  void throwIfFaulty() const;
+
+  /// "FILE:LINE:COLUMN: POINTER" of the token.
+  std::string placeText(HX_TokenEnd end) const;
+
+  /// Line and column of the token in front of \p end, and its JSON pointer
+  /// (RFC 6901, "/" for the root), for tokens and for a fault of the syntax.
+  struct Place {
+    std::size_t begin = 0;
+    std::string pointer = "/";
+  };
+  /// Reads the text once more for all places.
+  std::map<std::size_t, Place> locate(const HX_Faults& list) const;
+  std::string shown(const Place& place) const;
 
   std::string file;
-  HX_Json root;
+  std::string text;
+  HX_Faults faults;  // places are ends of tokens
 };
-
-/// A field of an object; an empty object if it is missing.
-const HX_Json& HX_FieldOrEmpty(const HX_Json& node, const char* field);
 
 #endif  // HOST_MODEL_HX_DOCUMENT_H

@@ -14,9 +14,12 @@
 #include <memory>
 #include <set>
 #include <string>
+#include <string_view>
+#include <unordered_map>
 #include <vector>
 
 #include "SourceRef/HxCDdSrcRef.h"
+#include "host/model/HX_SourcePaths.h"
 #include "host/model/HX_Types.h"
 #include "host/model/HX_WantedName.h"
 #include "platform/datatypes/HX_DataTypeServer.h"
@@ -27,11 +30,24 @@
 
 struct HX_Document;
 
+/// Items that depend on themselves; empty for none.
+struct HX_Circle {
+  std::vector<std::size_t> items;  // in the document; each uses the next
+  HX_TokenEnd end = 0;             // of the first item
+  std::string place;               // "FILE:LINE:COLUMN: POINTER"
+
+  /// The first circle stays.
+  void enter(const std::vector<std::size_t>& circle, HX_TokenEnd token) {
+    if (!items.empty()) return;
+    items = circle;
+    end = token;
+  }
+};
+
 /// Owns all items of the document, in document order.
 struct HX_Model {
-  /// Throws HX_DocumentError for an id that repeats or has no item, and for a
-  /// word list that \p keywordFolder does not have. Frees long lists of the
-  /// document while reading.
+  /// Throws HX_DocumentError with the faults of the document, of a word list,
+  /// or of a word list that \p keywordFolder does not have.
   HX_Model(HX_Document& document, const std::string& keywordFolder);
   HX_Model(const HX_Model&) = delete;
   HX_Model& operator=(const HX_Model&) = delete;
@@ -43,6 +59,8 @@ struct HX_Model {
   std::deque<HX_ScopeItem> scopes;  // parents first
   HX_ScopeItem* fileScope = nullptr;
   std::deque<HX_WantedName> names;
+  HX_Circle typeCircle;
+  HX_Circle variableCircle;
 
   // Seen through the library.
   HX_OptionsExt options;
@@ -51,6 +69,13 @@ struct HX_Model {
   std::deque<SC_Chart> charts;
   std::deque<SC_State> chartObjects;
   std::deque<HxCDdSrcRef> ddRefs;
+  HX_SourcePaths paths;
+
+  /// The template of the text, made if it is new.
+  const HX_Template* enterTemplate(std::string_view text);
+
+ private:
+  std::unordered_map<std::string, HX_Template> m_Templates;
 };
 
 #endif  // HOST_MODEL_HX_MODEL_H

@@ -1,8 +1,9 @@
 #include "host/model/HX_Synthesis.h"
 
-#include <nlohmann/json.hpp>
+#include <iterator>
+#include <string>
 
-using nlohmann::ordered_json;
+#include "host/base/HX_JsonWriter.h"
 
 namespace {
 
@@ -37,53 +38,116 @@ std::string blockName(Random& random) {
   return name;
 }
 
-constexpr char kFrame[] = R"({
-  "model": {"name": "synthetic", "systemId": "a"},
-  "options": {"limitNames": true},
-  "blocks": [],
-  "types": [
-    {"id": "i16", "name": "Int16", "kind": "base", "c": "short", "cut": "i16"},
-    {"id": "f32", "name": "Float32", "kind": "base", "c": "float",
-     "cut": "f32"},
-    {"id": "speed", "name": "speed_t", "kind": "derived", "of": "i16"}],
-  "names": []
-})";
+std::string numbered(const char* letter, int number) {
+  return letter + std::to_string(number);
+}
 
-ordered_json variable(int index, Random& random) {
-  static constexpr const char* kTypes[] = {"i16", "f32", "speed"};
+struct TypeRow {
+  const char* id;
+  const char* name;
+  const char* kind;
+  const char* of;  // the C type of a base type, else the type below
+};
+
+constexpr TypeRow kTypes[] = {{"i16", "Int16", "base", "short"},
+                              {"f32", "Float32", "base", "float"},
+                              {"speed", "speed_t", "derived", "i16"}};
+
+void writeTypes(HX_JsonWriter& json) {
+  json.key("types");
+  json.open('[');
+  for (const TypeRow& row : kTypes) {
+    const bool isBase = std::string(row.kind) == "base";
+    json.next();
+    json.open('{');
+    json.field("id", row.id);
+    json.field("name", row.name);
+    json.field("kind", row.kind);
+    json.field(isBase ? "c" : "of", row.of);
+    if (isBase) json.field("cut", row.id);
+    json.close('}');
+  }
+  json.close(']');
+}
+
+void writeVariable(HX_JsonWriter& json, int index, Random& random) {
   static constexpr const char* kTemplates[] = {"$S_$B", "$B", "$L_$T",
                                                "$S_$B_$L"};
-  const std::string number = std::to_string(index);
-  ordered_json name{{"id", "v" + number},
-                    {"template", kTemplates[random.below(4)]},
-                    {"kind", "variable"},
-                    {"source", "b" + number},
-                    {"type", kTypes[random.below(3)]},
-                    {"label", "sig_" + std::to_string(random.below(index + 1))},
-                    {"initial", random.below(2000) - 1000},
-                    {"lsb", 0.5}};
-  if (index > 0 && random.below(4) == 0)
-    name["dependsOn"] = {"v" + std::to_string(random.below(index))};
-  return name;
+  json.next();
+  json.open('{');
+  json.field("id", numbered("v", index));
+  json.field("template", kTemplates[random.below(4)]);
+  json.field("kind", "variable");
+  json.field("source", numbered("b", index));
+  json.field("type", kTypes[random.below(3)].id);
+  json.field("label", numbered("sig_", random.below(index + 1)));
+  json.rawField("initial", std::to_string(random.below(2000) - 1000));
+  json.rawField("lsb", "0.5");
+  if (index > 0 && random.below(4) == 0) {
+    json.key("dependsOn");
+    json.open('[');
+    json.element(numbered("v", random.below(index)));
+    json.close(']');
+  }
+  json.close('}');
+}
+
+void beginSubsystem(HX_JsonWriter& json, int number) {
+  json.next();
+  json.open('{');
+  json.field("id", numbered("s", number));
+  json.field("name", "Subsystem " + std::to_string(number));
+  json.key("subsystem");
+  json.open('{');
+  json.field("id", "a");
+  json.rawField("number", std::to_string(number));
+  json.close('}');
+  json.key("blocks");
+  json.open('[');
+}
+
+void writeBlocks(HX_JsonWriter& json, int blocks, Random& random) {
+  json.key("blocks");
+  json.open('[');
+  for (int i = 0; i < blocks; ++i) {
+    if (i % kBlocksPerSubsystem == 0)
+      beginSubsystem(json, 1 + i / kBlocksPerSubsystem);
+    json.next();
+    json.open('{');
+    json.field("id", numbered("b", i));
+    json.field("name", blockName(random));
+    json.close('}');
+    if ((i + 1) % kBlocksPerSubsystem != 0 && i + 1 != blocks) continue;
+    json.close(']');
+    json.close('}');
+  }
+  json.close(']');
 }
 
 }  // namespace
 
-std::string HX_Synthesize(int blocks, std::uint64_t seed) {
-  Random random(seed);
-  ordered_json document = ordered_json::parse(kFrame);
-  ordered_json& subsystems = document["blocks"];
-  for (int i = 0; i < blocks; ++i) {
-    if (i % kBlocksPerSubsystem == 0) {
-      const int number = 1 + i / kBlocksPerSubsystem;
-      subsystems.push_back({{"id", "s" + std::to_string(number)},
-                            {"name", "Subsystem " + std::to_string(number)},
-                            {"subsystem", {{"id", "a"}, {"number", number}}},
-                            {"blocks", ordered_json::array()}});
-    }
-    subsystems.back()["blocks"].push_back(
-        {{"id", "b" + std::to_string(i)}, {"name", blockName(random)}});
-    document["names"].push_back(variable(i, random));
-  }
-  return document.dump(1) + "\n";
+void HX_Synthesize(std::ostream& out, int blocks, std::uint64_t seed) {
+  HX_JsonWriter json(out, 1);
+  json.open('{');
+  json.key("model");
+  json.open('{');
+  json.field("name", "synthetic");
+  json.field("systemId", "a");
+  json.close('}');
+  json.key("options");
+  json.open('{');
+  json.rawField("limitNames", "true");
+  json.close('}');
+  // Blocks and variables have random numbers of their own: neither list waits
+  // for the other list.
+  Random blockRandom(seed);
+  writeBlocks(json, blocks, blockRandom);
+  writeTypes(json);
+  json.key("names");
+  json.open('[');
+  Random nameRandom(~seed);
+  for (int i = 0; i < blocks; ++i) writeVariable(json, i, nameRandom);
+  json.close(']');
+  json.close('}');
+  json.end();
 }

@@ -16,6 +16,8 @@
 #include "host/model/HX_Types.h"
 #include "platform/model/HxCSymbol.h"
 
+struct HX_WantedName;
+
 struct HX_ScopeItem {
   std::string id;
   HX_ScopeKind kind = HX_ScopeKind::eFile;
@@ -23,35 +25,23 @@ struct HX_ScopeItem {
   std::map<std::string, const HX_ScopeItem*> blocks;  // inner blocks by id
 };
 
+/// A template; names with equal templates share one.
+struct HX_Template {
+  KyCXString text;                     // in ASCII, for the library
+  const std::string* shown = nullptr;  // as in the document
+};
+
 struct HX_Substitution {
   KyCXString macro;
   KyCXString value;
-  HxCNames::tagMacroKindEnum kind;
+  HxCNames::tagMacroKindEnum kind = HxCNames::eMacroKindExact;
 };
 
-/// Fields without a comment mean what the schema says. Never changed after
-/// reading.
-struct HX_WantedName {
-  /// Texts for the macros of the operating system, null for a missing text.
-  struct OsTexts {
-    std::optional<KyCXString> event;
-    std::optional<KyCXString> counter;
-    std::optional<KyCXString> message;
-    std::optional<KyCXString> messageVariable;
-    std::optional<KyCXString> osObject;
-  };
-
-  std::string id;
-  KyCXString nameTemplate;
-  HX_NameKind kind = HX_NameKind::eObject;
-  const HxCSrcRef* source = nullptr;
-  const HxCSrcRef* dd = nullptr;
-  HxCSrcRefSet sources;  // source, dd and `alsoFrom`
+/// What few names ask for.
+struct HX_RareWishes {
   std::optional<KyCXString> ivBlock;
-  KyCXString label;
   KyCXString x;
-  HX_TypeItem* type = nullptr;
-  const HX_ScopeItem* scope = nullptr;
+  std::vector<const HxCSrcRef*> alsoFrom;
   unsigned int retained = 0;     // macro bits
   unsigned int provisional = 0;  // macro bits
   bool modelContext = false;
@@ -59,25 +49,57 @@ struct HX_WantedName {
   std::vector<HX_Substitution> substitutions;
   const HX_WantedName* task = nullptr;
   const HX_WantedName* isr = nullptr;
-  OsTexts osTexts;
+  std::optional<KyCXString> event;
+  std::optional<KyCXString> counter;
+  std::optional<KyCXString> message;
+  std::optional<KyCXString> messageVariable;
+  std::optional<KyCXString> osObject;
   double period = 0;
   double offset = 0;
   bool cyclic = true;
+};
+
+/// Fields without a comment mean what the schema says. Never changed after
+/// reading.
+struct HX_WantedName {
+  std::string id;
+  const HX_Template* nameTemplate = nullptr;  // owned by the model
+  HX_NameKind kind = HX_NameKind::eObject;
+  KyCXString label;
+  const HxCSrcRef* source = nullptr;
+  const HxCSrcRef* dd = nullptr;
+  HX_TypeItem* type = nullptr;
+  const HX_ScopeItem* scope = nullptr;
+  const HX_ScopeItem* body = nullptr;  // of a function with a body
   std::vector<double> initial;
   double lsb = 1;
   double zero = 0;
   std::vector<const HX_WantedName*> dependsOn;
-
-  const HX_ScopeItem* body = nullptr;  // of a function with a body
+  std::unique_ptr<HX_RareWishes> rareWishes;  // null for none
 
   bool isTask() const {
     return kind == HX_NameKind::eTask || kind == HX_NameKind::eIsr;
   }
   bool isFunction() const { return isTask() || kind == HX_NameKind::eFunction; }
+  const HX_RareWishes& rare() const {
+    static const HX_RareWishes s_None;
+    return rareWishes != nullptr ? *rareWishes : s_None;
+  }
+  HX_RareWishes& makeRare() {
+    if (rareWishes == nullptr) rareWishes = std::make_unique<HX_RareWishes>();
+    return *rareWishes;
+  }
+  /// RETURNS: source, dd and alsoFrom.
+  HxCSrcRefSet sources() const {
+    HxCSrcRefSet set(source);
+    set.addSrcRef(dd);
+    for (const HxCSrcRef* also : rare().alsoFrom) set.addSrcRef(also);
+    return set;
+  }
   /// RETURNS: the task or isr whose times the macros take; null for none.
   const HX_WantedName* timed() const {
     if (isTask()) return this;
-    return task != nullptr ? task : isr;
+    return rare().task != nullptr ? rare().task : rare().isr;
   }
 };
 

@@ -2,6 +2,7 @@
 #include <algorithm>
 
 #include "Naming/HX_MacroTable.h"
+#include "host/base/HX_NameText.h"
 #include "host/base/HX_Text.h"
 #include "host/names/HX_NameForming.h"
 
@@ -72,7 +73,7 @@ std::vector<HX_ExplainedMacro> HX_NameForming::explain(
   std::vector<HX_ExplainedMacro> steps;
   std::vector<HX_Finding> unseen;
   const HX_MessageCollector collector(unseen);
-  const std::string text = HX_ToUtf8(name.nameTemplate);
+  const std::string text = *name.nameTemplate->shown;
   for (std::size_t from = 0; from < text.size();) {
     const std::size_t end = endOfToken(text, from);
     const std::string token = text.substr(from, end - from);
@@ -81,7 +82,7 @@ std::vector<HX_ExplainedMacro> HX_NameForming::explain(
       steps.push_back({token, token, meaningOf(name, token)});
       continue;
     }
-    HxCCIdentifier id(HX_FromUtf8(token));
+    HxCCIdentifier id(HX_NameText(token));
     expand(name, id, true);
     steps.push_back({token,
                      HX_ToUtf8(id.getCookedName(HxCCIdentifier::eFormalName)),

@@ -1,6 +1,7 @@
 #include "host/names/HX_Findings.h"
 
 #include "host/base/HX_Text.h"
+#include "host/model/HX_SourcePaths.h"
 #include "platform/messages/HX_MessageHandler.h"
 
 HX_MessageCollector* HX_MessageCollector::s_Current = nullptr;
@@ -21,6 +22,6 @@ void HX_MessageCollector::direct(HX_MessageCollector* collector) {
   HX_MessageHandler::instance().setSink([collector](const HX_Message& message) {
     collector->m_Findings.push_back({message.id, message.severity,
                                      HX_Latin1ToUtf8(message.text),
-                                     HX_Latin1ToUtf8(message.source)});
+                                     HX_PathOf(message.srcRef)});
   });
 }

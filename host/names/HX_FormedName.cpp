@@ -3,7 +3,6 @@
 #include <algorithm>
 
 #include "SourceRef/HxCSrcRefServer.h"
-#include "host/base/HX_Text.h"
 
 namespace {
 
@@ -31,10 +30,12 @@ std::string HX_FormedName::sourcePath() const {
 }
 
 const HxCSrcRef* HX_BestSource(const HX_WantedName& name) {
+  if (name.dd == nullptr && name.rare().alsoFrom.empty()) return name.source;
   const HxCSrcRef* block = nullptr;
   const HxCSrcRef* dd = nullptr;
   const HxCSrcRef* other = nullptr;
-  HxCSrcRefServer::getSpecificSrcRefFromSet(&name.sources, &block, &dd, &other);
+  const HxCSrcRefSet sources = name.sources();
+  HxCSrcRefServer::getSpecificSrcRefFromSet(&sources, &block, &dd, &other);
   if (block != nullptr) return block;
   return dd != nullptr ? dd : other;
 }
@@ -44,13 +45,6 @@ std::string HX_JoinedChanges(const HX_FormedName& name, const char* separator) {
   for (const HX_Change& change : name.changes)
     all += (all.empty() ? "" : separator) + change.text();
   return all;
-}
-
-std::string HX_PathOf(const HxCSrcRef* srcRef) {
-  if (srcRef == nullptr) return {};
-  KyCXString text;
-  srcRef->toString(text);
-  return HX_ToUtf8(text);
 }
 
 bool HX_RunResult::hasErrors() const {

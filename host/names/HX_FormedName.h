@@ -4,9 +4,11 @@
 #define HOST_NAMES_HX_FORMEDNAME_H
 
 #include <deque>
+#include <memory>
 #include <string>
 #include <vector>
 
+#include "host/model/HX_SourcePaths.h"
 #include "host/model/HX_WantedName.h"
 #include "host/names/HX_Findings.h"
 
@@ -35,7 +37,6 @@ struct HX_FormedName {
   explicit HX_FormedName(const HX_WantedName& name) : wanted(&name) {}
 
   const HX_WantedName* wanted;
-  KyCXString formal;
   KyCXString actual;
   bool isComplete = false;
   bool isDefined = false;  // stands in a scope and may be written into code
@@ -44,6 +45,18 @@ struct HX_FormedName {
 
   /// RETURNS: the path of the best source; empty without a source.
   std::string sourcePath() const;
+
+  const KyCXString& formal() const {
+    return m_OtherFormal != nullptr ? *m_OtherFormal : actual;
+  }
+  /// REQUIRES: `actual` has its final value.
+  void setFormal(const KyCXString& formal) {
+    if (!(formal == actual))
+      m_OtherFormal = std::make_unique<const KyCXString>(formal);
+  }
+
+ private:
+  std::unique_ptr<const KyCXString> m_OtherFormal;  // null if equal to actual
 };
 
 /// The texts of \p name.changes in their order.
@@ -52,9 +65,6 @@ std::string HX_JoinedChanges(const HX_FormedName& name, const char* separator);
 /// RETURNS: the last block of the sources, else the last dictionary object,
 /// else the last other source; null without a source.
 const HxCSrcRef* HX_BestSource(const HX_WantedName& name);
-
-/// The text of a source reference in UTF-8; empty for null.
-std::string HX_PathOf(const HxCSrcRef* srcRef);
 
 struct HX_RunResult {
   std::vector<const HX_TypeItem*> types;  // in the order of definition

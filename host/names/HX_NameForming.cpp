@@ -13,6 +13,10 @@ void remark(HX_FormedName& name, HX_Finding::HxESeverityTag severity,
   name.findings.push_back({0, severity, text, name.sourcePath()});
 }
 
+// Values of macros may hold macros of later substitutions: 1000 substitutions
+// could fill any memory.
+constexpr int kMostUnits = 65536;
+
 int countOf(char character, const KyCXString& text) {
   int count = 0;
   for (int at = text.find(character); at >= 0;
@@ -30,15 +34,15 @@ HxCCIdentifier finalName(const KyCXString& text) {
 }
 
 struct OsTextRow {
-  std::optional<KyCXString> HX_WantedName::OsTexts::*text;
+  std::optional<KyCXString> HX_RareWishes::*text;
   void (HxCNames::*replace)(HxCCIdentifier&, const HxCCIdentifier&);
 };
 
 constexpr OsTextRow kOsTexts[] = {
-    {&HX_WantedName::OsTexts::event, &HxCNames::replaceMultirateEventName},
-    {&HX_WantedName::OsTexts::counter, &HxCNames::replaceMultirateCtrName},
-    {&HX_WantedName::OsTexts::message, &HxCNames::replaceMultirateMsgName},
-    {&HX_WantedName::OsTexts::osObject, &HxCNames::replaceMultirateObjName},
+    {&HX_RareWishes::event, &HxCNames::replaceMultirateEventName},
+    {&HX_RareWishes::counter, &HxCNames::replaceMultirateCtrName},
+    {&HX_RareWishes::message, &HxCNames::replaceMultirateMsgName},
+    {&HX_RareWishes::osObject, &HxCNames::replaceMultirateObjName},
 };
 
 }  // namespace
@@ -58,66 +62,81 @@ std::deque<HX_FormedName> HX_NameForming::formAll(
 void HX_NameForming::form(HX_FormedName& name) {
   const HX_MessageCollector collector(name.findings);
   const HX_WantedName& wanted = *name.wanted;
-  if (countOf(':', wanted.nameTemplate) > 1)
+  if (countOf(':', wanted.nameTemplate->text) > 1)
     remark(name, HX_Finding::eWarning,
            "The name template has more than two parts; the first two count.");
-  HxCCIdentifier id(wanted.nameTemplate);
-  name.isComplete = expand(wanted, id, false);
+  HxCCIdentifier id(wanted.nameTemplate->text);
+  const std::optional<bool> isComplete = expand(wanted, id, false);
+  if (!isComplete)
+    return remark(name, HX_Finding::eError,
+                  "The values of macros hold macros: the name is longer than " +
+                      std::to_string(kMostUnits) + " characters.");
+  name.isComplete = *isComplete;
 
   // A name that still holds macros is no C name yet.
-  if (name.isComplete || wanted.retained == 0) {
+  if (name.isComplete || wanted.rare().retained == 0) {
     makeCName(id, name);
     define(id, name);
   }
-  name.formal = id.getCookedName(HxCCIdentifier::eFormalName);
   name.actual = id.getCookedName(HxCCIdentifier::eActualName);
+  name.setFormal(id.getCookedName(HxCCIdentifier::eFormalName));
   if (wanted.isTask()) m_TaskNames[&wanted] = id;
 }
 
-bool HX_NameForming::expand(const HX_WantedName& name, HxCCIdentifier& id,
-                            bool suppressMessages) {
+std::optional<bool> HX_NameForming::expand(const HX_WantedName& name,
+                                           HxCCIdentifier& id,
+                                           bool suppressMessages) {
   id.setSourceRef(name.source);
   id.setDdSourceRef(name.dd);
   id.setSignalLabel(name.label);
-  id.setDollarXValue(name.x);
-  HX_BdBlock ivBlock(name.ivBlock.value_or(KyCXString()), name.source);
-  if (name.ivBlock) id.setSourceIVBlock(&ivBlock);
+  const HX_RareWishes& rare = name.rare();
+  id.setDollarXValue(rare.x);
+  HX_BdBlock ivBlock(rare.ivBlock.value_or(KyCXString()), name.source);
+  if (rare.ivBlock) id.setSourceIVBlock(&ivBlock);
 
-  substitute(name, id);
+  if (!substitute(name, id)) {
+    id.setSourceIVBlock(nullptr);
+    return std::nullopt;
+  }
   const bool isComplete =
       name.kind == HX_NameKind::eFile
-          ? m_Names.handleFileNameMacro(id, name.modelContext)
+          ? m_Names.handleFileNameMacro(id, rare.modelContext)
           : m_Names.createNameFromForm(
                 id, name.type != nullptr ? &name.type->type : nullptr,
-                name.retained, name.provisional, suppressMessages);
+                rare.retained, rare.provisional, suppressMessages);
   id.setSourceIVBlock(nullptr);
   return isComplete;
 }
 
 // Symbol macros go before the expansion. The expansion finds the "$R" of their
 // values and does not report symbol macros as unsupported.
-void HX_NameForming::substitute(const HX_WantedName& name, HxCCIdentifier& id) {
-  for (const HX_Substitution& entry : name.substitutions)
+bool HX_NameForming::substitute(const HX_WantedName& name, HxCCIdentifier& id) {
+  for (const HX_Substitution& entry : name.rare().substitutions) {
     m_Names.substAllDollarZByValue(id, entry.macro, HxCCIdentifier(entry.value),
                                    entry.kind);
+    if (id.getCookedName(HxCCIdentifier::eActualName).length() > kMostUnits)
+      return false;
+  }
   replaceMultirate(name, id);
-  if (name.symbol) m_Names.handleSymbolNameMacro(id, name.symbol.get());
+  if (HxCSymbol* symbol = name.rare().symbol.get())
+    m_Names.handleSymbolNameMacro(id, symbol);
+  return true;
 }
 
 void HX_NameForming::replaceMultirate(const HX_WantedName& name,
                                       HxCCIdentifier& id) {
   if (const HX_WantedName* timed = name.timed()) {
-    m_Names.replaceMultirateTaskISRName(id, m_TaskNames[name.task],
-                                        m_TaskNames[name.isr],
+    m_Names.replaceMultirateTaskISRName(id, m_TaskNames[name.rare().task],
+                                        m_TaskNames[name.rare().isr],
                                         name.kind == HX_NameKind::eTask);
-    m_Names.replaceMultirateTimeName(id, timed->period, timed->offset,
-                                     timed->cyclic);
+    m_Names.replaceMultirateTimeName(
+        id, timed->rare().period, timed->rare().offset, timed->rare().cyclic);
   }
   for (const OsTextRow& row : kOsTexts) {
-    if (const auto& text = name.osTexts.*row.text)
+    if (const auto& text = name.rare().*row.text)
       (m_Names.*row.replace)(id, finalName(*text));
   }
-  if (const auto& text = name.osTexts.messageVariable)
+  if (const auto& text = name.rare().messageVariable)
     m_Names.replaceMultirateMsgVarName(id, *text);
 }
 

@@ -10,6 +10,7 @@
 #include <deque>
 #include <functional>
 #include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -40,9 +41,10 @@ class HX_NameForming {
 
  private:
   void form(HX_FormedName& name);
-  bool expand(const HX_WantedName& name, HxCCIdentifier& id,
-              bool suppressMessages);
-  void substitute(const HX_WantedName& name, HxCCIdentifier& id);
+  /// RETURNS: whether the name is complete; no value for a name too long.
+  std::optional<bool> expand(const HX_WantedName& name, HxCCIdentifier& id,
+                             bool suppressMessages);
+  bool substitute(const HX_WantedName& name, HxCCIdentifier& id);
   void replaceMultirate(const HX_WantedName& name, HxCCIdentifier& id);
   void makeCName(HxCCIdentifier& id, HX_FormedName& name);
   void define(HxCCIdentifier& id, HX_FormedName& name);

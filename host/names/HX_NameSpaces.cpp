@@ -29,13 +29,12 @@ HX_NameSpaces::~HX_NameSpaces() {
 void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
   for (const HX_TypeItem* type : types) {
     for (const HX_TypeItem::Field& field : type->fields)
-      m_Names.isStringValidCVariableName(field.name.c_str());
+      check(field.name, field.place);
     for (const HX_TypeItem::Constant& constant : type->values) {
-      m_Names.isStringValidCVariableName(constant.name.c_str());
+      check(constant.name, constant.place);
       m_File.defineString(constant.name.c_str());
     }
-    if (!type->isNameless)
-      m_Names.isStringValidCVariableName(type->name.c_str());
+    if (!type->isNameless) check(type->name, type->place);
   }
   for (const HX_TypeItem* type : types) {
     if (!type->isNameless)
@@ -44,6 +43,12 @@ void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
                                    ? HxCNames::eDictBaseTypeName
                                    : HxCNames::eDictUserTypeName);
   }
+}
+
+void HX_NameSpaces::check(const std::string& name, HX_TokenEnd place) {
+  const HX_Change conflict{reservedAs(name.c_str())};
+  if (conflict.reason != HX_Change::eNone)
+    m_ReservedUses.push_back({name, place, conflict});
 }
 
 HX_Change HX_NameSpaces::define(const HX_WantedName& name, KyCXString& text,

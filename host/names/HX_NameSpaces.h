@@ -28,13 +28,22 @@
 class HX_NameSpaces {
  public:
   /// Reserves the words of the model and the names of \p types, constants in
-  /// the file scope only. The library reports a type, field or constant whose
-  /// name is a reserved word.
+  /// the file scope only.
   HX_NameSpaces(const HX_Model& model,
                 const std::vector<const HX_TypeItem*>& types);
   HX_NameSpaces(const HX_NameSpaces&) = delete;
   HX_NameSpaces& operator=(const HX_NameSpaces&) = delete;
   ~HX_NameSpaces();
+
+  /// The name of a type, field or constant that is a reserved word.
+  struct ReservedUse {
+    std::string name;
+    HX_TokenEnd place;
+    HX_Change conflict;
+  };
+  const std::vector<ReservedUse>& reservedUses() const {
+    return m_ReservedUses;
+  }
 
   /// Defines \p text for \p name in the scope of \p name. A taken text gets a
   /// suffix first if \p changeable; otherwise nothing is defined, and the
@@ -60,6 +69,7 @@ class HX_NameSpaces {
   };
 
   void reserve(const std::vector<const HX_TypeItem*>& types);
+  void check(const std::string& name, HX_TokenEnd place);
   HX_Change conflictOf(Space& space, const KyCXString& text);
   HX_Change::HxEReasonTag reservedAs(const KyCXString& text);
   void deriveFreeName(Space& space, KyCXString& text);
@@ -68,6 +78,7 @@ class HX_NameSpaces {
   HxCNameSpace m_File{&m_Ids};  // owns the file scope with all inner scopes
   std::map<const HX_ScopeItem*, Space> m_Spaces;
   std::deque<Symbol> m_Symbols;
+  std::vector<ReservedUse> m_ReservedUses;
   HxCNames m_Names;
 };
 

@@ -106,7 +106,10 @@ std::vector<const Item*> order(const std::vector<const Item*>& items,
 std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model) {
   std::vector<const HX_TypeItem*> types;
   types.reserve(model.types.size());
-  for (const HX_TypeItem& type : model.types) types.push_back(&type);
+  if (model.typeCircle.items.empty())
+    for (const HX_TypeItem& type : model.types) types.push_back(&type);
+  for (const std::size_t index : model.typeCircle.items)
+    types.push_back(&model.types[index]);
   return order<HxCSdtNode>(types, [](const HX_TypeItem& type) {
     std::vector<const HX_TypeItem*> before{type.of};
     for (const HX_TypeItem::Field& field : type.fields)
@@ -116,15 +119,22 @@ std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model) {
 }
 
 std::vector<const HX_FormedName*> HX_OrderVariables(
-    const std::deque<HX_FormedName>& names) {
+    const HX_Model& model, const std::deque<HX_FormedName>& names) {
   std::vector<const HX_FormedName*> variables;
   std::unordered_map<const HX_WantedName*, const HX_FormedName*> formedOf;
-  for (const HX_FormedName& name : names) {
-    if (name.wanted->kind != HX_NameKind::eVariable || !name.isDefined)
-      continue;
+  const auto add = [&](const HX_FormedName& name) {
+    if (name.wanted->kind != HX_NameKind::eVariable || !name.isDefined) return;
     variables.push_back(&name);
     formedOf.emplace(name.wanted, &name);
-  }
+  };
+  const std::vector<std::size_t>& circle = model.variableCircle.items;
+  const bool isWhole =
+      std::all_of(circle.begin(), circle.end(),
+                  [&](std::size_t index) { return names[index].isDefined; });
+  if (circle.empty() || !isWhole)
+    for (const HX_FormedName& name : names) add(name);
+  else
+    for (const std::size_t index : circle) add(names[index]);
   return order<HxCSsNode>(variables, [&](const HX_FormedName& name) {
     std::vector<const HX_FormedName*> before;
     for (const HX_WantedName* wanted : name.wanted->dependsOn) {

@@ -16,10 +16,11 @@
 /// without any dependency come last: the widest first, equal widths by name.
 /// The order of the document has no influence.
 ///
-/// The library reports a cycle (message 403); the result is then empty.
+/// The library reports a circle (message 403), with the items of the circle
+/// alone; the result is then empty.
 std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model);
 /// The defined variables among \p names.
 std::vector<const HX_FormedName*> HX_OrderVariables(
-    const std::deque<HX_FormedName>& names);
+    const HX_Model& model, const std::deque<HX_FormedName>& names);
 
 #endif  // HOST_NAMES_HX_ORDERING_H

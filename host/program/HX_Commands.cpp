@@ -1,8 +1,10 @@
 #include "host/program/HX_Commands.h"
 
 #include <iostream>
+#include <new>
 
 #include "host/base/HX_System.h"
+#include "host/base/HX_Text.h"
 #include "host/model/HX_Document.h"
 #include "host/model/HX_Synthesis.h"
 #include "host/program/HX_Generator.h"
@@ -24,6 +26,11 @@ HX_NameForming::Progress progressOf(const HX_Arguments& arguments) {
   };
 }
 
+// The library answers missing memory with results that are not whole.
+void requireMemory() {
+  if (HX_DidMemoryEnd()) throw std::bad_alloc();
+}
+
 void showNames(const HX_Arguments& arguments, HX_Generator& generator) {
   const HX_Profile::Phase phase(generator.profile, "Print");
   if (arguments.json)
@@ -40,9 +47,9 @@ void explainName(const HX_Arguments& arguments, HX_Generator& generator) {
       return HX_WriteExplanation(std::cout, *name,
                                  generator.forming->explain(*name->wanted));
   }
-  throw HX_DocumentError(arguments.model +
-                         ": /names: expected a name with the id \"" +
-                         arguments.name + "\"");
+  throw HX_InputError(HX_Visible(arguments.model) + ": /names: found no id " +
+                      HX_Quoted(arguments.name) +
+                      ", expected the id of a name");
 }
 
 void generateCode(const HX_Arguments& arguments, HX_Generator& generator) {
@@ -60,6 +67,7 @@ void generateCode(const HX_Arguments& arguments, HX_Generator& generator) {
   // If a report cannot be written, no file of the code changes.
   generator.profile.finish();
   HX_FlushOutput();
+  requireMemory();
   output.commit();
 }
 
@@ -91,6 +99,7 @@ HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command) {
   HX_Profile profile(arguments.profile);
   HX_Generator generator(profile, arguments.model, arguments.keywords);
   generator.run(progressOf(arguments));
+  requireMemory();
   command(arguments, generator);
   profile.finish();
   return generator.result.hasErrors() ? kHxErrorsFound : kHxDone;
@@ -115,7 +124,7 @@ HX_ExitCode HX_ReportNames(const HX_Arguments& arguments) {
 }
 
 HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments) {
-  std::cout << HX_Synthesize(arguments.blocks, arguments.seed);
+  HX_Synthesize(std::cout, arguments.blocks, arguments.seed);
   return kHxDone;
 }
 

@@ -2,26 +2,27 @@
 
 #include <algorithm>
 
+#include "host/base/HX_NameText.h"
 #include "host/base/HX_Text.h"
-#include "host/model/HX_Document.h"
 #include "host/names/HX_Ordering.h"
 #include "host/write/HX_CWriter.h"
 #include "host/write/HX_NameMap.h"
 
+namespace {
+
+HX_Document readDocument(HX_Profile& profile, const std::string& file) {
+  const HX_Profile::Phase phase(profile, "Read document");
+  return HX_Document(file, profile.start);
+}
+
+}  // namespace
+
 HX_Generator::HX_Generator(HX_Profile& timing, const std::string& file,
                            const std::string& keywordFolder)
-    : profile(timing) {
-  std::optional<HX_Document> document;
-  {
-    const HX_Profile::Phase phase(profile, "Read document");
-    document.emplace(file, profile.start);
-  }
-  {
-    const HX_Profile::Phase phase(profile, "Build model");
-    model.emplace(*document,
-                  (profile.start / keywordFolder).lexically_normal());
-  }
-  profile.setModel(HX_Utf8ToLatin1(model->name));
+    : profile(timing), document(readDocument(timing, file)) {
+  const HX_Profile::Phase phase(profile, "Build model");
+  model.emplace(document, (profile.start / keywordFolder).lexically_normal());
+  profile.setModel(HX_NameText(model->name).cstring());
 }
 
 void HX_Generator::run(const HX_NameForming::Progress& progress) {
@@ -29,16 +30,26 @@ void HX_Generator::run(const HX_NameForming::Progress& progress) {
     const HX_Profile::Phase phase(profile, "Order types");
     result.types = HX_OrderTypes(*model);
   }
-  if (result.hasErrors()) return;
-
+  if (!model->typeCircle.items.empty()) {
+    result.findings.back().source = model->typeCircle.place;
+    return;
+  }
   spaces.emplace(*model, result.types);
+  for (const HX_NameSpaces::ReservedUse& use : spaces->reservedUses())
+    document.faults.add(use.place, HX_Quoted(use.name),
+                        "a name that is no " + use.conflict.text());
+  document.throwIfFaulty();
+  document.text = {};
   {
     const HX_Profile::Phase phase(profile, "Form names");
     result.formed = forming.emplace(*spaces).formAll(model->names, progress);
   }
   for (const HX_FormedName& name : result.formed) result.names.push_back(&name);
   const HX_Profile::Phase phase(profile, "Order variables");
-  result.variables = HX_OrderVariables(result.formed);
+  const std::size_t before = result.findings.size();
+  result.variables = HX_OrderVariables(*model, result.formed);
+  if (result.findings.size() > before)
+    result.findings.back().source = model->variableCircle.place;
   profile.note(std::to_string(result.names.size()) + " names, " +
                std::to_string(result.variables.size()) + " variables, " +
                std::to_string(result.types.size()) + " types");

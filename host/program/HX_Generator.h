@@ -12,6 +12,7 @@
 #include <string>
 
 #include "host/base/HX_Output.h"
+#include "host/model/HX_Document.h"
 #include "host/model/HX_Model.h"
 #include "host/names/HX_FormedName.h"
 #include "host/names/HX_NameForming.h"
@@ -24,7 +25,7 @@ struct HX_Generator {
                const std::string& keywordFolder);
 
   /// Orders types, forms names, orders variables. A circle of types ends the
-  /// run without names.
+  /// run without names. Throws HX_DocumentError for reserved words among types.
   void run(const HX_NameForming::Progress& progress);
 
   /// Writes the C code, and the name map by id.
@@ -32,6 +33,7 @@ struct HX_Generator {
   std::size_t write(HX_Output& output);
 
   HX_Profile& profile;
+  HX_Document document;
   HX_RunResult result;
   const HX_MessageCollector collector{result.findings};
   std::optional<const HX_Model> model;

@@ -1,8 +1,13 @@
 // hx_codegen: from a model document to names and C code.
 #include <CLI/CLI.hpp>
+#include <charconv>
+#include <cstdint>
 #include <iostream>
+#include <new>
 
+#include "host/base/HX_Faults.h"
 #include "host/base/HX_System.h"
+#include "host/base/HX_Text.h"
 #include "host/program/HX_Commands.h"
 #include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_Version.h"
@@ -23,6 +28,17 @@ constexpr char kFooter[] =
     "  1  done, but a message was an error; no code is written\n"
     "  2  refused: the command line or the document is wrong, or something\n"
     "     cannot be read or written; the output folder is as it was";
+
+// The library of the command line takes negative numbers for unsigned ones.
+const CLI::Validator isSeed(
+    [](std::string& text) -> std::string {
+      std::uint64_t seed = 0;
+      const char* end = text.data() + text.size();
+      const auto read = std::from_chars(text.data(), end, seed);
+      if (read.ec == std::errc() && read.ptr == end) return {};
+      return "Value " + text + " not in range [0 - 18446744073709551615]";
+    },
+    "SEED");
 
 using Command = HX_ExitCode (*)(const HX_Arguments&);
 
@@ -108,7 +124,21 @@ CommandLine::CommandLine() {
           HX_SynthesizeDocument);
   synthesis->add_option("--blocks", arguments.blocks, "number of blocks")
       ->check(CLI::Range(0, 10'000'000));
-  synthesis->add_option("--seed", arguments.seed, "of the random numbers");
+  synthesis->add_option("--seed", arguments.seed, "of the random numbers")
+      ->check(isSeed);
+}
+
+// One line with the word that is wrong.
+HX_ExitCode refuse(CLI::App& app, const CLI::ParseError& error) {
+  std::string what = error.what();
+  const std::vector<std::string> unread = app.remaining(true);
+  if (app.get_subcommands().empty() && !unread.empty())
+    what = "no command " + HX_Quoted(unread.front());
+  constexpr std::size_t kMost = 300;
+  if (what.size() > kMost) what = what.substr(0, kMost) + "...";
+  std::cerr << "hx_codegen: " << HX_Visible(what)
+            << "; see hx_codegen --help\n";
+  return kHxRefused;
 }
 
 int run(int argc, char** argv) {
@@ -117,8 +147,10 @@ int run(int argc, char** argv) {
   try {
     line.app.parse(argc, argv);
     code = line.command(line.arguments);
+  } catch (const CLI::Success& help) {
+    line.app.exit(help);
   } catch (const CLI::ParseError& error) {
-    code = line.app.exit(error) == 0 ? kHxDone : kHxRefused;
+    return refuse(line.app, error);
   }
   HX_FlushOutput();
   return code;
@@ -129,11 +161,14 @@ int run(int argc, char** argv) {
 int main(int argc, char** argv) {
   try {
     HX_PrepareProcess();
+    HX_KeepMemoryBack();
     return run(argc, argv);
+  } catch (const std::bad_alloc&) {
+    HX_WriteError("hx_codegen: out of memory\n");
+  } catch (const HX_DocumentError& error) {
+    std::cerr << error.what() << '\n';
   } catch (const std::exception& error) {
     std::cerr << "hx_codegen: " << error.what() << '\n';
-  } catch (...) {
-    std::cerr << "hx_codegen: unknown failure\n";
   }
   return kHxRefused;
 }

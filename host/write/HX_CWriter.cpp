@@ -80,7 +80,7 @@ std::uint64_t bitsOf64(double value, bool isSigned) {
 
 std::string structBody(const HX_TypeItem& type) {
   std::string fields;
-  for (const auto& [name, field] : type.fields)
+  for (const auto& [name, field, place] : type.fields)
     fields += field->kind == HX_TypeKind::eBitField
                   ? "  unsigned int " + name + " : " +
                         std::to_string(field->bits) + ";\n"
@@ -90,7 +90,7 @@ std::string structBody(const HX_TypeItem& type) {
 
 std::string enumBody(const HX_TypeItem& type) {
   std::string values;
-  for (const auto& [name, value] : type.values)
+  for (const auto& [name, value, place] : type.values)
     values += (values.empty() ? "  " : ",\n  ") + name + " = " +
               std::to_string(value);
   return "enum {\n" + values + "\n}";
@@ -126,7 +126,10 @@ std::string fileName(const char* nameTemplate) {
   HxCCIdentifier id(nameTemplate);
   HxCNames().handleFileNameMacro(id, true);
   id.makeCIdentifier();
-  return HX_ToUtf8(id.getCookedName(HxCCIdentifier::eActualName));
+  // File systems take 255 bytes with the ending.
+  KyCXString name = id.getCookedName(HxCCIdentifier::eActualName);
+  name.shortenString(120, 2, '_', KyCXString::ePositionMiddle);
+  return name.cstring();
 }
 
 }  // namespace

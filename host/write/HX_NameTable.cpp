@@ -74,8 +74,8 @@ void HX_WriteTable(std::ostream& out, const HX_RunResult& result) {
       {"name", "source", "template", "formal", "actual", "complete"}};
   for (const HX_FormedName* name : result.names)
     rows.push_back({name->wanted->id, shortPath(name->sourcePath()),
-                    orDash(HX_ToUtf8(name->wanted->nameTemplate)),
-                    orDash(HX_ToUtf8(name->formal)),
+                    orDash(*name->wanted->nameTemplate->shown),
+                    orDash(HX_ToUtf8(name->formal())),
                     orDash(HX_ToUtf8(name->actual)),
                     name->isComplete ? "yes" : "no"});
   const std::vector<std::string> lines = aligned(rows);
@@ -99,13 +99,13 @@ void HX_WriteTable(std::ostream& out, const HX_RunResult& result) {
 void HX_WriteExplanation(std::ostream& out, const HX_FormedName& name,
                          const std::vector<HX_ExplainedMacro>& steps) {
   out << "name      " << name.wanted->id << "\ntemplate  "
-      << orDash(HX_ToUtf8(name.wanted->nameTemplate)) << "\nsource    "
+      << orDash(*name.wanted->nameTemplate->shown) << "\nsource    "
       << orDash(name.sourcePath()) << "\n\n";
   std::vector<Row> rows{{"macro", "gives", "which is"}};
   for (const HX_ExplainedMacro& step : steps)
     rows.push_back({step.macro, orDash(step.value), step.origin});
   for (const std::string& line : aligned(rows)) out << "  " << line << '\n';
-  out << "\nformal    " << orDash(HX_ToUtf8(name.formal)) << "\nactual    "
+  out << "\nformal    " << orDash(HX_ToUtf8(name.formal())) << "\nactual    "
       << orDash(HX_ToUtf8(name.actual)) << '\n';
   for (const HX_Change& change : name.changes)
     out << "changed   " << change.text() << '\n';

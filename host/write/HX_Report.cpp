@@ -225,7 +225,7 @@ class Report {
                    parent == placeOf.end() ? -1 : parent->second);
     }
     for (const SC_State& object : m_Input.model.chartObjects) {
-      const std::string path = HX_ToUtf8(object.getSFName());
+      const std::string path = HX_PathOf(object.getStateflowSrcRef());
       if (m_PlaceOfPath.count(path) != 0) continue;  // the chart itself
       const std::size_t slash = path.rfind('/');
       const auto parent = m_PlaceOfPath.find(path.substr(0, slash));
@@ -277,9 +277,9 @@ class Report {
           wanted.type != nullptr ? m_Texts.add(wanted.type->name) : -1,
           scope != m_NumberOfScope.end() ? scope->second : -1,
           placeOf(*name),
-          m_Texts.add(wanted.nameTemplate),
+          m_Texts.add(*wanted.nameTemplate->shown),
           m_Texts.add(expanded),
-          m_Texts.add(name->formal),
+          m_Texts.add(name->formal()),
           m_Texts.add(name->actual),
           stateOf(*name),
           -1,

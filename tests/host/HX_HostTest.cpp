@@ -5,6 +5,7 @@
 #include <cstdlib>
 #include <fstream>
 #include <iterator>
+#include <sstream>
 
 namespace fs = std::filesystem;
 
@@ -68,6 +69,13 @@ std::string HX_HostTest::read(const fs::path& path) {
   std::ifstream file(path, std::ios::binary);
   EXPECT_TRUE(file.is_open()) << path;
   return {std::istreambuf_iterator<char>(file), {}};
+}
+
+std::vector<std::string> HX_HostTest::linesOf(const std::string& text) {
+  std::vector<std::string> lines;
+  std::istringstream stream(text);
+  for (std::string line; std::getline(stream, line);) lines.push_back(line);
+  return lines;
 }
 
 HX_HostTest::Files HX_HostTest::filesIn(const fs::path& folder) {

@@ -14,6 +14,7 @@
 #include <map>
 #include <nlohmann/json.hpp>
 #include <string>
+#include <vector>
 
 /// Each test has a folder of its own, empty at the start.
 class HX_HostTest : public testing::Test {
@@ -41,6 +42,7 @@ class HX_HostTest : public testing::Test {
   std::string save(const Json& model) const;
   static void write(const std::filesystem::path& path, const std::string& text);
   static std::string read(const std::filesystem::path& path);
+  static std::vector<std::string> linesOf(const std::string& text);
   static Files filesIn(const std::filesystem::path& folder);
 
   /// A file by its path or its name in this folder.

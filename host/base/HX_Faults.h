@@ -1,0 +1,59 @@
+// The faults of a text file: one line for each fault, as compilers write them.
+//
+//   HX_Faults faults;
+//   faults.add(place, "7", "a text");
+//   if (faults.count() > 0) throw HX_DocumentError(...);
+
+#ifndef HOST_BASE_HX_FAULTS_H
+#define HOST_BASE_HX_FAULTS_H
+
+#include <cstddef>
+#include <cstdint>
+#include <map>
+#include <stdexcept>
+#include <string>
+#include <string_view>
+
+/// The place of a token of a document: its end, in bytes from the start.
+using HX_TokenEnd = std::uint32_t;
+
+/// A file that cannot be read, or an argument without an item: one line.
+class HX_InputError : public std::runtime_error {
+ public:
+  using std::runtime_error::runtime_error;
+};
+
+/// The faults of a document: each on a line of its own that begins with the
+/// file.
+class HX_DocumentError : public std::runtime_error {
+ public:
+  using std::runtime_error::runtime_error;
+};
+
+/// RETURNS: "line:column" of \p place in \p text. Both count from 1, columns in
+/// characters.
+std::string HX_LineAndColumn(std::string_view text, std::size_t place);
+
+/// Keeps the first 20 faults by place and counts all faults.
+class HX_Faults {
+ public:
+  /// \param place  in bytes from the start; behind the token for documents
+  void add(std::size_t place, const std::string& found,
+           const std::string& expected);
+  std::size_t count() const { return m_Count; }
+
+  struct Fault {
+    std::string found;
+    std::string expected;
+  };
+  /// The kept faults by place; at one place in the order of add().
+  const std::multimap<std::size_t, Fault>& kept() const { return m_Kept; }
+  /// The line behind the kept faults: "... and 3 more"; empty if all are kept.
+  std::string rest() const;
+
+ private:
+  std::multimap<std::size_t, Fault> m_Kept;
+  std::size_t m_Count = 0;
+};
+
+#endif  // HOST_BASE_HX_FAULTS_H
