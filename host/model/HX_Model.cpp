@@ -1,5 +1,8 @@
 #include "host/model/HX_Model.h"
 
+#include <filesystem>
+
+#include "SafeNames/HX_ReservedNames.h"
 #include "host/model/HX_Document.h"
 #include "host/model/HX_ModelReading.h"
 #include "host/model/HX_WordList.h"
@@ -11,12 +14,20 @@ namespace {
 using Reading = HX_ModelReading;
 using Value = HX_BoundValue;
 
+// A list of the user adds to the installed list of the same name.
 void readWordList(Reading& r, const Value& value) {
-  const std::string file =
-      r.keywordFolder + "/" + std::string(value.text) + ".txt";
-  if (!HX_ReadWordList(file, r.model.words))
-    r.faults.add(value.place, HX_Quoted(value.text),
-                 "the name of a word list in " + HX_Visible(r.keywordFolder));
+  bool isFound = false;
+  for (const std::string& folder : r.keywordFolders) {
+    const std::string file = folder + "/" + std::string(value.text) + ".txt";
+    std::error_code error;
+    if (!std::filesystem::exists(file, error)) continue;
+    isFound = HX_ReadWordList(file, r.model.words);
+    if (!isFound) break;
+  }
+  if (!isFound)
+    r.faults.add(
+        value.place, HX_Quoted(value.text),
+        "the name of a word list in " + HX_Visible(r.keywordFolders.back()));
 }
 
 constexpr HX_FieldBinding kBindings[] = {
@@ -37,6 +48,23 @@ constexpr HX_FieldBinding kBindings[] = {
        r.model.options.setLimitVariableNameLength(v.boolean);
      }},
     {"options.keywords", readWordList},
+    {"options.patterns",
+     [](Reading& r, const Value& v) {
+       r.model.patterns |=
+           HX_ReservedNames::patternOf(std::string(v.text).c_str());
+     }},
+    {"options.significant.internal",
+     [](Reading& r, const Value& v) {
+       r.model.significance.internal = v.integer();
+     }},
+    {"options.significant.external",
+     [](Reading& r, const Value& v) {
+       r.model.significance.external = v.integer();
+     }},
+    {"options.significant.ignoreCase",
+     [](Reading& r, const Value& v) {
+       r.model.significance.ignoresCase = v.boolean;
+     }},
 };
 
 }  // namespace
@@ -68,13 +96,14 @@ void HX_ModelReading::define(HX_Ids& ids, const HX_Use& id, std::size_t item) {
 
 HX_Bindings HX_OptionBindings() { return {kBindings, std::size(kBindings)}; }
 
-HX_Model::HX_Model(HX_Document& document, const std::string& keywordFolder) {
+HX_Model::HX_Model(HX_Document& document,
+                   const std::vector<std::string>& keywordFolders) {
   HxCGlobal::setOptions(&options);
   HxCGlobal::setDataTypeServer(&typeServer);
   HX_DdTree::instance().clear();
   GLB_SetModelName("");
   GLB_SetSubsystemName("");
-  HX_ModelReading reading(*this, document.faults, keywordFolder);
+  HX_ModelReading reading(*this, document.faults, keywordFolders);
   if (HX_ReadDocument(document, reading)) {
     if (names.empty() && document.faults.count() > 0)
       reading.nameIds.isWhole = false;

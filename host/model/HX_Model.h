@@ -1,7 +1,7 @@
 // The model of a document, built from the platform's stand-ins.
 //
 //   HX_Document document("cruise_control.json", folder);
-//   const HX_Model model(document, "data/keywords");
+//   const HX_Model model(document, {"data/keywords"});
 //   for (const HX_WantedName& name : model.names) form(name);
 //
 // The library sees the model that lives: options, model names, data type server
@@ -44,17 +44,28 @@ struct HX_Circle {
   }
 };
 
+/// Characters that count; see HX_SafeNames::setSignificance().
+struct HX_Significance {
+  int internal = 0;
+  int external = 0;
+  bool ignoresCase = false;
+};
+
 /// Owns all items of the document, in document order.
 struct HX_Model {
   /// Throws HX_DocumentError with the faults of the document, of a word list,
-  /// or of a word list that \p keywordFolder does not have.
-  HX_Model(HX_Document& document, const std::string& keywordFolder);
+  /// or of a word list that no folder of \p keywordFolders has. The words of
+  /// lists of the same name in several folders count together.
+  HX_Model(HX_Document& document,
+           const std::vector<std::string>& keywordFolders);
   HX_Model(const HX_Model&) = delete;
   HX_Model& operator=(const HX_Model&) = delete;
   ~HX_Model();
 
   std::string name;
   std::set<std::string> words;  // of the word lists
+  unsigned int patterns = 0;    // HX_ReservedNames::HxEPatternTag
+  HX_Significance significance;
   std::deque<HX_TypeItem> types;
   std::deque<HX_ScopeItem> scopes;  // parents first
   HX_ScopeItem* fileScope = nullptr;

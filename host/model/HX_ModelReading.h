@@ -192,12 +192,12 @@ struct HX_RareUses {
 /// Everything that the two steps share.
 struct HX_ModelReading {
   HX_ModelReading(HX_Model& wanted, HX_Faults& list,
-                  const std::string& folderOfWords)
-      : model(wanted), faults(list), keywordFolder(folderOfWords) {}
+                  const std::vector<std::string>& foldersOfWords)
+      : model(wanted), faults(list), keywordFolders(foldersOfWords) {}
 
   HX_Model& model;
   HX_Faults& faults;
-  const std::string keywordFolder;
+  const std::vector<std::string> keywordFolders;
 
   HX_SourceRecords sources;
   HX_Ids typeIds{"a type"};

@@ -7,9 +7,21 @@
 namespace {
 
 // In the order of HX_Change::HxEReasonTag.
-constexpr const char* kReasons[] = {
-    "",          "made an identifier", "shortened", "keyword", "base type name",
-    "type name", "taken by a constant"};
+constexpr const char* kReasons[] = {"",
+                                    "made an identifier",
+                                    "shortened",
+                                    "keyword",
+                                    "base type name",
+                                    "type name",
+                                    "taken by a constant",
+                                    "taken by",
+                                    "reserved by the pattern",
+                                    "rewritten",
+                                    "not distinct from",
+                                    "held by the lock for",
+                                    "retired by the lock with",
+                                    "name of the lock",
+                                    "without a free variant"};
 
 bool hasError(const std::vector<HX_Finding>& findings) {
   return std::any_of(findings.begin(), findings.end(),
@@ -19,7 +31,8 @@ bool hasError(const std::vector<HX_Finding>& findings) {
 }  // namespace
 
 std::string HX_Change::text() const {
-  if (reason != eTakenByName) return kReasons[reason];
+  if (reason != eTakenByName)
+    return kReasons[reason] + (detail.empty() ? "" : " '" + detail + "'");
   const std::string path = HX_PathOf(HX_BestSource(*owner));
   const std::string id = "'" + owner->id + "'";
   return "taken by " + (path.empty() ? id : path + " (" + id + ")");

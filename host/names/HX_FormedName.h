@@ -22,11 +22,19 @@ struct HX_Change {
     eBaseType,  ///< the name of a base type
     eType,      ///< the name of any other type
     eTakenByConstant,
-    eTakenByName
+    eTakenByName,
+    ePattern,     ///< matches a chosen pattern; detail is the pattern
+    eRewritten,   ///< changed so that no chosen pattern matches
+    eIndistinct,  ///< agrees with another name early; detail is the name
+    eHeld,        ///< the lock holds the name for the item in detail
+    eRetired,     ///< the lock keeps the name of the item in detail
+    eLocked,      ///< name of the lock
+    eNoVariant    ///< every variant is taken
   };
 
   HxEReasonTag reason = eNone;
   const HX_WantedName* owner = nullptr;  // for eTakenByName
+  std::string detail = {};
 
   /// Empty for eNone. \return for example "shortened", "taken by m/Pedal/Gain
   /// ('gain')"

@@ -74,10 +74,7 @@ void HX_NameForming::form(HX_FormedName& name) {
   name.isComplete = *isComplete;
 
   // A name that still holds macros is no C name yet.
-  if (name.isComplete || wanted.rare().retained == 0) {
-    makeCName(id, name);
-    define(id, name);
-  }
+  if (name.isComplete || wanted.rare().retained == 0) define(id, name);
   name.actual = id.getCookedName(HxCCIdentifier::eActualName);
   name.setFormal(id.getCookedName(HxCCIdentifier::eFormalName));
   if (wanted.isTask()) m_TaskNames[&wanted] = id;
@@ -140,46 +137,40 @@ void HX_NameForming::replaceMultirate(const HX_WantedName& name,
     m_Names.replaceMultirateMsgVarName(id, *text);
 }
 
-void HX_NameForming::makeCName(HxCCIdentifier& id, HX_FormedName& name) {
-  id.activateActualName();
-  const KyCXString expanded = id.getCookedName(HxCCIdentifier::eActualName);
-  id.makeCIdentifier();
-  const KyCXString whole = id.getCookedName(HxCCIdentifier::eActualName);
-  if (!(whole == expanded))
-    name.changes.push_back({HX_Change::eMadeIdentifier});
-  id.adaptSize();
-  const KyCXString& fitted = id.getCookedName(HxCCIdentifier::eActualName);
-  if (!(fitted == whole)) name.changes.push_back({HX_Change::eShortened});
-  if (HxCGlobal::getOptions()->getLimitVariableNameLength() &&
-      fitted.length() > HxCSymbol::sm_MaxNameLength)
-    remark(name, HX_Finding::eWarning,
-           "The name is longer than " +
-               std::to_string(HxCSymbol::sm_MaxNameLength) +
-               " characters, and its template does not let it change ($R).");
+void HX_NameForming::define(HxCCIdentifier& id, HX_FormedName& name) {
+  name.isDefined = m_Spaces.define(*name.wanted, id, m_Safe);
+  for (int i = 0; i < m_Safe.stepCount(); ++i) note(m_Safe.step(i), name);
+  if (!name.isDefined || m_Safe.text() == m_Safe.wanted()) return;
+  HxCTransformationTracer::logTransformation(
+      (name.wanted->id + ": " + m_Safe.wanted().cstring() + " -> " +
+       m_Safe.text().cstring() + " (" + name.changes.back().text() + ")")
+          .c_str());
 }
 
-void HX_NameForming::define(HxCCIdentifier& id, HX_FormedName& name) {
-  const KyCXString wanted = id.getCookedName(HxCCIdentifier::eActualName);
-  if (wanted.isEmpty())
-    return remark(name, HX_Finding::eError,
-                  "The name is empty: nothing is defined.");
-
-  KyCXString text = wanted;
-  const bool isChangeable =
-      id.getIdentifierChangeable(HxCCIdentifier::eActualName);
-  const HX_Change conflict = m_Spaces.define(*name.wanted, text, isChangeable);
-  name.isDefined = conflict.reason == HX_Change::eNone || isChangeable;
-  if (conflict.reason == HX_Change::eNone) return;
-  if (name.isDefined) {
-    name.changes.push_back(conflict);
-    id.setCookedName(text, HxCCIdentifier::eActualName);
-    HxCTransformationTracer::logTransformation(
-        (name.wanted->id + ": " + wanted.cstring() + " -> " + text.cstring() +
-         " (" + conflict.text() + ")")
-            .c_str());
-  } else if (!HX_NameSpaces::isReported(conflict)) {
-    remark(name, HX_Finding::eError,
-           "The name '" + HX_ToUtf8(wanted) + "' is " + conflict.text() +
-               ", and its template does not let it change ($R).");
+void HX_NameForming::note(const HX_SafeName::Step& step, HX_FormedName& name) {
+  switch (step.kind) {
+    case HX_SafeName::eEmpty:
+      return remark(name, HX_Finding::eError,
+                    "The name is empty: nothing is defined.");
+    case HX_SafeName::eTooLong:
+      return remark(
+          name, HX_Finding::eWarning,
+          "The name is longer than " +
+              std::to_string(HxCSymbol::sm_MaxNameLength) +
+              " characters, and its template does not let it change ($R).");
+    case HX_SafeName::eDerived:
+      return;  // the conflict before it is the reason
+    default:
+      break;
   }
+  const HX_Change change = HX_NameSpaces::changeOf(step);
+  if (name.isDefined || !HX_NameSpaces::isConflict(change))
+    return name.changes.push_back(change);
+  if (HX_NameSpaces::isReported(change)) {
+    m_Names.isStringValidCVariableName(step.text);
+    return;
+  }
+  remark(name, HX_Finding::eError,
+         "The name '" + HX_ToUtf8(step.text) + "' is " + change.text() +
+             ", and its template does not let it change ($R).");
 }

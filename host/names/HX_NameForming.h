@@ -46,11 +46,12 @@ class HX_NameForming {
                              bool suppressMessages);
   bool substitute(const HX_WantedName& name, HxCCIdentifier& id);
   void replaceMultirate(const HX_WantedName& name, HxCCIdentifier& id);
-  void makeCName(HxCCIdentifier& id, HX_FormedName& name);
   void define(HxCCIdentifier& id, HX_FormedName& name);
+  void note(const HX_SafeName::Step& step, HX_FormedName& name);
 
   HX_NameSpaces& m_Spaces;
   HxCNames m_Names;
+  HX_SafeName m_Safe;  // of the name being formed
   std::map<const HX_WantedName*, HxCCIdentifier> m_TaskNames;  // null: empty
 };
 

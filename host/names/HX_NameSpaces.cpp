@@ -1,38 +1,65 @@
 #include "host/names/HX_NameSpaces.h"
 
+#include <new>
+
 #include "host/base/HX_Text.h"
 
+namespace {
+
+// Inner scopes of different functions may have the same id.
+std::string pathOf(const HX_ScopeItem& scope) {
+  return scope.parent == nullptr ? scope.id
+                                 : pathOf(*scope.parent) + "/" + scope.id;
+}
+
+HX_Change::HxEReasonTag wordReason(HxCNames::tagHxEDictEntryType kind) {
+  switch (kind) {
+    case HxCNames::eDictBaseTypeName:
+      return HX_Change::eBaseType;
+    case HxCNames::eDictUserTypeName:
+      return HX_Change::eType;
+    case HxCNames::eDictCKeyword:
+      break;
+  }
+  return HX_Change::eKeyword;
+}
+
+}  // namespace
+
 HX_NameSpaces::HX_NameSpaces(const HX_Model& model,
-                             const std::vector<const HX_TypeItem*>& types) {
-  m_Ids.boot();
+                             const std::vector<const HX_TypeItem*>& types,
+                             HX_NameLock* lock) {
+  m_Patterns.setPatterns(model.patterns);
+  m_Safe.setReserved(&m_Patterns);
+  m_Safe.setSignificance(model.significance.internal,
+                         model.significance.external,
+                         model.significance.ignoresCase);
   for (const HX_ScopeItem& item : model.scopes) {
-    Space& space = m_Spaces.try_emplace(&item, &m_Ids).first->second;
-    if (item.kind == HX_ScopeKind::eFile)
-      space.scoped.setScope(m_File.newEnv());
-    if (item.parent != nullptr)
-      space.scoped.newScope(m_Spaces.at(item.parent).scoped.getScope());
+    HX_SafeNames::Scope* const parent =
+        item.parent == nullptr ? nullptr : m_Scopes.at(item.parent);
+    HX_SafeNames::Scope* const scope = m_Safe.addScope(pathOf(item), parent);
+    if (scope == nullptr) throw std::bad_alloc();
+    m_Scopes[&item] = scope;
   }
   HxCNames::boot();
   for (const std::string& word : model.words)
     m_Names.addToKeywordDict(word.c_str(), HxCNames::eDictCKeyword);
-  reserve(types);
+  reserve(types, m_Scopes.at(model.fileScope));
+  if (lock != nullptr && !m_Safe.useLock(lock)) throw std::bad_alloc();
 }
 
-HX_NameSpaces::~HX_NameSpaces() {
-  delete m_File.getScope();
-  HxCNames::shutdown();
-  m_Ids.shutdown();
-}
+HX_NameSpaces::~HX_NameSpaces() { HxCNames::shutdown(); }
 
 // Names of types are given, not formed. Each name is checked before the name
 // becomes a reserved word.
-void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
+void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types,
+                            HX_SafeNames::Scope* file) {
   for (const HX_TypeItem* type : types) {
     for (const HX_TypeItem::Field& field : type->fields)
       check(field.name, field.place);
     for (const HX_TypeItem::Constant& constant : type->values) {
       check(constant.name, constant.place);
-      m_File.defineString(constant.name.c_str());
+      m_Safe.reserveName(constant.name.c_str(), file, nullptr);
     }
     if (!type->isNameless) check(type->name, type->place);
   }
@@ -46,80 +73,91 @@ void HX_NameSpaces::reserve(const std::vector<const HX_TypeItem*>& types) {
 }
 
 void HX_NameSpaces::check(const std::string& name, HX_TokenEnd place) {
-  const HX_Change conflict{reservedAs(name.c_str())};
-  if (conflict.reason != HX_Change::eNone)
-    m_ReservedUses.push_back({name, place, conflict});
+  HX_Change conflict;
+  switch (HxCNames::checkCVariableName(name.c_str())) {
+    case HxCNames::eVariableNameCKeyword:
+      conflict.reason = HX_Change::eKeyword;
+      break;
+    case HxCNames::eVariableNameBaseType:
+      conflict.reason = HX_Change::eBaseType;
+      break;
+    case HxCNames::eVariableNameUserType:
+      conflict.reason = HX_Change::eType;
+      break;
+    default:
+      return;
+  }
+  m_ReservedUses.push_back({name, place, conflict});
 }
 
-HX_Change HX_NameSpaces::define(const HX_WantedName& name, KyCXString& text,
-                                bool changeable) {
-  Space& space = m_Spaces.at(name.scope);
-  const HX_Change conflict = conflictOf(space, text);
-  const bool isFree = conflict.reason == HX_Change::eNone;
-  if (!isFree && !changeable) {
-    if (isReported(conflict)) m_Names.isStringValidCVariableName(text);
-    return conflict;
-  }
-  if (!isFree) deriveFreeName(space, text);
-  if (space.scoped.getScope() == nullptr) {
-    space.flat.add(text);
-    space.owners.emplace(text.cstring(), &name);
-    return conflict;
-  }
+bool HX_NameSpaces::define(const HX_WantedName& name, HxCCIdentifier& id,
+                           HX_SafeName& safe) {
   Symbol& symbol =
-      m_Symbols.emplace_back(text, HxCSymbol::eVariable,
+      m_Symbols.emplace_back(KyCXString(), HxCSymbol::eVariable,
                              name.type != nullptr ? &name.type->type : nullptr);
   symbol.owner = &name;
-  space.scoped.defineString(text, &symbol);
-  return conflict;
+  HX_SafeNames::Request request;
+  request.scope = m_Scopes.at(name.scope);
+  request.isExternal = name.scope->kind == HX_ScopeKind::eFile;
+  request.symbol = &symbol;
+  request.item = name.id;
+  const bool isDefined = m_Safe.define(id, request, safe);
+  if (!isDefined) m_Symbols.pop_back();
+  if (safe.stepCount() > 0 &&
+      safe.step(safe.stepCount() - 1).kind == HX_SafeName::eNoMemory)
+    throw std::bad_alloc();
+  return isDefined;
+}
+
+HX_Change HX_NameSpaces::changeOf(const HX_SafeName::Step& step) {
+  const auto other = [&] { return std::string(step.other); };
+  switch (step.kind) {
+    case HX_SafeName::eIdentifier:
+      return {HX_Change::eMadeIdentifier};
+    case HX_SafeName::eShortened:
+      return {HX_Change::eShortened};
+    case HX_SafeName::eLocked:
+      return {HX_Change::eLocked};
+    case HX_SafeName::eRewritten:
+      return {HX_Change::eRewritten};
+    case HX_SafeName::eKeyword:
+      return {wordReason(step.wordKind)};
+    case HX_SafeName::eReserved:
+      return {HX_Change::eKeyword};
+    case HX_SafeName::ePattern:
+      return {HX_Change::ePattern, nullptr, step.reason};
+    case HX_SafeName::eTaken:
+      if (step.symbol == nullptr) return {HX_Change::eTakenByConstant};
+      return {HX_Change::eTakenByName,
+              static_cast<const Symbol*>(step.symbol)->owner};
+    case HX_SafeName::eIndistinct:
+      return {HX_Change::eIndistinct, nullptr, other()};
+    case HX_SafeName::eHeld:
+      return {HX_Change::eHeld, nullptr, other()};
+    case HX_SafeName::eRetired:
+      return {HX_Change::eRetired, nullptr, other()};
+    case HX_SafeName::eNoVariant:
+      return {HX_Change::eNoVariant};
+    default:
+      return {};
+  }
+}
+
+bool HX_NameSpaces::isConflict(const HX_Change& change) {
+  switch (change.reason) {
+    case HX_Change::eNone:
+    case HX_Change::eMadeIdentifier:
+    case HX_Change::eShortened:
+    case HX_Change::eRewritten:
+    case HX_Change::eLocked:
+      return false;
+    default:
+      return true;
+  }
 }
 
 bool HX_NameSpaces::isReported(const HX_Change& conflict) {
   return conflict.reason == HX_Change::eKeyword ||
          conflict.reason == HX_Change::eBaseType ||
          conflict.reason == HX_Change::eType;
-}
-
-HX_Change HX_NameSpaces::conflictOf(Space& space, const KyCXString& text) {
-  const HX_Change::HxEReasonTag reserved = reservedAs(text);
-  if (reserved != HX_Change::eNone) return {reserved};
-  if (space.scoped.getScope() == nullptr) {
-    const auto found = space.owners.find(text.cstring());
-    if (found == space.owners.end()) return {};
-    return {HX_Change::eTakenByName, found->second};
-  }
-  if (!space.scoped.stringInEnv(text)) return {};
-  HxCSymbol* symbol = nullptr;
-  if (!space.scoped.stringInEnv(text, symbol))
-    return {HX_Change::eTakenByConstant};
-  return {HX_Change::eTakenByName, static_cast<Symbol*>(symbol)->owner};
-}
-
-HX_Change::HxEReasonTag HX_NameSpaces::reservedAs(const KyCXString& text) {
-  constexpr int kFirstMessage = 17056;  // the next two have the next numbers
-  constexpr HX_Change::HxEReasonTag kReasons[] = {
-      HX_Change::eKeyword, HX_Change::eBaseType, HX_Change::eType};
-  std::vector<HX_Finding> reported;
-  {
-    const HX_MessageCollector collector(reported);
-    m_Names.isStringValidCVariableName(text);
-  }
-  if (reported.empty()) return HX_Change::eNone;
-  return kReasons[reported[0].id - kFirstMessage];
-}
-
-// A flat set derives variants on its own. Scopes only tell whether a variant is
-// free.
-void HX_NameSpaces::deriveFreeName(Space& space, KyCXString& text) {
-  KyCXString base = text;
-  int& suffix = space.nextSuffix[base.cstring()];
-  do {
-    text = base;
-    if (space.scoped.getScope() == nullptr) {
-      space.flat.add(base);  // absent so far if the text is a reserved word
-      space.flat.addUnique(text);
-    } else {
-      m_Names.appendSuffix(text, suffix++);
-    }
-  } while (conflictOf(space, text).reason != HX_Change::eNone);
 }

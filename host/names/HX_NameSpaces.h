@@ -1,10 +1,9 @@
-// The scopes that names are defined in, reserved words, and free variants of
-// taken names.
+// The scopes of a model, reserved words, and the names defined so far.
 //
-//   HX_NameSpaces spaces(model, types);
-//   KyCXString text("speed");
-//   spaces.define(name, text, true).text();   // "taken by m/In ('speed_in')"
-//   // text == "speed_a"
+//   HX_NameSpaces spaces(model, types, nullptr);
+//   HX_SafeName safe;
+//   spaces.define(name, id, safe);
+//   HX_NameSpaces::changeOf(safe.step(0)).text();   // "taken by m/In ('in')"
 
 #ifndef HOST_NAMES_HX_NAMESPACES_H
 #define HOST_NAMES_HX_NAMESPACES_H
@@ -14,9 +13,9 @@
 #include <string>
 #include <vector>
 
-#include "NameSpace/HX_LimitedNameSpace.h"
-#include "NameSpace/HxCNameSpace.h"
-#include "NameSpace/HxCXStringIdServer.h"
+#include "SafeNames/HX_NameLock.h"
+#include "SafeNames/HX_ReservedNames.h"
+#include "SafeNames/HX_SafeNames.h"
 #include "host/model/HX_Model.h"
 #include "host/names/HX_FormedName.h"
 
@@ -29,8 +28,10 @@ class HX_NameSpaces {
  public:
   /// Reserves the words of the model and the names of \p types, constants in
   /// the file scope only.
+  /// \param lock  names to keep; null for none
   HX_NameSpaces(const HX_Model& model,
-                const std::vector<const HX_TypeItem*>& types);
+                const std::vector<const HX_TypeItem*>& types,
+                HX_NameLock* lock);
   HX_NameSpaces(const HX_NameSpaces&) = delete;
   HX_NameSpaces& operator=(const HX_NameSpaces&) = delete;
   ~HX_NameSpaces();
@@ -45,38 +46,30 @@ class HX_NameSpaces {
     return m_ReservedUses;
   }
 
-  /// Defines \p text for \p name in the scope of \p name. A taken text gets a
-  /// suffix first if \p changeable; otherwise nothing is defined, and the
-  /// library reports a reserved word.
-  /// RETURNS: the conflict of the given text; eNone for a free text.
-  HX_Change define(const HX_WantedName& name, KyCXString& text,
-                   bool changeable);
+  /// Defines the expanded \p id for \p name in the scope of \p name.
+  /// RETURNS: whether the name was defined; \p safe has the steps.
+  bool define(const HX_WantedName& name, HxCCIdentifier& id, HX_SafeName& safe);
 
+  /// A step as a change; REQUIRES: the step is a change or a conflict.
+  static HX_Change changeOf(const HX_SafeName::Step& step);
+  /// Whether \p change is a conflict with a word or another name.
+  static bool isConflict(const HX_Change& change);
   /// Whether the library itself reports \p conflict for a fixed name.
   static bool isReported(const HX_Change& conflict);
 
  private:
-  struct Space {
-    explicit Space(HxCXStringIdServer* ids) : scoped(ids) {}
-    HxCNameSpace scoped;  // without a scope in a flat space
-    HX_LimitedNameSpace flat;
-    std::map<std::string, const HX_WantedName*> owners;  // flat space, by text
-    std::map<std::string, int> nextSuffix;  // by text without suffix
-  };
   struct Symbol : HxCSymbol {
     using HxCSymbol::HxCSymbol;
     const HX_WantedName* owner = nullptr;
   };
 
-  void reserve(const std::vector<const HX_TypeItem*>& types);
+  void reserve(const std::vector<const HX_TypeItem*>& types,
+               HX_SafeNames::Scope* file);
   void check(const std::string& name, HX_TokenEnd place);
-  HX_Change conflictOf(Space& space, const KyCXString& text);
-  HX_Change::HxEReasonTag reservedAs(const KyCXString& text);
-  void deriveFreeName(Space& space, KyCXString& text);
 
-  HxCXStringIdServer m_Ids;
-  HxCNameSpace m_File{&m_Ids};  // owns the file scope with all inner scopes
-  std::map<const HX_ScopeItem*, Space> m_Spaces;
+  HX_ReservedNames m_Patterns;
+  HX_SafeNames m_Safe;
+  std::map<const HX_ScopeItem*, HX_SafeNames::Scope*> m_Scopes;
   std::deque<Symbol> m_Symbols;
   std::vector<ReservedUse> m_ReservedUses;
   HxCNames m_Names;

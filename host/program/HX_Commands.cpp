@@ -1,13 +1,16 @@
 #include "host/program/HX_Commands.h"
 
+#include <filesystem>
 #include <iostream>
 #include <new>
+#include <optional>
 
 #include "host/base/HX_System.h"
 #include "host/base/HX_Text.h"
 #include "host/model/HX_Document.h"
 #include "host/model/HX_Synthesis.h"
 #include "host/program/HX_Generator.h"
+#include "host/program/HX_LockFile.h"
 #include "host/program/HX_Version.h"
 #include "host/write/HX_NameMap.h"
 #include "host/write/HX_NameTable.h"
@@ -52,9 +55,15 @@ void explainName(const HX_Arguments& arguments, HX_Generator& generator) {
                       ", expected the id of a name");
 }
 
-void generateCode(const HX_Arguments& arguments, HX_Generator& generator) {
+void generateCode(const HX_Arguments& arguments, HX_Generator& generator,
+                  const HX_LockFile* lock) {
   const HX_RunResult& result = generator.result;
   if (result.hasErrors()) return HX_WriteFindings(std::cerr, result);
+  std::optional<HX_Output> lockOutput;
+  if (lock != nullptr) {
+    lock->write(lockOutput.emplace(lock->folder()));
+    lockOutput->finish();
+  }
   HX_Output output(generator.profile.start / arguments.out);
   const std::size_t changed = generator.write(output);
   HX_WriteFindings(std::cerr, result);
@@ -69,6 +78,8 @@ void generateCode(const HX_Arguments& arguments, HX_Generator& generator) {
   HX_FlushOutput();
   requireMemory();
   output.commit();
+  // Last: a lock that was not replaced gives the same names again.
+  if (lockOutput) lockOutput->commit();
 }
 
 std::string firstLine(const std::string& text) {
@@ -95,10 +106,23 @@ void writeReport(const HX_Arguments& arguments, HX_Generator& generator) {
 
 using Command = void (*)(const HX_Arguments&, HX_Generator&);
 
+std::vector<std::string> keywordFolders(const HX_Arguments& arguments) {
+  std::vector<std::string> folders{arguments.keywords};
+  folders.insert(folders.end(), arguments.ownKeywords.begin(),
+                 arguments.ownKeywords.end());
+  return folders;
+}
+
+HX_LockFile lockFileOf(const HX_Arguments& arguments,
+                       const std::filesystem::path& start) {
+  return {arguments.lock, start / arguments.lock, arguments.locked};
+}
+
 HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command) {
   HX_Profile profile(arguments.profile);
-  HX_Generator generator(profile, arguments.model, arguments.keywords);
-  generator.run(progressOf(arguments));
+  HX_LockFile lock = lockFileOf(arguments, profile.start);
+  HX_Generator generator(profile, arguments.model, keywordFolders(arguments));
+  generator.run(progressOf(arguments), lock.lock());
   requireMemory();
   command(arguments, generator);
   profile.finish();
@@ -116,11 +140,36 @@ HX_ExitCode HX_ExplainName(const HX_Arguments& arguments) {
 }
 
 HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments) {
-  return runOverModel(arguments, generateCode);
+  HX_Profile profile(arguments.profile);
+  HX_LockFile lock = lockFileOf(arguments, profile.start);
+  HX_Generator generator(profile, arguments.model, keywordFolders(arguments));
+  generator.run(progressOf(arguments), lock.lock());
+  requireMemory();
+  const bool writesLock = lock.lock() != nullptr && !arguments.locked &&
+                          !generator.result.hasErrors() &&
+                          generator.forming.has_value();
+  if (arguments.locked && !generator.result.hasErrors() &&
+      lock.writeChanges(std::cerr) > 0)
+    return kHxErrorsFound;
+  if (writesLock) lock.lock()->endRun(arguments.retireRuns);
+  generateCode(arguments, generator, writesLock ? &lock : nullptr);
+  profile.finish();
+  return generator.result.hasErrors() ? kHxErrorsFound : kHxDone;
 }
 
 HX_ExitCode HX_ReportNames(const HX_Arguments& arguments) {
   return runOverModel(arguments, writeReport);
+}
+
+HX_ExitCode HX_PruneLock(const HX_Arguments& arguments) {
+  HX_LockFile lock(arguments.lock,
+                   std::filesystem::current_path() / arguments.lock, true);
+  lock.lock()->prune();
+  HX_Output output(lock.folder());
+  lock.write(output);
+  output.finish();
+  output.commit();
+  return kHxDone;
 }
 
 HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments) {

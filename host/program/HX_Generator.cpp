@@ -18,14 +18,18 @@ HX_Document readDocument(HX_Profile& profile, const std::string& file) {
 }  // namespace
 
 HX_Generator::HX_Generator(HX_Profile& timing, const std::string& file,
-                           const std::string& keywordFolder)
+                           const std::vector<std::string>& keywordFolders)
     : profile(timing), document(readDocument(timing, file)) {
   const HX_Profile::Phase phase(profile, "Build model");
-  model.emplace(document, (profile.start / keywordFolder).lexically_normal());
+  std::vector<std::string> folders;
+  for (const std::string& folder : keywordFolders)
+    folders.push_back((profile.start / folder).lexically_normal().string());
+  model.emplace(document, folders);
   profile.setModel(HX_NameText(model->name).cstring());
 }
 
-void HX_Generator::run(const HX_NameForming::Progress& progress) {
+void HX_Generator::run(const HX_NameForming::Progress& progress,
+                       HX_NameLock* lock) {
   {
     const HX_Profile::Phase phase(profile, "Order types");
     result.types = HX_OrderTypes(*model);
@@ -34,7 +38,7 @@ void HX_Generator::run(const HX_NameForming::Progress& progress) {
     result.findings.back().source = model->typeCircle.place;
     return;
   }
-  spaces.emplace(*model, result.types);
+  spaces.emplace(*model, result.types, lock);
   for (const HX_NameSpaces::ReservedUse& use : spaces->reservedUses())
     document.faults.add(use.place, HX_Quoted(use.name),
                         "a name that is no " + use.conflict.text());

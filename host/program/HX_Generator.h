@@ -1,8 +1,8 @@
 // One run over a model, from the document to the result.
 //
 //   HX_Profile profile("");
-//   HX_Generator generator(profile, "cruise_control.json", "data/keywords");
-//   generator.run(progress);
+//   HX_Generator generator(profile, "cruise_control.json", {"data/keywords"});
+//   generator.run(progress, nullptr);
 //   HX_WriteTable(std::cout, generator.result);
 
 #ifndef HOST_PROGRAM_HX_GENERATOR_H
@@ -22,11 +22,12 @@
 struct HX_Generator {
   /// Throws HX_DocumentError. Paths count from the start of \p profile.
   HX_Generator(HX_Profile& profile, const std::string& document,
-               const std::string& keywordFolder);
+               const std::vector<std::string>& keywordFolders);
 
   /// Orders types, forms names, orders variables. A circle of types ends the
   /// run without names. Throws HX_DocumentError for reserved words among types.
-  void run(const HX_NameForming::Progress& progress);
+  /// \param lock  names to keep, and to note; null for none
+  void run(const HX_NameForming::Progress& progress, HX_NameLock* lock);
 
   /// Writes the C code, and the name map by id.
   /// \return the number of files that the commit of \p output changes

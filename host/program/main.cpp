@@ -19,6 +19,8 @@ constexpr char kFooter[] =
     "  hx_codegen names model.json\n"
     "  hx_codegen explain model.json --name set_speed\n"
     "  hx_codegen generate model.json --out code --profile profile\n"
+    "  hx_codegen generate model.json --out code --lock names.lock\n"
+    "  hx_codegen diff old.lock names.lock --format sed\n"
     "  hx_codegen import model.slx > model.json\n"
     "  hx_codegen report model.json --out report.html\n"
     "  hx_codegen synthesize --blocks 10000 --seed 7 > large.json\n"
@@ -69,8 +71,9 @@ CLI::App* CommandLine::addOverModel(const char* name, const char* description,
   CLI::App* added = add(name, description, chosen);
   added->add_option("MODEL.json", arguments.model, "the model document")
       ->required();
-  added->add_option("--keywords", arguments.keywords,
-                    "folder of the word lists that the document names");
+  added->add_option("--keywords", arguments.ownKeywords,
+                    "folder of further word lists; may be repeated");
+  added->add_option("--lock", arguments.lock, "file of the names to keep");
   added->add_option("--profile", arguments.profile,
                     "folder for reports on what took how long");
   added->add_flag("--quiet", arguments.quiet, "no progress, no summary");
@@ -106,6 +109,32 @@ CommandLine::CommandLine() {
   generate->add_option("--out", arguments.out, "folder for the files")
       ->required();
   generate->add_flag("--json", arguments.json, "print the name map as well");
+  generate
+      ->add_flag("--locked", arguments.locked,
+                 "refuse new and changed names, change no lock")
+      ->needs(generate->get_option("--lock"));
+  generate
+      ->add_option("--retire", arguments.retireRuns,
+                   "runs after which names of items that went are free "
+                   "(0: never)")
+      ->check(CLI::Range(0, 1'000'000))
+      ->needs(generate->get_option("--lock"));
+
+  CLI::App* lock = app.add_subcommand("lock", "work on a lock file");
+  lock->require_subcommand(1);
+  CLI::App* prune = lock->add_subcommand(
+      "prune", "free the names of items that went, and former names");
+  prune->callback([this] { command = HX_PruneLock; });
+  prune->add_option("LOCK", arguments.lock, "the lock file")->required();
+
+  CLI::App* compare = add(
+      "diff", "compare names: documents, locks or name maps", HX_CompareNames);
+  compare->add_option("OLD", arguments.older, "the names before")->required();
+  compare->add_option("NEW", arguments.model, "the names now")->required();
+  compare->add_option("--format", arguments.format, "table, json or sed")
+      ->check(CLI::IsMember({"table", "json", "sed"}));
+  compare->add_option("--keywords", arguments.ownKeywords,
+                      "folder of further word lists; may be repeated");
 
   CLI::App* import = add("import", "print a model file as a model document",
                          HX_ImportModelFile);

@@ -93,8 +93,17 @@ int bitsOf(HX_Change::HxEReasonTag reason) {
     case HX_Change::eBaseType:
     case HX_Change::eType:
       return kChanged | kReserved;
+    case HX_Change::ePattern:
+      return kChanged | kReserved;
+    case HX_Change::eRewritten:
+    case HX_Change::eLocked:
+    case HX_Change::eNoVariant:
+      return kChanged;
     case HX_Change::eTakenByConstant:
     case HX_Change::eTakenByName:
+    case HX_Change::eIndistinct:
+    case HX_Change::eHeld:
+    case HX_Change::eRetired:
       return kChanged | kDerived;
   }
   return kChanged;

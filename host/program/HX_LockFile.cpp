@@ -1,0 +1,68 @@
+#include "host/program/HX_LockFile.h"
+
+#include <fstream>
+#include <iterator>
+#include <ostream>
+#include <utility>
+
+#include "host/base/HX_Faults.h"
+#include "host/base/HX_Text.h"
+
+std::string HX_ReadWholeFile(const std::string& file,
+                             const std::filesystem::path& path) {
+  std::ifstream in(path, std::ios::binary);
+  // A folder opens, but cannot be read.
+  if (!in || in.peek() == std::ifstream::traits_type::eof()) {
+    std::error_code error;
+    if (!in || !std::filesystem::is_regular_file(path, error))
+      throw HX_InputError(HX_Visible(file) + ": cannot be read");
+  }
+  return {std::istreambuf_iterator<char>(in), {}};
+}
+
+void HX_ReadLock(HX_NameLock& lock, const std::string& file,
+                 const std::string& text) {
+  HX_TextFaults faults;
+  if (lock.read(text.data(), text.size(), faults)) return;
+  std::string all;
+  for (int i = 0; i < faults.kept(); ++i)
+    all += (i == 0 ? "" : "\n") + file + ":" + std::to_string(faults[i].line) +
+           ": " + faults[i].text.cstring();
+  if (faults.count() > faults.kept())
+    all += "\n" + file + ": ... and " +
+           std::to_string(faults.count() - faults.kept()) + " more";
+  throw HX_DocumentError(all);
+}
+
+HX_LockFile::HX_LockFile(std::string file, std::filesystem::path path,
+                         bool mustExist)
+    : m_File(std::move(file)), m_Path(std::move(path)) {
+  if (m_File.empty()) return;
+  if (mustExist || std::filesystem::exists(m_Path))
+    HX_ReadLock(m_Lock, m_File, HX_ReadWholeFile(m_File, m_Path));
+}
+
+int HX_LockFile::writeChanges(std::ostream& out) const {
+  int changes = 0;
+  for (int at = 0; at < m_Lock.size(); ++at) {
+    const HX_NameLock::HxEChangeTag change = m_Lock.change(at);
+    if (change == HX_NameLock::eGone || change == HX_NameLock::eKept) continue;
+    const HX_NameLock::Entry& entry = m_Lock.entry(at);
+    ++changes;
+    out << entry.item << ": "
+        << (change == HX_NameLock::eRenamed   ? "renamed to "
+            : change == HX_NameLock::eRevived ? "back with "
+                                              : "new, ")
+        << entry.name << '\n';
+  }
+  return changes;
+}
+
+void HX_LockFile::write(HX_Output& output) const {
+  std::ostream& out = output.open(m_Path.filename().string());
+  const bool isWritten =
+      m_Lock.write([&out](const char* text, std::size_t length) {
+        out.write(text, static_cast<std::streamsize>(length));
+      });
+  if (!isWritten) throw HX_OutputError(m_File + ": no memory");
+}
