@@ -13,12 +13,13 @@ enum HX_ExitCode { kHxDone = 0, kHxErrorsFound = 1, kHxRefused = 2 };
 struct HX_Arguments {
   std::string model;
   std::string name;
-  std::string keywords;  ///< folder of the installed word lists
+  std::string keywords;                  ///< folder of the installed word lists
   std::vector<std::string> ownKeywords;  ///< folders of the user
   std::string lock;
   std::string older;  ///< of two sets of names
   std::string format = "table";
   std::vector<std::string> templates;
+  std::vector<std::string> patterns;
   int retireRuns = 0;
   bool locked = false;
   std::string out;
@@ -41,6 +42,7 @@ HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments);
 HX_ExitCode HX_ReportNames(const HX_Arguments& arguments);
 HX_ExitCode HX_PruneLock(const HX_Arguments& arguments);
 HX_ExitCode HX_CompareNames(const HX_Arguments& arguments);
+HX_ExitCode HX_LintTemplates(const HX_Arguments& arguments);
 HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments);
 
 /// Throws HX_OutputError if the standard output cannot be written.

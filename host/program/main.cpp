@@ -5,6 +5,7 @@
 #include <iostream>
 #include <new>
 
+#include "SafeNames/HX_ReservedNames.h"
 #include "host/base/HX_Faults.h"
 #include "host/base/HX_System.h"
 #include "host/base/HX_Text.h"
@@ -21,6 +22,7 @@ constexpr char kFooter[] =
     "  hx_codegen generate model.json --out code --profile profile\n"
     "  hx_codegen generate model.json --out code --lock names.lock\n"
     "  hx_codegen diff old.lock names.lock --format sed\n"
+    "  hx_codegen lint '$S_$B' 'str$B' --pattern str\n"
     "  hx_codegen import model.slx > model.json\n"
     "  hx_codegen report model.json --out report.html\n"
     "  hx_codegen synthesize --blocks 10000 --seed 7 > large.json\n"
@@ -71,8 +73,10 @@ CLI::App* CommandLine::addOverModel(const char* name, const char* description,
   CLI::App* added = add(name, description, chosen);
   added->add_option("MODEL.json", arguments.model, "the model document")
       ->required();
-  added->add_option("--keywords", arguments.ownKeywords,
-                    "folder of further word lists; may be repeated");
+  added
+      ->add_option("--keywords", arguments.ownKeywords,
+                   "folder of further word lists; may be repeated")
+      ->allow_extra_args(false);
   added->add_option("--lock", arguments.lock, "file of the names to keep");
   added->add_option("--profile", arguments.profile,
                     "folder for reports on what took how long");
@@ -133,8 +137,27 @@ CommandLine::CommandLine() {
   compare->add_option("NEW", arguments.model, "the names now")->required();
   compare->add_option("--format", arguments.format, "table, json or sed")
       ->check(CLI::IsMember({"table", "json", "sed"}));
-  compare->add_option("--keywords", arguments.ownKeywords,
-                      "folder of further word lists; may be repeated");
+  compare
+      ->add_option("--keywords", arguments.ownKeywords,
+                   "folder of further word lists; may be repeated")
+      ->allow_extra_args(false);
+
+  CLI::App* lint =
+      add("lint", "check name templates without a model", HX_LintTemplates);
+  lint->add_option("TEMPLATE", arguments.templates, "templates to check");
+  lint->add_option("--rules", arguments.rules, "file of naming rules");
+  lint->add_option("--pattern", arguments.patterns,
+                   "reserved pattern that names must not match; may be "
+                   "repeated")
+      ->allow_extra_args(false)
+      ->check(CLI::Validator(
+          [](const std::string& name) {
+            return HX_ReservedNames::patternOf(name.c_str()) != 0
+                       ? std::string()
+                       : "unknown pattern " + name;
+          },
+          ""));
+  lint->add_flag("--json", arguments.json, "print JSON instead");
 
   CLI::App* import = add("import", "print a model file as a model document",
                          HX_ImportModelFile);

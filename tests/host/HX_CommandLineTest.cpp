@@ -40,8 +40,9 @@ TEST_F(CommandLineTest, ManualPageHasTheOptionsOfTheHelp) {
   const std::string page =
       std::regex_replace(read(HX_MANUAL_PAGE), std::regex(R"(\\-)"), "-");
   std::string help = codegen("--help").out;
-  for (const std::string command : {"names", "explain", "generate", "lock",
-                                    "diff", "import", "rules", "synthesize"}) {
+  for (const std::string command :
+       {"names", "explain", "generate", "lock", "diff", "lint", "import",
+        "rules", "synthesize"}) {
     EXPECT_THAT(help, HasSubstr("\n  " + command + " "));
     EXPECT_THAT(page, HasSubstr("\n.SS " + command + "\n"));
     help += codegen(command + " --help").out;

@@ -168,6 +168,43 @@ TEST_F(HostSafeNamesTest, DiffTellsReasonsAndGivesAScriptForSed) {
   EXPECT_EQ(2, codegen("diff " + oldMap.string() + " missing").code);
 }
 
+TEST_F(HostSafeNamesTest, LintTellsMacrosLengthAndProblems) {
+  Result result = codegen("lint '$S_$B'");
+  EXPECT_EQ(0, result.code);
+  EXPECT_EQ(
+      "$S_$B\n"
+      "  $S  S with subsystem id and number  [template]\n"
+      "  $B  block name  [template]\n"
+      "  longest name: no bound, 1 characters without values\n",
+      result.out);
+  result = codegen("lint --pattern str 'strx_$Q:$(Task)x' 'stra$R'");
+  EXPECT_EQ(1, result.code);
+  EXPECT_THAT(result.out,
+              HasSubstr("  $Q  unknown\n"
+                        "  $(Task)  name of the task, else of the interrupt "
+                        "service routine  [task]\n"));
+  EXPECT_THAT(result.out, HasSubstr("  error: 1203: The name macro '$Q' is"));
+  EXPECT_THAT(result.out, HasSubstr("  warning: 1202: The name macro "
+                                    "'$(Task)' is not supported unless"));
+  EXPECT_THAT(result.out, HasSubstr("  warning: The actual name has no $R"));
+  EXPECT_THAT(result.out,
+              HasSubstr("  error: Every name matches the reserved pattern "
+                        "'str'.\n"));
+  const fs::path rules = m_Folder / "rules.json";
+  write(rules, R"({"rules": [{"name": "a", "template": "$B"},
+                             {"name": "b"}, {"template": "$Q"}]})");
+  result = codegen("lint --json --rules " + rules.string());
+  EXPECT_EQ(1, result.code);
+  const Json json = Json::parse(result.out);
+  ASSERT_EQ(2u, json["templates"].size());
+  EXPECT_EQ(rules.string() + ": /rules/2/template",
+            json["templates"][1]["place"]);
+  EXPECT_EQ(1203, json["templates"][1]["problems"][0]["message"]);
+  EXPECT_EQ(nullptr, json["templates"][0]["longest"]);
+  EXPECT_EQ(2, codegen("lint --pattern st x").code);
+  EXPECT_EQ(2, codegen("lint --rules missing.json").code);
+}
+
 TEST_F(HostSafeNamesTest, WordsPatternsAndSignificanceOfADocumentCount) {
   const fs::path own = m_Folder / "own";
   fs::create_directory(own);
