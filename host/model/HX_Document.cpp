@@ -149,14 +149,15 @@ std::string HX_Document::shown(const Place& place) const {
 
 void HX_Document::throwIfFaulty() const {
   if (faults.count() == 0) return;
-  std::string lines;
+  std::vector<HX_Diagnostic> list;
   const auto places = locate(faults);
-  for (const auto& [place, fault] : faults.kept()) {
-    const Place& found = places.at(place);
-    if (!lines.empty()) lines += '\n';
-    lines += shown(found) + ": found " + fault.found + ", expected " +
-             fault.expected;
+  for (const auto& [end, fault] : faults.kept()) {
+    const Place& place = places.at(end);
+    const HX_TextPlace at = HX_PlaceIn(text, place.begin);
+    list.push_back({fault.number, 2,
+                    HX_MessageText(fault.number, {fault.found, fault.expected}),
+                    "", place.pointer, HX_Visible(file), at.line, at.column});
   }
-  const std::string rest = faults.rest();
-  throw HX_DocumentError(rest.empty() ? lines : lines + '\n' + rest);
+  faults.addRest(list);
+  throw HX_DocumentError(list);
 }

@@ -278,7 +278,7 @@ bool HX_ReadDocument(HX_Document& document, HX_ModelReading& reading) {
   std::string found = "the end of the file";
   if (end.place < document.text.size())
     found = HX_Quoted(printable(std::string_view(document.text), end.place));
-  reading.faults.add(end.place, found, end.expected);
+  reading.faults.add(end.place, found, end.expected, kHxBadSyntax);
   return false;
 }
 

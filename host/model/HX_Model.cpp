@@ -84,14 +84,15 @@ void HX_Ids::report(HX_Faults& faults) const {
     std::string found = HX_Quoted(*(*this)[entry].text);
     if (unknown.uses > 1)
       found += " (" + std::to_string(unknown.uses) + " uses)";
-    faults.add(unknown.first, found, std::string("the id of ") + what());
+    faults.add(unknown.first, found, std::string("the id of ") + what(),
+               kHxUnknownId);
   }
 }
 
 void HX_ModelReading::define(HX_Ids& ids, const HX_Use& id, std::size_t item) {
   if (!id.isGiven() || ids.define(id.entry, static_cast<int>(item))) return;
   faults.add(id.place, HX_Quoted(*ids[id.entry].text) + " again",
-             "an id that is not taken yet");
+             "an id that is not taken yet", kHxTakenId);
 }
 
 HX_Bindings HX_OptionBindings() { return {kBindings, std::size(kBindings)}; }

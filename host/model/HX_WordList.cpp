@@ -21,13 +21,15 @@ std::string_view contentOf(std::string_view line) {
 
 void throwFaults(const fs::path& file, std::string_view text,
                  const HX_Faults& faults) {
-  std::string lines;
-  for (const auto& [place, fault] : faults.kept())
-    lines += (lines.empty() ? "" : "\n") + HX_Visible(file.string()) + ":" +
-             HX_LineAndColumn(text, place) + ": found " + fault.found +
-             ", expected " + fault.expected;
-  if (!faults.rest().empty()) lines += '\n' + faults.rest();
-  throw HX_DocumentError(lines);
+  std::vector<HX_Diagnostic> list;
+  for (const auto& [place, fault] : faults.kept()) {
+    const HX_TextPlace at = HX_PlaceIn(text, place);
+    list.push_back({fault.number, 2,
+                    HX_MessageText(fault.number, {fault.found, fault.expected}),
+                    "", "", HX_Visible(file.string()), at.line, at.column});
+  }
+  faults.addRest(list);
+  throw HX_DocumentError(list);
 }
 
 }  // namespace
@@ -47,12 +49,13 @@ bool HX_ReadWordList(const fs::path& file, std::set<std::string>& words) {
         contentOf(std::string_view(text).substr(at, end - at));
     if (!word.empty() && !s_Name.fits(word))
       faults.add(static_cast<std::size_t>(word.data() - text.data()),
-                 HX_Quoted(word), "a C name or a comment behind '#'");
+                 HX_Quoted(word), "a C name or a comment behind '#'",
+                 kHxBadWordList);
     if (!word.empty()) words.emplace(word);
     hasWord = hasWord || !word.empty();
     at = end + 1;
   }
-  if (!hasWord) faults.add(0, "no word", "a C name");
+  if (!hasWord) faults.add(0, "no word", "a C name", kHxBadWordList);
   if (faults.count() > 0) throwFaults(file, text, faults);
   return true;
 }

@@ -4,6 +4,13 @@
 #include "host/model/HX_SourcePaths.h"
 #include "platform/messages/HX_MessageHandler.h"
 
+HX_Finding HX_Remark(HX_MessageNumber number,
+                     std::initializer_list<std::string_view> arguments,
+                     const std::string& source) {
+  return {number, HX_FindMessage(number)->severity,
+          HX_MessageText(number, arguments), source};
+}
+
 HX_MessageCollector* HX_MessageCollector::s_Current = nullptr;
 
 HX_MessageCollector::HX_MessageCollector(std::vector<HX_Finding>& findings)

@@ -11,21 +11,30 @@
 #ifndef HOST_NAMES_HX_FINDINGS_H
 #define HOST_NAMES_HX_FINDINGS_H
 
+#include <initializer_list>
 #include <string>
+#include <string_view>
 #include <vector>
+
+#include "host/messages/HX_MessageTable.h"
 
 /// Texts are UTF-8.
 struct HX_Finding {
   /// The first two severities of the library; higher values exist.
   enum HxESeverityTag { eNote = 0, eWarning = 1, eError = 2 };
 
-  int id;  ///< number of the message; 0 for a remark of the program
+  int id;  ///< number of the message, of the library or of the program
   int severity;
   std::string text;
   std::string source;  // may be empty
 
   bool isError() const { return severity % 4 >= eError; }
 };
+
+/// A remark of the program.
+HX_Finding HX_Remark(HX_MessageNumber number,
+                     std::initializer_list<std::string_view> arguments,
+                     const std::string& source);
 
 /// Collects the messages that the library reports during the life of the
 /// collector. A collector inside the life of an outer collector takes the

@@ -8,9 +8,9 @@
 
 namespace {
 
-void remark(HX_FormedName& name, HX_Finding::HxESeverityTag severity,
-            const std::string& text) {
-  name.findings.push_back({0, severity, text, name.sourcePath()});
+void remark(HX_FormedName& name, HX_MessageNumber number,
+            std::initializer_list<std::string_view> arguments = {}) {
+  name.findings.push_back(HX_Remark(number, arguments, name.sourcePath()));
 }
 
 // Values of macros may hold macros of later substitutions: 1000 substitutions
@@ -62,15 +62,11 @@ std::deque<HX_FormedName> HX_NameForming::formAll(
 void HX_NameForming::form(HX_FormedName& name) {
   const HX_MessageCollector collector(name.findings);
   const HX_WantedName& wanted = *name.wanted;
-  if (countOf(':', wanted.nameTemplate->text) > 1)
-    remark(name, HX_Finding::eWarning,
-           "The name template has more than two parts; the first two count.");
+  if (countOf(':', wanted.nameTemplate->text) > 1) remark(name, kHxManyParts);
   HxCCIdentifier id(wanted.nameTemplate->text);
   const std::optional<bool> isComplete = expand(wanted, id, false);
   if (!isComplete)
-    return remark(name, HX_Finding::eError,
-                  "The values of macros hold macros: the name is longer than " +
-                      std::to_string(kMostUnits) + " characters.");
+    return remark(name, kHxMacrosInMacros, {std::to_string(kMostUnits)});
   name.isComplete = *isComplete;
 
   // A name that still holds macros is no C name yet.
@@ -150,14 +146,10 @@ void HX_NameForming::define(HxCCIdentifier& id, HX_FormedName& name) {
 void HX_NameForming::note(const HX_SafeName::Step& step, HX_FormedName& name) {
   switch (step.kind) {
     case HX_SafeName::eEmpty:
-      return remark(name, HX_Finding::eError,
-                    "The name is empty: nothing is defined.");
+      return remark(name, kHxEmptyName);
     case HX_SafeName::eTooLong:
-      return remark(
-          name, HX_Finding::eWarning,
-          "The name is longer than " +
-              std::to_string(HxCSymbol::sm_MaxNameLength) +
-              " characters, and its template does not let it change ($R).");
+      return remark(name, kHxTooLong,
+                    {std::to_string(HxCSymbol::sm_MaxNameLength)});
     case HX_SafeName::eDerived:
       return;  // the conflict before it is the reason
     default:
@@ -170,7 +162,5 @@ void HX_NameForming::note(const HX_SafeName::Step& step, HX_FormedName& name) {
     m_Names.isStringValidCVariableName(step.text);
     return;
   }
-  remark(name, HX_Finding::eError,
-         "The name '" + HX_ToUtf8(step.text) + "' is " + change.text() +
-             ", and its template does not let it change ($R).");
+  remark(name, kHxTaken, {HX_ToUtf8(step.text), change.text()});
 }

@@ -41,7 +41,8 @@ void HX_Generator::run(const HX_NameForming::Progress& progress,
   spaces.emplace(*model, result.types, lock);
   for (const HX_NameSpaces::ReservedUse& use : spaces->reservedUses())
     document.faults.add(use.place, HX_Quoted(use.name),
-                        "a name that is no " + use.conflict.text());
+                        "a name that is no " + use.conflict.text(),
+                        kHxReservedType);
   document.throwIfFaulty();
   document.text = {};
   {

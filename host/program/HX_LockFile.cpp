@@ -24,14 +24,16 @@ void HX_ReadLock(HX_NameLock& lock, const std::string& file,
                  const std::string& text) {
   HX_TextFaults faults;
   if (lock.read(text.data(), text.size(), faults)) return;
-  std::string all;
+  std::vector<HX_Diagnostic> list;
   for (int i = 0; i < faults.kept(); ++i)
-    all += (i == 0 ? "" : "\n") + file + ":" + std::to_string(faults[i].line) +
-           ": " + faults[i].text.cstring();
+    list.push_back({kHxBadLock, 2, faults[i].text.cstring(), "", "", file,
+                    faults[i].line});
   if (faults.count() > faults.kept())
-    all += "\n" + file + ": ... and " +
-           std::to_string(faults.count() - faults.kept()) + " more";
-  throw HX_DocumentError(all);
+    list.push_back(
+        {kHxMoreFaults, 2,
+         "... and " + std::to_string(faults.count() - faults.kept()) + " more",
+         "", "", file});
+  throw HX_DocumentError(list);
 }
 
 HX_LockFile::HX_LockFile(std::string file, std::filesystem::path path,

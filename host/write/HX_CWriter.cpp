@@ -253,10 +253,8 @@ std::string HX_CWriter::elementValue(const HX_FormedName& name,
 }
 
 void HX_CWriter::warnOfSaturation(const HX_FormedName& name, double physical) {
-  m_Result.findings.push_back(
-      {0, HX_Finding::eWarning,
-       "The initial value " + floatText(physical, "") + " of " +
-           name.actual.cstring() + " does not fit the type " +
-           name.wanted->type->name + "; the nearest value that fits is used.",
-       name.sourcePath()});
+  m_Result.findings.push_back(HX_Remark(
+      kHxSaturated,
+      {floatText(physical, ""), name.actual.cstring(), name.wanted->type->name},
+      name.sourcePath()));
 }

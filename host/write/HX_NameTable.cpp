@@ -51,11 +51,9 @@ std::string shortPath(const std::string& path) {
 
 // "error   17056  C keyword int used as identifier.  [path]"
 std::string lineOf(const HX_Finding& finding, const std::string& knownSource) {
-  const std::string id =
-      finding.id != 0 ? std::to_string(finding.id) : std::string("host");
   const bool isKnown = finding.source.empty() || finding.source == knownSource;
   return padded(HX_MessageHandler::severityName(finding.severity), 8) +
-         padded(id, 7) + finding.text +
+         padded(std::to_string(finding.id), 7) + finding.text +
          (isKnown ? "" : "  [" + finding.source + "]");
 }
 
