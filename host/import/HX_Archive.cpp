@@ -17,7 +17,7 @@ struct FileCloser {
 std::string textOfZipError(int code) {
   zip_error_t error;
   zip_error_init_with_code(&error, code);
-  const std::string text = zip_error_strerror(&error);
+  std::string text = zip_error_strerror(&error);
   zip_error_fini(&error);
   return text;
 }
