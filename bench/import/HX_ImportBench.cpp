@@ -93,7 +93,7 @@ BENCHMARK(BM_Import_Read)->Arg(5000)->Unit(benchmark::kMillisecond);
 void BM_Import_Whole(benchmark::State& state) {
   HX_ImportRequest request;
   request.model = packedModel(state);
-  request.keywordFolder = HX_KEYWORD_FOLDER;
+  request.keywordFolders = {HX_KEYWORD_FOLDER};
   for (auto _ : state)
     benchmark::DoNotOptimize(HX_ImportModel(request).document);
   state.SetItemsProcessed(state.iterations());

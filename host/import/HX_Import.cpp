@@ -3,6 +3,7 @@
 #include <fstream>
 
 #include "host/import/HX_Dictionary.h"
+#include "host/import/HX_Literals.h"
 #include "host/import/HX_ModelDocument.h"
 #include "host/import/HX_ModelFile.h"
 #include "host/import/HX_ModelTree.h"
@@ -17,22 +18,28 @@ namespace fs = std::filesystem;
 
 namespace {
 
-void readWords(const fs::path& file, HX_TypeTable::Reserved& words) {
+bool readWords(const fs::path& file, HX_TypeTable::Reserved& words) {
   std::ifstream stream(file);
-  if (!stream.is_open())
-    throw HX_ImportError(file.string() + ": expected a word list");
   for (std::string line; std::getline(stream, line);) {
-    if (!line.empty() && line.back() == '\r') line.pop_back();
-    if (!line.empty() && line.front() != '#') words.insert(line);
+    const std::string_view word = HX_Trimmed(line.substr(0, line.find('#')));
+    if (!word.empty()) words.emplace(word);
   }
+  return stream.is_open();
 }
 
 HX_TypeTable::Reserved reservedWords(const HX_ImportRequest& request,
                                      const HX_Rules& rules) {
+  std::vector<std::string> lists = rules.keywords;
+  lists.push_back("c90");
   HX_TypeTable::Reserved words;
-  readWords(request.keywordFolder / "c90.txt", words);
-  for (const std::string& list : rules.keywords)
-    readWords(request.keywordFolder / (list + ".txt"), words);
+  for (const std::string& list : lists) {
+    bool isRead = false;
+    for (const fs::path& folder : request.keywordFolders)
+      isRead = readWords(folder / (list + ".txt"), words) || isRead;
+    if (!isRead)
+      throw HX_ImportError("the word list '" + list +
+                           "' of the naming rules is in no folder");
+  }
   return words;
 }
 

@@ -2,7 +2,7 @@
 //
 //   HX_ImportRequest request;
 //   request.model = "rc_update.slx";
-//   request.keywordFolder = "data/keywords";
+//   request.keywordFolders = {"data/keywords"};
 //   const HX_Import import = HX_ImportModel(request);
 //   std::cout << import.document;
 //
@@ -25,9 +25,9 @@ struct HX_ImportRequest {
   /// Where referenced files are looked for, after the folder of the model.
   std::vector<std::filesystem::path> searchPath;
   std::filesystem::path rules;  ///< empty for the built-in rules
-  /// Word lists (NAME.txt): types and fields avoid the words of "c90" and of
-  /// the lists that the rules name.
-  std::filesystem::path keywordFolder;
+  /// Folders of word lists (NAME.txt): types and fields avoid the words of
+  /// "c90" and of the lists in the rules. Lists of equal name add up.
+  std::vector<std::filesystem::path> keywordFolders;
   HX_ImportLimits limits;
 };
 

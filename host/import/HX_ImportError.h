@@ -23,7 +23,8 @@ struct HX_ImportLimits {
   /// because a small part of blanks is harmless.
   std::uint64_t ratio = 200;
   std::uint64_t ratioFrom = 1U << 20;
-  int depth = 256;                 ///< systems in systems, states in states
+  /// Systems in systems and states in states together: a document admits 98.
+  int depth = 90;
   std::size_t blocks = 2'000'000;  ///< blocks of the tree, references expanded
 };
 

@@ -245,6 +245,7 @@ class Writer {
     m_Json.StartObject();
     field("id", name.id);
     field("template", name.rule->nameTemplate);
+    field("rule", name.rule->name);
     field("kind", name.kind);
     given("source", name.source);
     given("dd", name.dd);

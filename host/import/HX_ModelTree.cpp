@@ -146,8 +146,9 @@ void HX_ModelTree::addContent(HX_ModelBlock& block, pugi::xml_node node,
   block.type = node.attribute("BlockType").value();
   if (const pugi::xml_node chart = place.file->chartOf(place.path)) {
     block.isChart = block.isFunction = true;
-    if (!HX_ReadChart(chart, block.id, m_Limits.depth, block.chart))
-      place.file->fail("states nested deeper than " +
+    if (!HX_ReadChart(chart, block.id, m_Limits.depth - place.depth,
+                      block.chart))
+      place.file->fail("systems and states nested deeper than " +
                        std::to_string(m_Limits.depth) + " in " + place.path);
   }
   if (block.get("TreatAsAtomicUnit") == "on") block.isFunction = true;

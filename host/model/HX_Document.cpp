@@ -128,6 +128,13 @@ class Locator : public HX_JsonEvents {
 HX_Document::HX_Document(const std::string& name, const fs::path& folder)
     : file(name), text(readFile(name, folder)) {}
 
+HX_Document HX_Document::ofText(const std::string& name, std::string text) {
+  HX_Document document;
+  document.file = name;
+  document.text = std::move(text);
+  return document;
+}
+
 std::map<std::size_t, HX_Document::Place> HX_Document::locate(
     const HX_Faults& list) const {
   Locator locator(text, list);

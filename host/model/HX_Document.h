@@ -19,6 +19,9 @@ struct HX_Document {
   /// \param name  as the user wrote the name, counted from \p folder
   HX_Document(const std::string& name, const std::filesystem::path& folder);
 
+  /// A document that was made, not read; \p name is for messages.
+  static HX_Document ofText(const std::string& name, std::string text);
+
   /// Throws HX_DocumentError with a line for each fault, if there are faults:
   /// "FILE:LINE:COLUMN: POINTER: found FOUND, expected EXPECTED".
   void throwIfFaulty() const;
@@ -39,6 +42,9 @@ struct HX_Document {
   std::string file;
   std::string text;
   HX_Faults faults;  // places are ends of tokens
+
+ private:
+  HX_Document() = default;
 };
 
 #endif  // HOST_MODEL_HX_DOCUMENT_H

@@ -130,6 +130,10 @@ HX_Model::~HX_Model() {
   HX_DdTree::instance().clear();
 }
 
+const std::string* HX_Model::enterRule(std::string_view text) {
+  return &*m_Rules.emplace(text).first;
+}
+
 const HX_Template* HX_Model::enterTemplate(std::string_view text) {
   const auto [found, isNew] = m_Templates.try_emplace(std::string(text));
   if (isNew) found->second = {HX_NameText(text), &found->first};

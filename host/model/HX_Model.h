@@ -84,9 +84,12 @@ struct HX_Model {
 
   /// The template of the text, made if it is new.
   const HX_Template* enterTemplate(std::string_view text);
+  /// The text of the naming rule, kept once.
+  const std::string* enterRule(std::string_view text);
 
  private:
   std::unordered_map<std::string, HX_Template> m_Templates;
+  std::set<std::string> m_Rules;
 };
 
 #endif  // HOST_MODEL_HX_MODEL_H

@@ -79,6 +79,10 @@ constexpr HX_FieldBinding kBindings[] = {
      [](Reading& r, const Value& v) {
        name(r).nameTemplate = r.model.enterTemplate(v.text);
      }},
+    {"name.rule",
+     [](Reading& r, const Value& v) {
+       name(r).rule = r.model.enterRule(v.text);
+     }},
     {"name.kind",
      [](Reading& r, const Value& v) {
        name(r).kind = HX_ValueOf(kHxNameKinds, v.text);

@@ -64,6 +64,7 @@ struct HX_RareWishes {
 struct HX_WantedName {
   std::string id;
   const HX_Template* nameTemplate = nullptr;  // owned by the model
+  const std::string* rule = nullptr;          // owned by the model, or null
   HX_NameKind kind = HX_NameKind::eObject;
   KyCXString label;
   const HxCSrcRef* source = nullptr;

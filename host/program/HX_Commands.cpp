@@ -10,6 +10,7 @@
 #include "host/model/HX_Document.h"
 #include "host/model/HX_Synthesis.h"
 #include "host/program/HX_Generator.h"
+#include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_LockFile.h"
 #include "host/program/HX_Version.h"
 #include "host/write/HX_NameMap.h"
@@ -121,7 +122,9 @@ HX_LockFile lockFileOf(const HX_Arguments& arguments,
 HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command) {
   HX_Profile profile(arguments.profile);
   HX_LockFile lock = lockFileOf(arguments, profile.start);
-  HX_Generator generator(profile, arguments.model, keywordFolders(arguments));
+  HX_Generator generator(profile,
+                         HX_ReadDocument(arguments.model, arguments, profile),
+                         keywordFolders(arguments));
   generator.run(progressOf(arguments), lock.lock());
   requireMemory();
   command(arguments, generator);
@@ -142,7 +145,9 @@ HX_ExitCode HX_ExplainName(const HX_Arguments& arguments) {
 HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments) {
   HX_Profile profile(arguments.profile);
   HX_LockFile lock = lockFileOf(arguments, profile.start);
-  HX_Generator generator(profile, arguments.model, keywordFolders(arguments));
+  HX_Generator generator(profile,
+                         HX_ReadDocument(arguments.model, arguments, profile),
+                         keywordFolders(arguments));
   generator.run(progressOf(arguments), lock.lock());
   requireMemory();
   const bool writesLock = lock.lock() != nullptr && !arguments.locked &&

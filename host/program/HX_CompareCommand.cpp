@@ -6,6 +6,7 @@
 #include "host/base/HX_Text.h"
 #include "host/program/HX_Commands.h"
 #include "host/program/HX_Generator.h"
+#include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_LockFile.h"
 
 namespace {
@@ -63,7 +64,8 @@ void addDocument(HX_NameDiff& diff, HX_NameDiff::HxESideTag side,
   std::vector<std::string> folders{arguments.keywords};
   folders.insert(folders.end(), arguments.ownKeywords.begin(),
                  arguments.ownKeywords.end());
-  HX_Generator generator(profile, file, folders);
+  HX_Generator generator(profile, HX_ReadDocument(file, arguments, profile),
+                         folders);
   generator.run([](std::size_t, std::size_t) {}, nullptr);
   for (const HX_FormedName* name : generator.result.names)
     add(diff, side,

@@ -8,18 +8,9 @@
 #include "host/write/HX_CWriter.h"
 #include "host/write/HX_NameMap.h"
 
-namespace {
-
-HX_Document readDocument(HX_Profile& profile, const std::string& file) {
-  const HX_Profile::Phase phase(profile, "Read document");
-  return HX_Document(file, profile.start);
-}
-
-}  // namespace
-
-HX_Generator::HX_Generator(HX_Profile& timing, const std::string& file,
+HX_Generator::HX_Generator(HX_Profile& timing, HX_Document read,
                            const std::vector<std::string>& keywordFolders)
-    : profile(timing), document(readDocument(timing, file)) {
+    : profile(timing), document(std::move(read)) {
   const HX_Profile::Phase phase(profile, "Build model");
   std::vector<std::string> folders;
   for (const std::string& folder : keywordFolders)

@@ -1,7 +1,8 @@
 // One run over a model, from the document to the result.
 //
 //   HX_Profile profile("");
-//   HX_Generator generator(profile, "cruise_control.json", {"data/keywords"});
+//   HX_Document document("cruise_control.json", profile.start);
+//   HX_Generator generator(profile, std::move(document), {"data/keywords"});
 //   generator.run(progress, nullptr);
 //   HX_WriteTable(std::cout, generator.result);
 
@@ -20,8 +21,8 @@
 #include "host/program/HX_Profile.h"
 
 struct HX_Generator {
-  /// Throws HX_DocumentError. Paths count from the start of \p profile.
-  HX_Generator(HX_Profile& profile, const std::string& document,
+  /// Throws HX_DocumentError. Folders count from the start of \p profile.
+  HX_Generator(HX_Profile& profile, HX_Document read,
                const std::vector<std::string>& keywordFolders);
 
   /// Orders types, forms names, orders variables. A circle of types ends the

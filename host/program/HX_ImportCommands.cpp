@@ -9,26 +9,47 @@
 
 namespace {
 
-HX_ImportRequest requestOf(const HX_Arguments& arguments) {
+// Paths count from \p folder. In messages a path stays as the user wrote it,
+// unless the working directory has changed.
+HX_Import importOf(const std::string& file, const HX_Arguments& arguments,
+                   const std::filesystem::path& folder) {
+  std::filesystem::path start;
+  if (folder != std::filesystem::current_path()) start = folder;
   HX_ImportRequest request;
-  request.model = arguments.model;
-  request.dictionaries.assign(arguments.dictionaries.begin(),
-                              arguments.dictionaries.end());
-  request.searchPath.assign(arguments.searchPath.begin(),
-                            arguments.searchPath.end());
-  request.rules = arguments.rules;
-  request.keywordFolder = arguments.keywords;
-  return request;
+  request.model = start / file;
+  for (const std::string& path : arguments.dictionaries)
+    request.dictionaries.push_back(start / path);
+  for (const std::string& path : arguments.searchPath)
+    request.searchPath.push_back(start / path);
+  if (!arguments.rules.empty()) request.rules = start / arguments.rules;
+  request.keywordFolders = {start / arguments.keywords};
+  for (const std::string& path : arguments.ownKeywords)
+    request.keywordFolders.push_back(start / path);
+  HX_Import import = HX_ImportModel(request);
+  if (!arguments.quiet) {
+    for (const std::string& note : import.notes) std::cerr << note << '\n';
+  }
+  return import;
 }
 
 }  // namespace
 
-HX_ExitCode HX_ImportModelFile(const HX_Arguments& arguments) {
-  const HX_Import import = HX_ImportModel(requestOf(arguments));
-  if (!arguments.quiet) {
-    for (const std::string& note : import.notes) std::cerr << note << '\n';
+HX_Document HX_ReadDocument(const std::string& file,
+                            const HX_Arguments& arguments,
+                            HX_Profile& profile) {
+  if (!HX_IsModelFile(file)) {
+    const HX_Profile::Phase phase(profile, "Read document");
+    return {file, profile.start};
   }
-  std::cout << import.document;
+  const HX_Profile::Phase phase(profile, "Import model");
+  return HX_Document::ofText(file,
+                             importOf(file, arguments, profile.start).document);
+}
+
+HX_ExitCode HX_ImportModelFile(const HX_Arguments& arguments) {
+  std::cout << importOf(arguments.model, arguments,
+                        std::filesystem::current_path())
+                   .document;
   return kHxDone;
 }
 
@@ -42,13 +63,22 @@ HX_ExitCode HX_PrintRules(const HX_Arguments& arguments) {
 
 namespace {
 
-[[noreturn]] HX_ExitCode refuse() {
+[[noreturn]] void refuse() {
   throw std::runtime_error(
       "this build reads no model files: the libraries for them are to be had "
       "for 64 bits only");
 }
 
 }  // namespace
+
+HX_Document HX_ReadDocument(const std::string& file,
+                            const HX_Arguments& /*arguments*/,
+                            HX_Profile& profile) {
+  const auto ending = std::filesystem::path(file).extension();
+  if (ending == ".slx" || ending == ".mdl") refuse();
+  const HX_Profile::Phase phase(profile, "Read document");
+  return {file, profile.start};
+}
 
 HX_ExitCode HX_ImportModelFile(const HX_Arguments& /*arguments*/) { refuse(); }
 

@@ -23,6 +23,7 @@ constexpr char kFooter[] =
     "  hx_codegen generate model.json --out code --lock names.lock\n"
     "  hx_codegen diff old.lock names.lock --format sed\n"
     "  hx_codegen lint '$S_$B' 'str$B' --pattern str\n"
+    "  hx_codegen names model.slx --dictionary types.sldd\n"
     "  hx_codegen import model.slx > model.json\n"
     "  hx_codegen report model.json --out report.html\n"
     "  hx_codegen synthesize --blocks 10000 --seed 7 > large.json\n"
@@ -71,29 +72,31 @@ CLI::App* CommandLine::add(const char* name, const char* description,
 CLI::App* CommandLine::addOverModel(const char* name, const char* description,
                                     Command chosen) {
   CLI::App* added = add(name, description, chosen);
-  added->add_option("MODEL.json", arguments.model, "the model document")
-      ->required();
   added
-      ->add_option("--keywords", arguments.ownKeywords,
-                   "folder of further word lists; may be repeated")
-      ->allow_extra_args(false);
+      ->add_option("MODEL", arguments.model,
+                   "the model document, or a model file (.slx)")
+      ->required();
   added->add_option("--lock", arguments.lock, "file of the names to keep");
   added->add_option("--profile", arguments.profile,
                     "folder for reports on what took how long");
-  added->add_flag("--quiet", arguments.quiet, "no progress, no summary");
+  addImportOptions(*added);
   return added;
 }
 
 void CommandLine::addImportOptions(CLI::App& added) {
-  added.add_option("--rules", arguments.rules, "file of naming rules");
-  added.add_option("--dictionary", arguments.dictionaries,
-                   "data dictionary (.sldd); may be repeated");
-  added.add_option("--path", arguments.searchPath,
-                   "folder of referenced models and libraries; may be "
-                   "repeated");
-  added.add_option("--keywords", arguments.keywords,
-                   "folder of the word lists that the rules name");
-  added.add_flag("--quiet", arguments.quiet, "no notes");
+  added.add_option("--rules", arguments.rules,
+                   "file of naming rules, for a model file");
+  const auto addList = [&](const char* name, std::vector<std::string>& list,
+                           const char* description) {
+    added.add_option(name, list, description)->allow_extra_args(false);
+  };
+  addList("--dictionary", arguments.dictionaries,
+          "data dictionary (.sldd); may be repeated");
+  addList("--path", arguments.searchPath,
+          "folder of referenced models and libraries; may be repeated");
+  addList("--keywords", arguments.ownKeywords,
+          "folder of further word lists; may be repeated");
+  added.add_flag("--quiet", arguments.quiet, "no progress, notes, summary");
 }
 
 CommandLine::CommandLine() {

@@ -97,8 +97,10 @@ void HX_WriteTable(std::ostream& out, const HX_RunResult& result) {
 void HX_WriteExplanation(std::ostream& out, const HX_FormedName& name,
                          const std::vector<HX_ExplainedMacro>& steps) {
   out << "name      " << name.wanted->id << "\ntemplate  "
-      << orDash(*name.wanted->nameTemplate->shown) << "\nsource    "
-      << orDash(name.sourcePath()) << "\n\n";
+      << orDash(*name.wanted->nameTemplate->shown) << '\n';
+  if (name.wanted->rule != nullptr)
+    out << "rule      " << *name.wanted->rule << '\n';
+  out << "source    " << orDash(name.sourcePath()) << "\n\n";
   std::vector<Row> rows{{"macro", "gives", "which is"}};
   for (const HX_ExplainedMacro& step : steps)
     rows.push_back({step.macro, orDash(step.value), step.origin});

@@ -164,9 +164,9 @@ TEST_F(ArchiveTest, StatesAreLimitedInDepth) {
     return parts;
   };
   m_Request.limits.depth = 30;
-  EXPECT_THAT(importParts(chart(30)).document, StartsWith("{"));
-  EXPECT_EQ("m.slx: states nested deeper than 30 in c",
-            importParts(chart(31)).document);
+  EXPECT_THAT(importParts(chart(29)).document, StartsWith("{"));
+  EXPECT_EQ("m.slx: systems and states nested deeper than 30 in c",
+            importParts(chart(30)).document);
 }
 
 TEST_F(ArchiveTest, BrokenPartsAreRefusedWithTheirPlace) {

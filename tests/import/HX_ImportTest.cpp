@@ -13,7 +13,7 @@ HX_ImportTest::HX_ImportTest()
                testing::UnitTest::GetInstance()->current_test_info()->name()) {
   fs::remove_all(m_Folder);
   fs::create_directories(m_Folder);
-  m_Request.keywordFolder = HX_KEYWORD_FOLDER;
+  m_Request.keywordFolders = {HX_KEYWORD_FOLDER};
 }
 
 fs::path HX_ImportTest::pack(const std::string& file, const Parts& parts,

@@ -127,6 +127,10 @@ TEST_F(ModelImportTest, DictionaryThatIsAbsentIsNamedOnce) {
       pack("far/climate_types.sldd", partsOf("climate_types"))};
   EXPECT_THAT(import(file).notes,
               Not(testing::Contains(HasSubstr("'climate_types"))));
+  const auto own = pack("climate_types.sldd", partsOf("climate_types"));
+  m_Request.dictionaries = {own};  // also named by the model: read once
+  EXPECT_THAT(import(file).notes,
+              Not(testing::Contains(HasSubstr("is not used"))));
   m_Request.dictionaries.push_back(
       pack("far/more.sldd", partsOf("climate_types")));
   EXPECT_THAT(import(file).notes,

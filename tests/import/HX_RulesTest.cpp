@@ -63,7 +63,7 @@ TEST_F(RulesTest, FaultsAreToldWithTheirPlace) {
       {"{\"rules\": [{" + rule + R"(, "labelled": 1}]})",
        R"(r.json: /rules/0/labelled: expected type "boolean")"},
       {R"({"rules": [], "keywords": ["none"]})",
-       "none.txt: expected a word list"},
+       "the word list 'none' of the naming rules is in no folder"},
   };
   for (const auto& [text, expected] : rows)
     EXPECT_THAT(refusal(text), HasSubstr(expected)) << text;
