@@ -393,6 +393,13 @@ bool HX_NameLock::note(const Entry& entry) {
   });
 }
 
+void HX_NameLock::noteKept(int position) {
+  Items::Item& item = m_pItems->item(position);
+  if (item.change == eGone)
+    item.change = item.entry.retiredRuns >= 0 ? eRevived : eKept;
+  item.entry.retiredRuns = -1;
+}
+
 void HX_NameLock::endRun(int retireRuns) {
   const auto isOver = [retireRuns](int& runs) {
     return retireRuns > 0 && ++runs >= retireRuns;

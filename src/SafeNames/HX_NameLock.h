@@ -112,6 +112,10 @@ class HX_UTILS_API HX_NameLock : public HX_Allocated {
   /// RETURNS: false, with nothing changed, for an empty item or without memory.
   bool note(const Entry& entry);
 
+  /// The same for an item that keeps name, wanted name, scope and linkage.
+  /// REQUIRES: the entry at \p position was not dropped.
+  void noteKept(int position);
+
   /// Ends a run: items without note() are retired.
   /// \param retireRuns  number of runs after which retired items and former
   ///                    names are dropped; 0 keeps them until prune(), and does

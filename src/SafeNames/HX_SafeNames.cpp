@@ -154,24 +154,29 @@ struct HX_SafeNames::Content : HX_Allocated {
 
   Conflict conflictOf(const KyCXString& text, const Request& request);
   Conflict reservedBy(const KyCXString& text, bool isAtFileScope) const;
-  Conflict takenBy(const Environment& environment, const KyCXString& text,
-                   int count, int position);
+  Conflict takenBy(const Environment& environment, int key,
+                   const KyCXString& text, int owner);
   Conflict conflictWith(const Holder& holder, const KyCXString& text) const;
-  bool place(Environment& environment, const KyCXString& text, int count,
+  bool place(Environment& environment, int key, const char* text,
              HxCSymbol* symbol, int lockPosition);
+  void noteInLock(const KyCXString& text, const KyCXString& wanted,
+                  const Request& request);
 
   unsigned int patterns() const {
     return reserved == nullptr ? 0 : reserved->patterns();
   }
   int variantLimit(bool isExternal) const;
-  int positionOf(const Request& request) const {
-    return lock == nullptr ? -1 : lock->find(request.item);
-  }
   int idOf(const KyCXString& text);
   int keyOf(const KyCXString& text, int count);
 
   const HX_ReservedNames* reserved = nullptr;
   HX_NameLock* lock = nullptr;
+  // By position in the lock: hold of the present name; null for none.
+  HX_PlainArray<Holder*> held;
+  int position = -1;          // of the current item in the lock
+  Holder* claimed = nullptr;  // hold that the current item takes
+  int checkedKey = 0;         // of the last text checked, in scopes
+  int checkedOuterKey = 0;    // among external names
   int internalCount = 0;
   int externalCount = 0;
   bool foldsCase = false;
@@ -278,22 +283,20 @@ int HX_SafeNames::Content::keyOf(const KyCXString& text, int count) {
 
 // Enters a name, or turns the hold of the item at \p lockPosition into the
 // name. RETURNS: false if the key stands for anything else.
-bool HX_SafeNames::Content::place(Environment& environment,
-                                  const KyCXString& text, int count,
-                                  HxCSymbol* symbol, int lockPosition) {
-  const int key = keyOf(text, count);
-  const char* const kept = texts.getString(idOf(text));
+bool HX_SafeNames::Content::place(Environment& environment, int key,
+                                  const char* text, HxCSymbol* symbol,
+                                  int lockPosition) {
   if (Holder* const holder = environment.lookupInScope(key)) {
     if (holder->lockPosition < 0 || holder->lockPosition != lockPosition)
       return false;
-    holder->text = kept;
+    holder->text = text;
     holder->symbol = symbol;
     holder->lockPosition = -1;
     return true;
   }
   auto* const holder = new Holder;
   if (holder == nullptr) throw std::bad_alloc();
-  holder->text = kept;
+  holder->text = text;
   holder->symbol = symbol;
   holder->lockPosition = -1;
   if (environment.defineKey(key, holder)) return true;
@@ -317,13 +320,12 @@ Conflict HX_SafeNames::Content::conflictWith(const Holder& holder,
   return found;
 }
 
-// A name held for the item at \p position is free for that item.
-Conflict HX_SafeNames::Content::takenBy(const Environment& environment,
-                                        const KyCXString& text, int count,
-                                        int position) {
-  const Holder* const holder = environment.lookupInEnv(keyOf(text, count));
+// A name held for the item at \p owner is free for that item.
+Conflict HX_SafeNames::Content::takenBy(const Environment& environment, int key,
+                                        const KyCXString& text, int owner) {
+  const Holder* const holder = environment.lookupInEnv(key);
   if (holder == nullptr) return {};
-  if (holder->lockPosition >= 0 && holder->lockPosition == position) return {};
+  if (holder->lockPosition >= 0 && holder->lockPosition == owner) return {};
   return conflictWith(*holder, text);
 }
 
@@ -346,26 +348,29 @@ Conflict HX_SafeNames::Content::reservedBy(const KyCXString& text,
                   HX_ReservedNames::patternName(reservation.pattern));
 }
 
+// Leaves the keys of \p text in checkedKey and checkedOuterKey.
 Conflict HX_SafeNames::Content::conflictOf(const KyCXString& text,
                                            const Request& request) {
   Conflict found = reservedBy(text, request.scope->isRoot);
   if (!found.isFree) return found;
-  const int position = positionOf(request);
-  found = takenBy(*request.scope->environment, text, internalCount, position);
-  if (found.isFree && request.isExternal)
-    found = takenBy(externals, text, externalCount, position);
-  return found;
+  checkedKey = keyOf(text, internalCount);
+  found = takenBy(*request.scope->environment, checkedKey, text, position);
+  if (!found.isFree || !request.isExternal) return found;
+  checkedOuterKey = keyOf(text, externalCount);
+  return takenBy(externals, checkedOuterKey, text, position);
 }
 
 bool HX_SafeNames::reserveName(const KyCXString& name, Scope* scope,
                                HxCSymbol* symbol) {
   if (m_pContent == nullptr) return false;
+  Content& content = *m_pContent;
   return HX_WithinMemory(false, [&] {
-    const Conflict found = m_pContent->takenBy(*scope->environment, name,
-                                               m_pContent->internalCount, -1);
-    return found.isFree &&
-           m_pContent->place(*scope->environment, name,
-                             m_pContent->internalCount, symbol, -1);
+    const int key = content.keyOf(name, content.internalCount);
+    if (!content.takenBy(*scope->environment, key, name, -1).isFree)
+      return false;
+    return content.place(*scope->environment, key,
+                         content.texts.getString(content.idOf(name)), symbol,
+                         -1);
   });
 }
 
@@ -384,19 +389,32 @@ bool HX_SafeNames::useLock(HX_NameLock* lock) {
 // Names of a lock may exclude names of the same lock after a change of the
 // scopes. The later name is not held, and the item gets a new name.
 void HX_SafeNames::Content::holdAll() {
+  // The text of the lock lives as long as the hold.
   const auto hold = [this](Environment& environment, const KyCXString& text,
-                           int count, int position) {
-    if (environment.lookupInEnv(keyOf(text, count)) != nullptr) return;
-    place(environment, text, count, nullptr, -1);
-    environment.lookupInScope(keyOf(text, count))->lockPosition = position;
+                           int count, const char* kept, int at) -> Holder* {
+    const int key = keyOf(text, count);
+    if (environment.lookupInEnv(key) != nullptr) return nullptr;
+    place(environment, key, kept, nullptr, -1);
+    Holder* const holder = environment.lookupInScope(key);
+    holder->lockPosition = at;
+    return holder;
   };
+  while (held.size() < static_cast<unsigned int>(lock->size()))
+    if (!held.append(nullptr)) throw std::bad_alloc();
+  const Scope* last = nullptr;
   lock->forEachHeldName([&](std::string_view name, std::string_view scopeName,
-                            bool isExternal, int position) {
-    Scope* const scope = findScope(scopeName);
+                            bool isExternal, int at) {
+    const Scope* const scope = last != nullptr && last->name == scopeName
+                                   ? last
+                                   : findScope(scopeName);
     if (scope == nullptr) return;
+    last = scope;
     const KyCXString text(name.data());
-    hold(*scope->environment, text, internalCount, position);
-    if (isExternal) hold(externals, text, externalCount, position);
+    Holder* const holder =
+        hold(*scope->environment, text, internalCount, name.data(), at);
+    if (name.data() == lock->entry(at).name.data())
+      held[static_cast<unsigned int>(at)] = holder;
+    if (isExternal) hold(externals, text, externalCount, name.data(), at);
   });
 }
 
@@ -422,23 +440,33 @@ void HX_SafeNames::Content::releaseAll() {
   });
 }
 
-// True if \p text has become the name of the lock.
+// True if \p text has become the name of the lock. A name that is held still is
+// free: nothing else can have been defined in the environment of the hold.
 bool HX_SafeNames::Content::takeLocked(KyCXString& text, bool mayChange,
                                        const Request& request,
                                        HX_SafeName& result) {
-  const int position = positionOf(request);
-  if (position < 0) return false;
+  if (position < 0 || held.size() <= static_cast<unsigned int>(position))
+    return false;
+  Holder* const holder = held[static_cast<unsigned int>(position)];
   const HX_NameLock::Entry& entry = lock->entry(position);
-  if (entry.wanted != text.cstring() || entry.scope != request.scope->name ||
+  if (holder == nullptr || holder->lockPosition != position ||
+      entry.wanted != text.cstring() || entry.scope != request.scope->name ||
       entry.isExternal != request.isExternal)
     return false;
-  const KyCXString locked(entry.name.data());
-  const bool isWanted = locked == text;
+  const bool isWanted = entry.name == entry.wanted;
+  const KyCXString locked = isWanted ? text : KyCXString(entry.name.data());
   const int limit = longestLength();
   if (!isWanted && (!mayChange || (limit > 0 && locked.length() > limit)))
     return false;
-  if (!conflictOf(locked, request).isFree) return false;
-  if (!isWanted) result.add(HX_SafeName::eLocked, locked);
+  if (!reservedBy(locked, request.scope->isRoot).isFree) return false;
+  if (request.isExternal) {
+    checkedOuterKey = keyOf(locked, externalCount);
+    if (!takenBy(externals, checkedOuterKey, locked, position).isFree)
+      return false;
+  }
+  claimed = holder;
+  if (isWanted) return true;
+  result.add(HX_SafeName::eLocked, locked);
   text = locked;
   return true;
 }
@@ -528,46 +556,64 @@ bool HX_SafeNames::Content::derive(KyCXString& text, const Request& request,
 void HX_SafeNames::Content::enter(const KyCXString& text,
                                   const KyCXString& wanted,
                                   const Request& request) {
-  const int position = positionOf(request);
   Environment& environment = *request.scope->environment;
-  // Keys first, because undoing must not need memory.
-  const int key = keyOf(text, internalCount);
-  const int externalKey = request.isExternal ? keyOf(text, externalCount) : 0;
-  const bool wasHeld = environment.containsInScope(key);
+  // The last check was about this text.
+  const bool isWhole = internalCount <= 0 && !foldsCase;
+  const int key = checkedKey;
+  const int outerKey = checkedOuterKey;
+  const bool wasHeld = claimed != nullptr || environment.containsInScope(key);
   const bool wasHeldOutside =
-      request.isExternal && externals.containsInScope(externalKey);
+      request.isExternal && externals.containsInScope(outerKey);
   bool isPlaced = false;
   bool isPlacedOutside = false;
-  const bool isDone = HX_WithinMemory(false, [&] {
-    isPlaced =
-        place(environment, text, internalCount, request.symbol, position);
-    if (request.isExternal)
-      isPlacedOutside =
-          place(externals, text, externalCount, request.symbol, position);
-    if (lock == nullptr || request.item.empty()) return true;
-    HX_NameLock::Entry entry;
-    entry.item = request.item;
-    entry.name = text.cstring();
-    entry.wanted = wanted.cstring();
-    entry.scope = request.scope->name;
-    entry.isExternal = request.isExternal;
-    return lock->note(entry);
+  const bool isDone = HX_WithinMemory([&] {
+    const char* const kept = claimed != nullptr
+                                 ? claimed->text
+                                 : texts.getString(isWhole ? key : idOf(text));
+    if (claimed != nullptr) {
+      claimed->symbol = request.symbol;
+      claimed->lockPosition = -1;
+    } else {
+      place(environment, key, kept, request.symbol, position);
+    }
+    isPlaced = true;
+    isPlacedOutside = request.isExternal && place(externals, outerKey, kept,
+                                                  request.symbol, position);
+    noteInLock(text, wanted, request);
   });
   if (isDone) return;
-  const auto takeBack = [position](Environment& from, int which, bool isHeld) {
-    Holder* const holder = from.lookupInScope(which);
+  const auto takeBack = [this](Environment& from, int which, bool isHeld,
+                               Holder* holder) {
+    if (holder == nullptr) holder = from.lookupInScope(which);
     holder->lockPosition = position;
     if (isHeld) return;
     from.removeKey(which);
     delete holder;
   };
-  if (isPlaced) takeBack(environment, key, wasHeld);
-  if (isPlacedOutside) takeBack(externals, externalKey, wasHeldOutside);
+  if (isPlaced) takeBack(environment, key, wasHeld, claimed);
+  if (isPlacedOutside) takeBack(externals, outerKey, wasHeldOutside, nullptr);
   throw std::bad_alloc();
+}
+
+// Throws std::bad_alloc, with the lock unchanged.
+void HX_SafeNames::Content::noteInLock(const KyCXString& text,
+                                       const KyCXString& wanted,
+                                       const Request& request) {
+  if (lock == nullptr || request.item.empty()) return;
+  if (claimed != nullptr) return lock->noteKept(position);
+  HX_NameLock::Entry entry;
+  entry.item = request.item;
+  entry.name = text.cstring();
+  entry.wanted = wanted.cstring();
+  entry.scope = request.scope->name;
+  entry.isExternal = request.isExternal;
+  if (!lock->note(entry)) throw std::bad_alloc();
 }
 
 bool HX_SafeNames::Content::define(HxCCIdentifier& id, const Request& request,
                                    HX_SafeName& result) {
+  position = lock == nullptr ? -1 : lock->find(request.item);
+  claimed = nullptr;
   id.activateActualName();
   const bool mayChange = id.getIdentifierChangeable(kActual);
   fit(id, mayChange, result);
