@@ -149,6 +149,9 @@ TEST_F(ArchiveTest, DepthAndNumberOfBlocksAreLimited) {
   }
   EXPECT_THAT(import(m_Folder / "d0.slx").document,
               HasSubstr("more than 10000 blocks"));
+  m_Request.limits.depth = 30;
+  EXPECT_THAT(import(m_Folder / "d0.slx").document,
+              HasSubstr(".slx: systems nested deeper than 30"));
 }
 
 TEST_F(ArchiveTest, StatesAreLimitedInDepth) {
