@@ -8,6 +8,8 @@ const HX_SimulinkTree* s_tree = nullptr;
 
 }  // namespace
 
+const double HX_SimulinkInterface::s_invalidHandle = -1.0;
+
 mxArray* HX_SimulinkInterface::getMxSlData(mxArray* object,
                                            const KyCXString& parameter) {
   if (s_tree == nullptr || object == nullptr) return nullptr;

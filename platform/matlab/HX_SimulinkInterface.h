@@ -16,7 +16,7 @@ class KyCXString;
 class HX_PLATFORM_API HX_SimulinkInterface {
  public:
   /// A handle that no block has.
-  static constexpr double s_invalidHandle = -1.0;
+  static const double s_invalidHandle;  // -1.0
 
   /// The value of a parameter of the block that \p object names, a handle or a
   /// path.

@@ -2,6 +2,10 @@
 
 #include <locale.h>
 
+#if defined(_WIN32)
+#include <intrin.h>
+#endif
+
 #include <algorithm>
 #include <csignal>
 #include <cstdio>
@@ -18,6 +22,26 @@ namespace {
 
 // Numbers are written with a decimal point in every locale of the process, as
 // long as an object of the class lives.
+#if defined(_WIN32)
+class PlainNumbers {
+ public:
+  PlainNumbers()
+      : m_OldMode(_configthreadlocale(_ENABLE_PER_THREAD_LOCALE)),
+        m_Old(setlocale(LC_NUMERIC, nullptr)) {
+    setlocale(LC_NUMERIC, "C");
+  }
+  PlainNumbers(const PlainNumbers&) = delete;
+  PlainNumbers& operator=(const PlainNumbers&) = delete;
+  ~PlainNumbers() {
+    setlocale(LC_NUMERIC, m_Old.c_str());
+    _configthreadlocale(m_OldMode);
+  }
+
+ private:
+  int m_OldMode;
+  std::string m_Old;
+};
+#else
 class PlainNumbers {
  public:
   PlainNumbers() {
@@ -31,6 +55,7 @@ class PlainNumbers {
  private:
   locale_t m_Old;
 };
+#endif
 
 std::string format(const char* text, std::va_list arguments) {
   const PlainNumbers plain;
@@ -120,4 +145,10 @@ int HX_DebugReport(const char* file, int line, const char* expression) {
   return HX_MessageHandler::instance().debugReport(file, line, expression);
 }
 
-void HX_DebugBreak() { std::raise(SIGTRAP); }
+void HX_DebugBreak() {
+#if defined(_WIN32)
+  __debugbreak();
+#else
+  std::raise(SIGTRAP);
+#endif
+}

@@ -12,10 +12,16 @@
 /// process, the load of the library counts as the start.
 HX_PLATFORM_API std::int64_t HX_ProcessClock();
 
-/// Ticks per second of the system's own high-resolution counter. A tick is 64
+#if defined(_WIN32)
+/// Ticks per second of the high-resolution counter of most systems. Code that
+/// divides by a constant frequency compares with this constant first.
+inline constexpr std::int64_t kSystemCounterFrequency = 10'000'000;
+#else
+/// Ticks per second of the high-resolution counter of the system. A tick is 64
 /// ns: nanoseconds become ticks by a shift, and an interval of six days times
 /// 1000000 still fits into 64 bits.
 inline constexpr std::int64_t kSystemCounterFrequency = 1'000'000'000 / 64;
+#endif
 
 /// Ticks per second of the high-resolution counter.
 /// RETURNS: 1; without a counter 0, with \p frequency untouched.

@@ -9,14 +9,12 @@
 #include <string>
 
 #include "Diagnostics/HX_TimingListener.h"
+#include "support/HX_Environment.h"
 #include "support/HX_TestFixture.h"
 
 class HX_FileFixture : public HX_TestFixture {
  protected:
-  HX_FileFixture() {
-    char name[] = "/tmp/hx_diagnostics_XXXXXX";
-    std::filesystem::current_path(mkdtemp(name));
-  }
+  HX_FileFixture() { std::filesystem::current_path(HX_MakeTemporaryFolder()); }
   ~HX_FileFixture() override {
     const auto directory = std::filesystem::current_path();
     std::filesystem::current_path(m_Previous);

@@ -20,9 +20,14 @@ struct TurkishNumbers : std::numpunct<char> {
 HX_ForeignLocale::HX_ForeignLocale()
     : m_Previous(std::locale::global(
           std::locale(std::locale::classic(), new TurkishNumbers))) {
+#if defined(_WIN32)
+  const char* const name = "Turkish_Turkey";
+#else
+  const char* const name = "tr_TR";
   setenv("LOCPATH", HX_LOCALES, 1);
-  if (std::setlocale(LC_ALL, "tr_TR") == nullptr)
-    throw std::runtime_error("no locale tr_TR in " HX_LOCALES);
+#endif
+  if (std::setlocale(LC_ALL, name) == nullptr)
+    throw std::runtime_error(std::string("no locale ") + name);
 }
 
 HX_ForeignLocale::~HX_ForeignLocale() { std::locale::global(m_Previous); }

@@ -1,16 +1,17 @@
-// Modules carry no version information on this system: the host names the
-// loaded modules, and the calls read the blocks of the host.
+// The modules that a host names, read from the blocks of the host; behind them
+// the modules of the system.
 
 #include <algorithm>
 #include <cstring>
-#include <filesystem>
-#include <system_error>
 
 #include "platform/HX_NeverDestroyed.h"
 #include "platform/os/HX_OsVersion.h"
+#include "platform/os/HX_SystemModules.h"
 #include "platform/os/HX_VersionResource.h"
 
 namespace {
+
+constexpr char kRootName[] = "VS_VERSION_INFO";
 
 struct Module {
   std::string path;
@@ -110,17 +111,17 @@ void HX_UnloadModule(const std::string& name) { modules().erase(name); }
 
 HX_ModuleHandle GetModuleHandleA(const char* name) {
   const auto found = modules().find(name);
-  return found == modules().end() ? nullptr : &found->second;
+  return found == modules().end() ? HX_FindSystemModule(name) : &found->second;
 }
 
 std::uint32_t GetModuleFileNameA(HX_ModuleHandle module, char* path,
                                  std::uint32_t size) {
   if (size == 0) return 0;
-  std::error_code error;
+  const Module* named = nullptr;
+  for (const auto& [name, candidate] : modules())
+    if (&candidate == module) named = &candidate;
   const std::string full =
-      module != nullptr
-          ? static_cast<const Module*>(module)->path
-          : std::filesystem::read_symlink("/proc/self/exe", error).string();
+      named != nullptr ? named->path : HX_SystemModulePath(module);
   const std::size_t length = std::min<std::size_t>(full.size(), size - 1);
   std::memcpy(path, full.data(), length);
   path[length] = 0;
@@ -130,13 +131,15 @@ std::uint32_t GetModuleFileNameA(HX_ModuleHandle module, char* path,
 std::uint32_t GetFileVersionInfoSizeA(const char* path, std::uint32_t* handle) {
   if (handle != nullptr) *handle = 0;
   const std::string* block = findBlock(path);
-  return block == nullptr ? 0 : static_cast<std::uint32_t>(block->size());
+  return block == nullptr ? HX_SystemVersionSize(path)
+                          : static_cast<std::uint32_t>(block->size());
 }
 
 int GetFileVersionInfoA(const char* path, std::uint32_t /*handle*/,
                         std::uint32_t size, void* block) {
   const std::string* source = findBlock(path);
-  if (source == nullptr || source->size() > size) return 0;
+  if (source == nullptr) return HX_ReadSystemVersion(path, size, block) ? 1 : 0;
+  if (source->size() > size) return 0;
   if (Node(source->data(), source->size()).size() != source->size()) return 0;
   std::memcpy(block, source->data(), source->size());
   return source->empty() ? 0 : 1;
@@ -148,6 +151,9 @@ int VerQueryValueA(const void* block, const char* path, void** value,
   std::uint16_t size = 0;
   std::memcpy(&size, start, sizeof size);
   Node node(start, size);
+  // The system's own blocks have names of 16-bit characters.
+  if (!node.isNamed(kRootName, sizeof kRootName - 1))
+    return HX_QuerySystemVersion(block, path, value, length) ? 1 : 0;
   while (node.isValid()) {
     while (*path == '\\') ++path;
     if (*path == 0) break;
