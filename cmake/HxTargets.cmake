@@ -6,7 +6,8 @@ function(hx_target_defaults target)
   set_target_properties(${target} PROPERTIES
     CXX_EXTENSIONS OFF
     CXX_VISIBILITY_PRESET hidden
-    VISIBILITY_INLINES_HIDDEN ON
+    # MinGW would not export inline functions, marked or not.
+    VISIBILITY_INLINES_HIDDEN $<NOT:$<BOOL:${WIN32}>>
     VERIFY_INTERFACE_HEADER_SETS ON)
   if(NOT MSVC)
     file(RELATIVE_PATH src_from_build ${CMAKE_BINARY_DIR} ${PROJECT_SOURCE_DIR}/src)

@@ -1,0 +1,15 @@
+# Builds for Windows with Debian's MinGW-w64; programs run in Wine.
+set(CMAKE_SYSTEM_NAME Windows)
+set(CMAKE_SYSTEM_PROCESSOR X86)
+set(machine i686-w64-mingw32)
+
+# GoogleTest wants std::mutex, which only the thread model "posix" has.
+set(CMAKE_C_COMPILER ${machine}-gcc-posix)
+set(CMAKE_CXX_COMPILER ${machine}-g++-posix)
+set(CMAKE_RC_COMPILER ${machine}-windres)
+
+set(CMAKE_FIND_ROOT_PATH /usr/${machine})
+set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
+set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
