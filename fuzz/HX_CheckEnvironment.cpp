@@ -4,6 +4,7 @@
 
 #include "SystemServices/HX_SystemCall.h"
 #include "fuzz/HX_Fuzz.h"
+#include "support/HX_Environment.h"
 
 namespace {
 
@@ -23,7 +24,7 @@ std::string plainStep(const std::string& text) {
 void HX_CheckEnvironment(HX_Bytes& bytes) {
   constexpr int kSteps = 20;
   for (const char* name : {"HX_A", "HX_B", "X"})
-    setenv(name, bytes.line().c_str(), 1);
+    HX_SetVariable(name, bytes.line().c_str());
   std::string plain = bytes.line().c_str();
   KyCXString text(plain.c_str());
   for (int i = 0; i < kSteps && plain.size() < 1000; ++i) {

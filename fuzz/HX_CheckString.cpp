@@ -91,10 +91,10 @@ struct PlainString : std::wstring {
     const int tails[] = {room, room / 2, 0};
     const int tail = room > 0 ? tails[position] : limit;
     if (room <= 0) marks = 0;
-    *this =
-        head(room - tail) +
-        std::wstring(static_cast<std::size_t>(marks), PlainString(fill)[0]) +
-        sub(length() - tail, length());
+    *this = head(room - tail) +
+            std::wstring(static_cast<std::size_t>(marks),
+                         PlainString(fill).front()) +
+            sub(length() - tail, length());
   }
 
  private:

@@ -1,7 +1,8 @@
-#include <stdlib.h>
+#if !defined(_WIN32)
 #include <sys/resource.h>
 #include <sys/syscall.h>
 #include <unistd.h>
+#endif
 
 #include <ctime>
 #include <fstream>
@@ -11,6 +12,7 @@
 #include "SystemServices/HX_SystemCall.h"
 #include "SystemServices/HX_SystemFileIo.h"
 #include "SystemServices/HX_SystemServiceEnv.h"
+#include "support/HX_Environment.h"
 #include "support/HX_ForeignLocale.h"
 #include "support/HX_HeapCount.h"
 #include "support/HX_RealTime.h"
@@ -34,7 +36,7 @@ TEST_F(SystemServicesTest, DateAndTimeAreThoseOfTheLocalZone) {
     char zone[32];
     std::snprintf(zone, sizeof zone, "HXT%c%d:%02d", minutes < 0 ? '+' : '-',
                   std::abs(minutes) / 60, std::abs(minutes) % 60);
-    setenv("TZ", zone, 1);
+    HX_SetVariable("TZ", zone);
     const std::time_t now = std::time(nullptr);
     const Text date(m_System.getStandardDateString());
     const Text time(m_System.getStandardTimeString());
@@ -48,7 +50,7 @@ TEST_F(SystemServicesTest, DateAndTimeAreThoseOfTheLocalZone) {
                 testing::AnyOfArray(std::vector<std::string>(
                     std::begin(expected), std::end(expected))));
   }
-  unsetenv("TZ");
+  HX_SetVariable("TZ", nullptr);
 }
 
 TEST_F(SystemServicesTest, TimeStampsAreMilliseconds) {
@@ -58,6 +60,7 @@ TEST_F(SystemServicesTest, TimeStampsAreMilliseconds) {
   });
 }
 
+#if !defined(_WIN32)  // the levels of Windows: tests/platform
 TEST_F(SystemServicesTest, PriorityIsThatOfTheCallingThreadAlone) {
   const auto nice = [] { return getpriority(PRIO_PROCESS, 0); };
   if (nice() != 0) GTEST_SKIP() << "the process has a priority of its own";
@@ -75,6 +78,7 @@ TEST_F(SystemServicesTest, PriorityIsThatOfTheCallingThreadAlone) {
   }).join();
   EXPECT_EQ(nice(), 0);
 }
+#endif
 
 TEST_F(SystemServicesTest, HolderCreatesOnDemandAndClosesItsFiles) {
   const auto content = [](const char* name) {
@@ -114,18 +118,25 @@ TEST_F(SystemServicesTest, HolderCreatesOnDemandAndClosesItsFiles) {
 }
 
 TEST_F(SystemServicesTest, MissingMemoryGivesNothing) {
+#if defined(_WIN32)
+  static constexpr char kNull[] = "NUL";
+#else
+  static constexpr char kNull[] = "/dev/null";
   const int descriptor = dup(0);
+#endif
   HX_WithoutEachHeapBlock("date, text and file", [] {
     HX_SystemCall system;
     HX_SystemFileIo io;
     std::FILE* file = nullptr;
     const Text date(system.getStandardDateString());
     const Text time(system.getStandardTimeString());
-    const bool isOpen = io.open("/dev/null", "w", file);
+    const bool isOpen = io.open(kNull, "w", file);
     return date != nullptr && time != nullptr && isOpen;
   });
+#if !defined(_WIN32)
   EXPECT_EQ(dup(0), descriptor + 1) << "a file stays open";
-  setenv("X", "", 1);
+#endif
+  HX_SetVariable("X", "y");
   const std::string before = "%X%" + std::string(50, 'x');
   KyCXString text(before.c_str());
   {
