@@ -25,8 +25,6 @@ struct PlainSide {
   static int type(int i) { return i; }
   static int symbol(int i) { return i; }
   void adaptSize(Id& id) const { id.adaptSize(model.limitsNames); }
-  static void append(Id& id, const Text& t) { id.addPostfix(t); }
-  static void appendChars(Id& id, const Text& t) { id.addPostfix(chars(t)); }
   Messages takeMessages() { return std::exchange(messages, {}); }
 
   const Model& model;
@@ -57,8 +55,6 @@ struct LibrarySide {
   HX_DataType* type(int i) { return entry(model.types, i); }
   HxCSymbol* symbol(int i) { return entry(model.symbols, i); }
   static void adaptSize(Id& id) { id.adaptSize(); }
-  static void append(Id& id, const Text& t) { id += kyText(t); }
-  void appendChars(Id& id, const Text& t) { id += chars(t); }
   Messages takeMessages() const { return model.takeMessages(); }
 
   LibraryModel model;
@@ -67,97 +63,129 @@ struct LibrarySide {
   Id ids[kIds];
 };
 
-enum Op {
-  eSetName,
-  eCreateName,
-  eSubstitute,
-  eSetSource,
-  eSetDdSource,
-  eSetIvBlock,
-  eSetLabel,
-  eSetX,
-  eActivateActual,
-  eActivateFormal,
-  eSetLevel,
-  eSetFlag,
-  eSetCooked,
-  eFileName,
-  eSymbolName,
-  eTimeName,
-  eTaskName,
-  eOtherName,
-  eMsgVarName,
-  eCopy,
-  eAssign,
-  eAssignText,
-  eAssignChars,
-  eOwnName,
-  ePrefix,
-  ePostfix,
-  eAppend,
-  eAppendChars,
-  eMakeC,
-  eAdaptSize,
-  eEqual,
-  eAddWord,
-  eVariableName,
-  eFileNameText,
-  eFileNameId,
-  eSuffix,
-  eCopyNames,
-  eOpCount
-};
-const char* const kOpNames[] = {"setName",
-                                "createNameFromForm",
-                                "substAllDollarZByValue",
-                                "setSourceRef",
-                                "setDdSourceRef",
-                                "setSourceIVBlock",
-                                "setSignalLabel",
-                                "setDollarXValue",
-                                "activateActualName",
-                                "activateFormalName",
-                                "setCookLevel",
-                                "set flag",
-                                "setCookedName",
-                                "handleFileNameMacro",
-                                "handleSymbolNameMacro",
-                                "replaceMultirateTimeName",
-                                "replaceMultirateTaskISRName",
-                                "replaceMultirate...Name",
-                                "replaceMultirateMsgVarName",
-                                "copy",
-                                "assign",
-                                "assign text",
-                                "assign characters",
-                                "setName of own name",
-                                "addPrefix",
-                                "addPostfix",
-                                "+=",
-                                "+= characters",
-                                "makeCIdentifier",
-                                "adaptSize",
-                                "==",
-                                "addToKeywordDict",
-                                "isStringValidCVariableName",
-                                "isFileNameValid text",
-                                "isFileNameValid",
-                                "appendSuffix",
-                                "copy names"};
-static_assert(std::size(kOpNames) == eOpCount);
-
+// Arguments of a call, drawn as the letters of the row say.
 struct Call {
-  int op = 0;
-  int id = 0, other = 0, third = 0;
-  Text text;
-  int number = 0, index = 0;
-  bool flag = false;
-  unsigned int retained = 0, provisional = 0;
-  double period = 0, offset = 0;
+  std::size_t row = 0;
+  int id = 0, other = 0, third = 0;  // o, h
+  bool flag = false;                 // f
+  Text text;                         // t template, m macro, w word
+  int number = 0;                    // n
+  int index = 0;  // r reference, i block, s symbol, T type, or kNone
+  unsigned int retained = 0, provisional = 0;  // b
+  double period = 0, offset = 0;               // p
 };
 
-Text templateFrom(Choices& c, const char* what) {
-  return c.text(what, 6,
+// A call of one operation. The result is a text.
+template <class S>
+struct Row {
+  const char* name;
+  const char* arguments;
+  std::string (*make)(S&, typename S::Id&, const Call&);
+};
+
+std::string told(bool result) { return result ? "true" : "false"; }
+
+// RETURNS: a row per operation, often used ones first.
+template <class S>
+const auto& rows() {
+  using Id = typename S::Id;
+  using C = Call;
+  using Tag = typename Id::HxENameTypeTag;
+  using Level = typename Id::HxECookLevelTag;
+  using Names = typename S::Names;
+  using Kind = typename Names::tagMacroKindEnum;
+  using Word = typename Names::tagHxEDictEntryType;
+#define HX_ROW(name, arguments, ...)                           \
+  {                                                            \
+    name, arguments,                                           \
+        []([[maybe_unused]] S& s, [[maybe_unused]] Id& id,     \
+           [[maybe_unused]] const C& c) -> std::string {       \
+          [[maybe_unused]] const auto text = s.text(c.text);   \
+          [[maybe_unused]] const Tag type = Tag(c.number % 3); \
+          __VA_ARGS__;                                         \
+        }                                                      \
+  }
+#define HX_DO(name, arguments, ...) \
+  HX_ROW(name, arguments, __VA_ARGS__; return "")
+  static const Row<S> kRows[] = {
+    HX_ROW("createNameFromForm", "Tbf",
+           return told(s.names.createNameFromForm(
+               id, s.type(c.index), c.retained, c.provisional, c.flag))),
+    HX_ROW("substAllDollarZByValue", "omn",
+           return told(s.names.substAllDollarZByValue(id, text, s.ids[c.other],
+                                                      Kind(c.number % 3)))),
+    HX_ROW("setName", "t", return told(id.setName(text))),
+    HX_DO("setSourceRef", "r", id.setSourceRef(s.ref(c.index))),
+    HX_DO("setDdSourceRef", "r", id.setDdSourceRef(s.ref(c.index))),
+    HX_DO("setSourceIVBlock", "i", id.setSourceIVBlock(s.ivBlock(c.index))),
+    HX_DO("setSignalLabel", "t", id.setSignalLabel(text)),
+    HX_DO("setDollarXValue", "t", id.setDollarXValue(text)),
+    HX_DO("activateActualName", "", id.activateActualName()),
+    HX_DO("activateFormalName", "", id.activateFormalName()),
+    HX_DO("setCookLevel", "n", id.setCookLevel(Level(c.number % 4))),
+    HX_DO("setIdentifierChangeable", "nf",
+          id.setIdentifierChangeable(c.flag, type)),
+    HX_DO("setDollarLUsed", "nf", id.setDollarLUsed(c.flag, type)),
+    HX_DO("setDollarEUsed", "nf", id.setDollarEUsed(c.flag, type)),
+    HX_DO("setDollarNUsed", "nf", id.setDollarNUsed(c.flag, type)),
+    HX_DO("setCookedName", "tn", id.setCookedName(text, type)),
+    HX_ROW("handleFileNameMacro", "f",
+           return told(s.names.handleFileNameMacro(id, c.flag))),
+    HX_DO("handleSymbolNameMacro", "s",
+          if (c.index != kNone)
+              s.names.handleSymbolNameMacro(id, s.symbol(c.index))),
+    HX_DO("replaceMultirateTimeName", "pf",
+          s.names.replaceMultirateTimeName(id, c.period, c.offset, c.flag)),
+    HX_DO("replaceMultirateTaskISRName", "ohf",
+          s.names.replaceMultirateTaskISRName(id, s.ids[c.other],
+                                              s.ids[c.third], c.flag)),
+    HX_DO("replaceMultirateObjName", "o",
+          s.names.replaceMultirateObjName(id, s.ids[c.other])),
+    HX_DO("replaceMultirateEventName", "o",
+          s.names.replaceMultirateEventName(id, s.ids[c.other])),
+    HX_DO("replaceMultirateISRName", "o",
+          s.names.replaceMultirateISRName(id, s.ids[c.other])),
+    HX_DO("replaceMultirateMsgName", "o",
+          s.names.replaceMultirateMsgName(id, s.ids[c.other])),
+    HX_DO("replaceMultirateCtrName", "o",
+          s.names.replaceMultirateCtrName(id, s.ids[c.other])),
+    HX_DO("replaceMultirateMsgVarName", "t",
+          s.names.replaceMultirateMsgVarName(id, text)),
+    HX_DO("copy", "o", id = Id(s.ids[c.other])),
+    HX_DO("assign", "o", id = s.ids[c.other]),
+    HX_DO("assign text", "t", id = text),
+    HX_DO("assign characters", "t", id = s.chars(c.text)),
+    HX_ROW("setName of raw name", "n",
+           return told(id.setName(id.getRawName(type)))),
+    HX_ROW("setName of cooked name", "n",
+           return told(id.setName(id.getCookedName(type)))),
+    HX_DO("addPrefix", "t", id.addPrefix(text)),
+    HX_DO("addPostfix", "t", id.addPostfix(text)),
+    HX_DO("+=", "t", id += text),
+    HX_DO("+= characters", "t", id += s.chars(c.text)),
+    HX_DO("+= own name", "n", id += id.getRawName(type)),
+    HX_DO("makeCIdentifier", "", id.makeCIdentifier()),
+    HX_DO("adaptSize", "", s.adaptSize(id)),
+    HX_ROW("==", "o", return told(id == s.ids[c.other])),
+    HX_DO("addToKeywordDict", "wn",
+          s.names.addToKeywordDict(text, Word(c.number % 3))),
+    HX_ROW("isStringValidCVariableName", "w",
+           return told(s.names.isStringValidCVariableName(text))),
+    HX_ROW("isFileNameValid", "w", auto name = text;
+           return told(s.names.isFileNameValid(name))),
+    HX_ROW("isFileNameValid of identifier", "",
+           return told(s.names.isFileNameValid(id))),
+    HX_ROW("appendSuffix", "tn", auto name = text;
+           s.names.appendSuffix(name, c.number * c.number);
+           return shown(s.plainText(name)))
+  };
+#undef HX_DO
+#undef HX_ROW
+  return kRows;
+}
+
+Text templateFrom(Choices& c) {
+  return c.text("text", 6,
                 {u"x",
                  u"_",
                  u"$B",
@@ -231,204 +259,33 @@ double secondsFrom(Choices& c, const char* what) {
                               1.5, 2147.4836475});
 }
 
-bool usesOther(int op) {
-  return op == eSubstitute || op == eTaskName || op == eOtherName ||
-         op == eCopy || op == eAssign || op == eEqual;
-}
-
-Call callFrom(Choices& c, const Model& model, int op, int id) {
-  Call call;
-  call.op = op;
-  c.tell(std::string("\n  ") + kOpNames[op]);
-  call.id = id;
-  if (id != 0) c.tell(" id=" + std::to_string(id));
-  call.other = usesOther(op) ? c.below("other", kIds) : id;
-  if (op == eTaskName) call.third = c.below("third", kIds);
-  call.flag = c.flag("flag");
-  switch (call.op) {
-    case eSubstitute:
-      call.number = c.below("kind", 3);
-      call.text = c.text(
-          "macro", 1,
-          {u"E", u"e", u"N", u"n", u"L", u"l", u"x", u"X", u"B", u"(Task)",
-           u"(tASK)", u"Task", u"R", u"$", u"E(", u"\u0416", u"t"});
-      break;
-    case eCreateName:
-      call.index = c.index("type", model.types.size());
-      call.retained = bitsFrom(c, "retained");
-      call.provisional = bitsFrom(c, "provisional");
-      break;
-    case eSetSource:
-    case eSetDdSource:
-      call.index = c.index("ref", model.refs.size());
-      break;
-    case eSetIvBlock:
-      call.index = c.index("ivBlock", model.ivBlocks.size());
-      break;
-    case eSymbolName:
-      call.index = c.index("symbol", model.symbols.size());
-      break;
-    case eTimeName:
-      call.period = secondsFrom(c, "period");
-      call.offset = secondsFrom(c, "offset") * c.of("sign", {1.0, -1.0});
-      break;
-    case eSuffix:
-      call.number = c.of("index", {0, 25, 26, 27, 701, 702, 18278, 475253});
-      call.text = templateFrom(c, "text");
-      break;
-    case eVariableName:
-    case eAddWord:
-    case eFileNameText:
-      call.number = c.below("kind", 3);
-      call.text = c.text("word", 2,
-                         {u"int", u"a", u"UInt8", u"1", u"-", u" ", u"while",
-                          u"_", u"\u0416"});
-      break;
-    default:
-      call.number = c.below("number", 12);
-      call.text = templateFrom(c, "text");
-  }
-  return call;
-}
-
-// Makes the call. RETURNS: the result as text.
-template <class Side>
-std::string resultOf(Side& side, const Call& call) {
-  using Id = typename Side::Id;
-  using Names = typename Side::Names;
-  Id& id = side.ids[call.id];
-  Id& other = side.ids[call.other];
-  Names& names = side.names;
-  const auto text = side.text(call.text);
-  const auto type = static_cast<typename Id::HxENameTypeTag>(call.number % 3);
-  const auto yes = [](bool result) { return result ? "true" : "false"; };
-  switch (call.op) {
-    case eSetName:
-      return yes(id.setName(text));
-    case eCreateName:
-      return yes(names.createNameFromForm(id, side.type(call.index),
-                                          call.retained, call.provisional,
-                                          call.flag));
-    case eSubstitute:
-      return yes(names.substAllDollarZByValue(
-          id, text, other,
-          static_cast<typename Names::tagMacroKindEnum>(call.number)));
-    case eSetSource:
-      id.setSourceRef(side.ref(call.index));
-      break;
-    case eSetDdSource:
-      id.setDdSourceRef(side.ref(call.index));
-      break;
-    case eSetIvBlock:
-      id.setSourceIVBlock(side.ivBlock(call.index));
-      break;
-    case eSetLabel:
-      id.setSignalLabel(text);
-      break;
-    case eSetX:
-      id.setDollarXValue(text);
-      break;
-    case eActivateActual:
-      id.activateActualName();
-      break;
-    case eActivateFormal:
-      id.activateFormalName();
-      break;
-    case eSetLevel:
-      id.setCookLevel(
-          static_cast<typename Id::HxECookLevelTag>(call.number % 4));
-      break;
-    case eSetFlag:
-      if (call.number / 3 == 0) id.setIdentifierChangeable(call.flag, type);
-      if (call.number / 3 == 1) id.setDollarLUsed(call.flag, type);
-      if (call.number / 3 == 2) id.setDollarEUsed(call.flag, type);
-      if (call.number / 3 == 3) id.setDollarNUsed(call.flag, type);
-      break;
-    case eSetCooked:
-      id.setCookedName(text, type);
-      break;
-    case eFileName:
-      return yes(names.handleFileNameMacro(id, call.flag));
-    case eSymbolName:
-      if (call.index != kNone)
-        names.handleSymbolNameMacro(id, side.symbol(call.index));
-      break;
-    case eTimeName:
-      names.replaceMultirateTimeName(id, call.period, call.offset, call.flag);
-      break;
-    case eTaskName:
-      names.replaceMultirateTaskISRName(id, other, side.ids[call.third],
-                                        call.flag);
-      break;
-    case eOtherName:
-      if (call.number % 5 == 0) names.replaceMultirateObjName(id, other);
-      if (call.number % 5 == 1) names.replaceMultirateEventName(id, other);
-      if (call.number % 5 == 2) names.replaceMultirateISRName(id, other);
-      if (call.number % 5 == 3) names.replaceMultirateMsgName(id, other);
-      if (call.number % 5 == 4) names.replaceMultirateCtrName(id, other);
-      break;
-    case eMsgVarName:
-      names.replaceMultirateMsgVarName(id, text);
-      break;
-    case eCopy:
-      id = Id(other);
-      break;
-    case eAssign:
-      id = other;
-      break;
-    case eAssignText:
-      id = text;
-      break;
-    case eAssignChars:
-      id = side.chars(call.text);
-      break;
-    case eOwnName:
-      return yes(
-          id.setName(call.flag ? id.getCookedName(type) : id.getRawName(type)));
-    case ePrefix:
-      id.addPrefix(text);
-      break;
-    case ePostfix:
-      id.addPostfix(text);
-      break;
-    case eAppend:
-      side.append(id, call.text);
-      break;
-    case eAppendChars:
-      side.appendChars(id, call.text);
-      break;
-    case eMakeC:
-      id.makeCIdentifier();
-      break;
-    case eAdaptSize:
-      side.adaptSize(id);
-      break;
-    case eEqual:
-      return yes(id == other);
-    case eAddWord:
-      names.addToKeywordDict(
-          text,
-          static_cast<typename Names::tagHxEDictEntryType>(call.number % 3));
-      break;
-    case eVariableName:
-      return yes(names.isStringValidCVariableName(text));
-    case eFileNameText: {
-      auto name = text;
-      return yes(names.isFileNameValid(name));
-    }
-    case eFileNameId:
-      return yes(names.isFileNameValid(id));
-    case eSuffix: {
-      auto name = text;
-      names.appendSuffix(name, call.number);
-      return shown(side.plainText(name));
-    }
-    default: {
-      Names copy(names);
-      (void)copy;
-    }
-  }
-  return "";
+void drawArgument(Choices& c, const Model& m, char argument, Call& call) {
+  const auto index = [&](std::size_t count) {
+    call.index = c.index("index", count);
+  };
+  if (argument == 'o') call.other = c.below("other", kIds);
+  if (argument == 'h') call.third = c.below("third", kIds);
+  if (argument == 'f') call.flag = c.flag("flag");
+  if (argument == 't') call.text = templateFrom(c);
+  if (argument == 'm')
+    call.text =
+        c.text("macro", 1,
+               {u"E", u"e", u"N", u"n", u"L", u"l", u"x", u"X", u"B", u"(Task)",
+                u"(tASK)", u"Task", u"R", u"$", u"E(", u"\u0416", u"t"});
+  if (argument == 'w')
+    call.text = c.text(
+        "word", 2,
+        {u"int", u"a", u"UInt8", u"1", u"-", u" ", u"while", u"_", u"\u0416"});
+  if (argument == 'n') call.number = c.byte();
+  if (argument == 'r') index(m.refs.size());
+  if (argument == 'i') index(m.ivBlocks.size());
+  if (argument == 's') index(m.symbols.size());
+  if (argument == 'T') index(m.types.size());
+  if (argument == 'b') call.retained = bitsFrom(c, "retained");
+  if (argument == 'b') call.provisional = bitsFrom(c, "provisional");
+  if (argument == 'p') call.period = secondsFrom(c, "period");
+  if (argument == 'p')
+    call.offset = secondsFrom(c, "offset") * c.of("sign", {1.0, -1.0});
 }
 
 // All fields; a flag as the answer of the getter and as stored.
@@ -460,15 +317,16 @@ std::string stateOf(Side& side, typename Side::Id& id) {
          std::to_string(side.index(id.getSourceIVBlock()));
 }
 
-// A line per call: result, identifiers of the call, messages.
+// A text per call: result, identifiers of the call, messages.
 template <class Side>
 std::vector<std::string> answersOf(Side& side, const std::vector<Call>& calls) {
   std::vector<std::string> answers;
   side.names.boot();
   for (const Call& call : calls) {
-    std::string answer = resultOf(side, call);
-    answer += "\n   id" + stateOf(side, side.ids[call.id]);
-    if (call.other != call.id)
+    const Row<Side>& row = rows<Side>()[call.row];
+    std::string answer = row.make(side, side.ids[call.id], call) + "\n   id" +
+                         stateOf(side, side.ids[call.id]);
+    if (row.arguments[0] == 'o')
       answer += "\n   other" + stateOf(side, side.ids[call.other]);
     for (const std::string& message : side.takeMessages())
       answer += "\n   " + message;
@@ -485,19 +343,26 @@ std::string differenceOfNames(const std::string& bytes, std::string* log) {
   std::vector<Call> calls;
   std::vector<std::string> described;
   choices.tell("\ncalls:");
-  const auto add = [&](int op, int id) {
-    calls.push_back(callFrom(choices, model, op, id));
-    described.push_back(std::to_string(calls.size()) + " " + kOpNames[op]);
+  const auto add = [&](std::size_t row, int id) {
+    const Row<PlainSide>& operation = rows<PlainSide>()[row];
+    described.push_back("\n  " + std::to_string(calls.size() + 1) + " " +
+                        operation.name + " of " + std::to_string(id));
+    choices.tell(described.back());
+    calls.emplace_back();
+    calls.back().row = row;
+    calls.back().id = calls.back().other = id;
+    for (const char* argument = operation.arguments; *argument; ++argument)
+      drawArgument(choices, model, *argument, calls.back());
   };
-  // First identifiers with a template and references, then any calls: mostly
+  // First identifiers with template and references, then any calls, mostly
   // expansions and substitutions.
+  const std::size_t kSetters = 9, kRows = std::size(rows<PlainSide>());
   for (int id = 0; id < 2; ++id)
-    for (const int op : {eSetName, eSetSource, eSetDdSource, eSetIvBlock,
-                         eSetLabel, eSetX, eActivateActual})
-      if (choices.byte() % 4 > (op > eSetSource ? 2 : 0)) add(op, id);
+    for (std::size_t row = 2; row < kSetters; ++row)
+      if (choices.byte() % 4 > (row > 3 ? 2 : 0)) add(row, id);
   while (calls.size() < 16 && !choices.isEmpty()) {
-    const int op = choices.byte() % (2 * eOpCount);
-    add(op < eOpCount ? op : 1 + op % 2, choices.byte() % kIds);
+    const auto row = static_cast<std::size_t>(choices.byte()) % (2 * kRows);
+    add(row < kRows ? row : row % 2, choices.byte() % kIds);
   }
   LibrarySide library(model);
   PlainSide plain(model);

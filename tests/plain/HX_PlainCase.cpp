@@ -383,7 +383,7 @@ std::string firstDifference(const std::vector<std::string>& calls,
                             const std::vector<std::string>& plain) {
   for (std::size_t i = 0; i < calls.size(); ++i)
     if (library[i] != plain[i])
-      return "call " + calls[i] + "\nlibrary: " + library[i] +
+      return "differs:" + calls[i] + "\nlibrary: " + library[i] +
              "\nplain:   " + plain[i];
   return "";
 }

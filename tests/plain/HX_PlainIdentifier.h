@@ -40,6 +40,10 @@ class Identifier {
   void addPostfix(const Text& postfix) {
     for (Text* text : texts()) *text += postfix;
   }
+  Identifier& operator+=(const Text& given) {
+    addPostfix(Text(given));  // may be a name of this identifier
+    return *this;
+  }
   void makeCIdentifier() {
     m_Actual.cooked = cIdentifier(m_Actual.cooked);
     m_Formal.cooked = cIdentifier(m_Formal.cooked);
