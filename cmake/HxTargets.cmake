@@ -3,11 +3,14 @@
 # Language, visibility, warnings and exact floating point for one target.
 function(hx_target_defaults target)
   target_compile_features(${target} PUBLIC cxx_std_20)
+  set(hide_inlines ON)
+  if(WIN32)
+    set(hide_inlines OFF)  # MinGW would export no inline function at all
+  endif()
   set_target_properties(${target} PROPERTIES
     CXX_EXTENSIONS OFF
     CXX_VISIBILITY_PRESET hidden
-    # MinGW would not export inline functions, marked or not.
-    VISIBILITY_INLINES_HIDDEN $<NOT:$<BOOL:${WIN32}>>
+    VISIBILITY_INLINES_HIDDEN ${hide_inlines}
     VERIFY_INTERFACE_HEADER_SETS ON)
   if(NOT MSVC)
     file(RELATIVE_PATH src_from_build ${CMAKE_BINARY_DIR} ${PROJECT_SOURCE_DIR}/src)
