@@ -2,12 +2,16 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <iterator>
+#include <cstring>
+#include <set>
+#include <string_view>
 #include <system_error>
 
 namespace fs = std::filesystem;
 
 namespace {
+
+constexpr std::string_view kTemporary = ".hx_codegen-";
 
 void stopAfterSignal() {
   if (HX_DelayedSignals::isEndRequested()) throw HX_OutputError("interrupted");
@@ -17,7 +21,8 @@ void stopAfterSignal() {
 // folder.
 std::string temporaryName() {
   static int s_Number = 0;
-  return ".hx_codegen-" + HX_ProcessNumber() + "-" + std::to_string(++s_Number);
+  return std::string(kTemporary) + HX_ProcessNumber() + "-" +
+         std::to_string(++s_Number);
 }
 
 [[noreturn]] void fail(const fs::path& path, const std::error_code& error,
@@ -31,12 +36,21 @@ void require(bool isDone, const fs::path& path) {
 }
 
 bool haveSameContent(const fs::path& a, const fs::path& b) {
+  constexpr std::streamsize kPart = 65536;
   std::error_code error;
   if (fs::file_size(a, error) != fs::file_size(b, error) || error) return false;
   std::ifstream first(a, std::ios::binary);
   std::ifstream second(b, std::ios::binary);
-  return std::equal(std::istreambuf_iterator<char>(first), {},
-                    std::istreambuf_iterator<char>(second), {});
+  std::vector<char> parts(2 * kPart);
+  char* const other = parts.data() + kPart;
+  while (first.read(parts.data(), kPart), first.gcount() > 0) {
+    second.read(other, kPart);
+    if (second.gcount() != first.gcount() ||
+        std::memcmp(parts.data(), other,
+                    static_cast<std::size_t>(first.gcount())) != 0)
+      return false;
+  }
+  return true;
 }
 
 }  // namespace
@@ -59,14 +73,37 @@ void HX_Output::makeFolders() {
   for (fs::path path = m_Folder; !fs::exists(path, error);
        path = path.parent_path())
     m_MadeFolders.push_back(path);
-  fs::create_directories(m_New, error);
+  fs::create_directories(m_Folder, error);
+  if (!error) takeLock();
+  if (!error) fs::create_directories(m_New, error);
   if (!error) fs::create_directory(m_Old, error);
   if (error) fail(m_Folder, error);
+  m_HasFolders = true;
+}
+
+// The temporary folder of the other process tells its number.
+void HX_Output::takeLock() {
+  if (m_Lock.take(m_Folder)) return;
+  std::string holder = "another process";
+  std::error_code error;
+  for (const auto& entry : fs::directory_iterator(m_Folder, error)) {
+    const std::string name = entry.path().filename().string();
+    if (!name.starts_with(kTemporary)) continue;
+    const std::string number = name.substr(kTemporary.size());
+    holder = "process " + number.substr(0, number.find('-'));
+  }
+  throw HX_OutputError(m_Folder.string() + ": cannot be written: " + holder +
+                       " writes into the folder");
+}
+
+fs::path HX_Output::place() {
+  if (!m_HasFolders) makeFolders();
+  return fs::absolute(m_New);
 }
 
 std::ostream& HX_Output::open(const std::string& name) {
   stopAfterSignal();
-  if (m_Files.empty()) makeFolders();
+  if (!m_HasFolders) makeFolders();
   std::ofstream& file = m_Files[name];
   file.open(m_New / name, std::ios::binary);
   require(file.is_open(), m_Folder / name);
@@ -78,7 +115,11 @@ std::size_t HX_Output::finish() {
     file.close();
     require(file.good(), m_Folder / name);
   }
-  for (const auto& [name, file] : m_Files) {
+  if (!m_HasFolders) return 0;
+  std::set<std::string> names;
+  for (const auto& entry : fs::directory_iterator(m_New))
+    names.insert(entry.path().filename().string());
+  for (const std::string& name : names) {
     if (fs::is_directory(m_Folder / name))
       fail(m_Folder / name, std::make_error_code(std::errc::is_a_directory));
     if (!haveSameContent(m_New / name, m_Folder / name))
@@ -120,4 +161,9 @@ void HX_Output::commit() {
     fail(m_Folder / m_Changed[i], error,
          m_KeepsOld ? "; old files are in " + m_Old.string() : "");
   }
+}
+
+void HX_Output::undo() {
+  for (const std::string& name : m_Changed) putBack(name, true);
+  m_Changed.clear();
 }

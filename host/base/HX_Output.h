@@ -30,6 +30,9 @@ class HX_OutputError : public std::runtime_error {
 /// back, and new folders are gone. Old files that cannot be put back stay in
 /// the folder that the error names.
 ///
+/// One process at a time writes into a folder; the error of a second process
+/// names the first.
+///
 /// SIGHUP, SIGINT and SIGTERM end the program after the destruction.
 class HX_Output {
  public:
@@ -48,9 +51,16 @@ class HX_Output {
 
   /// Puts the files in their places.
   void commit();
+  /// Takes a commit back.
+  void undo();
+
+  /// The folder of the new files until finish(), for writers that open files on
+  /// their own.
+  std::filesystem::path place();
 
  private:
   void makeFolders();
+  void takeLock();
   std::error_code replace(const std::string& name);
   void putBack(const std::string& name, bool isPlaced);
 
@@ -61,6 +71,8 @@ class HX_Output {
   const std::filesystem::path m_New;
   const std::filesystem::path m_Old;
   std::vector<std::filesystem::path> m_MadeFolders;  // inner before outer
+  HX_FolderLock m_Lock;
+  bool m_HasFolders = false;
   std::map<std::string, std::ofstream> m_Files;
   std::vector<std::string> m_Changed;
   bool m_KeepsOld = false;  // m_Old has the only copy of a file

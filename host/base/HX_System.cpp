@@ -1,12 +1,15 @@
 #include "host/base/HX_System.h"
 
 #include <fcntl.h>
+#include <sys/file.h>
 #include <unistd.h>
 
+#include <cerrno>
 #include <csignal>
 #include <cstdlib>
 #include <cstring>
 #include <iterator>
+#include <map>
 #include <new>
 
 namespace fs = std::filesystem;
@@ -18,8 +21,15 @@ constexpr int kEndSignalCount = static_cast<int>(std::size(kEndSignals));
 
 struct sigaction s_Before[kEndSignalCount];
 volatile std::sig_atomic_t s_Waiting = 0;  // last delayed signal
+int s_SignalUsers = 0;                     // objects of HX_DelayedSignals
 void* s_MemoryKept = nullptr;
 bool s_DidMemoryEnd = false;
+
+struct HeldFolder {
+  int file;
+  int count;  // of HX_FolderLock
+};
+std::map<std::string, HeldFolder> s_HeldFolders;  // by canonical path
 
 }  // namespace
 
@@ -62,7 +72,38 @@ fs::path HX_ProgramFolder() {
 
 std::string HX_ProcessNumber() { return std::to_string(getpid()); }
 
+HX_FolderLock::~HX_FolderLock() {
+  if (m_Folder.empty()) return;
+  const auto held = s_HeldFolders.find(m_Folder);
+  if (--held->second.count > 0) return;
+  close(held->second.file);
+  s_HeldFolders.erase(held);
+}
+
+bool HX_FolderLock::take(const fs::path& folder) {
+  std::error_code error;
+  const std::string name = fs::canonical(folder, error).string();
+  if (error) return true;  // opening a file will tell
+  const auto known = s_HeldFolders.find(name);
+  if (known != s_HeldFolders.end()) {
+    ++known->second.count;
+    m_Folder = name;
+    return true;
+  }
+  const int file = open(name.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+  if (file < 0) return true;
+  if (flock(file, LOCK_EX | LOCK_NB) != 0) {
+    const bool isHeld = errno == EWOULDBLOCK;
+    close(file);
+    return !isHeld;
+  }
+  s_HeldFolders[name] = {file, 1};
+  m_Folder = name;
+  return true;
+}
+
 HX_DelayedSignals::HX_DelayedSignals() {
+  if (s_SignalUsers++ > 0) return;
   struct sigaction note = {};
   note.sa_handler = [](int signal) { s_Waiting = signal; };
   for (int i = 0; i < kEndSignalCount; ++i) {
@@ -73,6 +114,7 @@ HX_DelayedSignals::HX_DelayedSignals() {
 }
 
 HX_DelayedSignals::~HX_DelayedSignals() {
+  if (--s_SignalUsers > 0) return;
   for (int i = 0; i < kEndSignalCount; ++i)
     sigaction(kEndSignals[i], &s_Before[i], nullptr);
   if (s_Waiting != 0) std::raise(s_Waiting);

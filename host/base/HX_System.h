@@ -31,15 +31,31 @@ std::filesystem::path HX_ProgramFolder();
 /// The number of this process, in decimal digits.
 std::string HX_ProcessNumber();
 
+/// Keeps other processes that ask for the same lock out of a folder. Leaves no
+/// file. Several objects of one process may hold the lock together.
+class HX_FolderLock {
+ public:
+  HX_FolderLock() = default;
+  HX_FolderLock(const HX_FolderLock&) = delete;
+  HX_FolderLock& operator=(const HX_FolderLock&) = delete;
+  ~HX_FolderLock();
+
+  /// File systems without locks count as free.
+  /// \return false if another process holds the lock
+  bool take(const std::filesystem::path& folder);
+
+ private:
+  std::string m_Folder;  // empty for a lock that is not held
+};
+
 /// Delays the signals that ask the program to end (SIGHUP, SIGINT, SIGTERM)
-/// until the end of the object; blocking calls are interrupted. At most one
-/// object lives at a time.
+/// until the end of the outermost object; blocking calls are interrupted.
 class HX_DelayedSignals {
  public:
   HX_DelayedSignals();
   HX_DelayedSignals(const HX_DelayedSignals&) = delete;
   HX_DelayedSignals& operator=(const HX_DelayedSignals&) = delete;
-  /// Raises the last signal that came, if any.
+  /// The outermost object raises the last signal that came, if any.
   ~HX_DelayedSignals();
 
   /// Whether a signal waits.

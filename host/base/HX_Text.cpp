@@ -70,6 +70,10 @@ std::string HX_ToUtf8(const KyCXString& text) {
   utf8.reserve(static_cast<std::size_t>(text.length()));
   for (int i = 0; i < text.length(); ++i) {
     char32_t code = text[i];
+    if (code < 0x80) {
+      utf8 += static_cast<char>(code);
+      continue;
+    }
     const bool isPair =
         (code & 0xFC00) == 0xD800 && (text[i + 1] & 0xFC00) == 0xDC00;
     if (isPair) code = 0x10000 + ((code & 0x3FF) << 10) + (text[++i] & 0x3FFU);

@@ -88,7 +88,8 @@ unsigned typeOf(const HX_JsonValue& value) {
 
 class Reader : public HX_JsonEvents {
  public:
-  explicit Reader(HX_ModelReading& reading) : m_Reading(reading) {
+  Reader(HX_ModelReading& reading, HX_Progress& progress)
+      : m_Reading(reading), m_Progress(progress) {
     m_Next.node = m_Schema.root;
   }
 
@@ -141,7 +142,8 @@ class Reader : public HX_JsonEvents {
     return begin(end, HX_SchemaNode::eList, "a list");
   }
 
-  bool endObject(std::size_t) override {
+  bool endObject(std::size_t end) override {
+    m_Progress.moveTo(end);
     --m_Depth;
     if (m_Skipped > 0) return --m_Skipped, true;
     const Frame frame = m_Frames.back();
@@ -260,6 +262,7 @@ class Reader : public HX_JsonEvents {
 
   const HX_Schema& m_Schema = modelSchema();
   HX_ModelReading& m_Reading;
+  HX_Progress& m_Progress;
   std::vector<Frame> m_Frames;
   Target m_Next;
   std::size_t m_Depth = 0;
@@ -268,11 +271,13 @@ class Reader : public HX_JsonEvents {
 
 }  // namespace
 
-bool HX_ReadDocument(HX_Document& document, HX_ModelReading& reading) {
+bool HX_ReadDocument(HX_Document& document, HX_ModelReading& reading,
+                     HX_Progress& progress) {
+  progress.begin("reading, bytes", document.text.size());
   if (document.text.size() > UINT32_MAX)
     throw HX_InputError(HX_Visible(document.file) +
                         ": cannot be read: expected at most 4294967295 bytes");
-  Reader reader(reading);
+  Reader reader(reading, progress);
   const HX_JsonEnd end = HX_ReadJson(document.text, reader);
   if (end.expected == nullptr) return !end.isStopped;
   std::string found = "the end of the file";

@@ -2,44 +2,36 @@
 //
 //   HX_IdTable ids("a type");
 //   const int use = ids.entry("speed");     // not yet defined
-//   ids.define(ids.entry("speed"), 7, place);
-//   ids[use].item;                          // 7
+//   ids.define(ids.entry("speed"), 7);
+//   ids.item(use);                          // 7
 
 #ifndef HOST_MODEL_HX_IDTABLE_H
 #define HOST_MODEL_HX_IDTABLE_H
 
+#include <cstddef>
 #include <cstdint>
-#include <deque>
-#include <functional>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <vector>
 
-#include "host/base/HX_Faults.h"
-
+/// Hash table with open addressing over one common text: 16 to 24 bytes and the
+/// characters for each id.
 class HX_IdTable {
  public:
-  struct Entry {
-    const std::string* text;
-    int item = -1;  // index of the item in a list of the user; -1: not defined
-  };
-
   /// \param what  for complaints: "a type"
-  explicit HX_IdTable(const char* what) : m_What(what) {}
+  explicit HX_IdTable(const char* what) : m_What(what), m_Slots(64, kNone) {}
 
   /// The number of the id; a new id gets the next number.
-  int entry(std::string_view id) {
-    const auto [found, isNew] = m_Numbers.try_emplace(
-        std::string(id), static_cast<int>(m_Entries.size()));
-    if (isNew) m_Entries.push_back({&found->first});
-    return found->second;
-  }
+  int entry(std::string_view id);
 
-  const Entry& operator[](int number) const {
-    return m_Entries[static_cast<std::size_t>(number)];
+  std::string_view text(int number) const {
+    const Entry& found = m_Entries[static_cast<std::size_t>(number)];
+    return std::string_view(m_Text).substr(found.begin, found.length);
   }
-
+  /// Index of the item in a list of the user; -1 for an id without an item.
+  int item(int number) const {
+    return m_Entries[static_cast<std::size_t>(number)].item;
+  }
   /// \return false if another item has the id
   bool define(int number, int item) {
     Entry& defined = m_Entries[static_cast<std::size_t>(number)];
@@ -51,9 +43,20 @@ class HX_IdTable {
   const char* what() const { return m_What; }
 
  private:
+  struct Entry {
+    std::uint32_t begin;  // in m_Text
+    std::uint32_t length;
+    std::uint32_t hash;
+    int item;
+  };
+  static constexpr int kNone = -1;
+
+  void grow();
+
   const char* m_What;
-  std::unordered_map<std::string, int> m_Numbers;
+  std::string m_Text;
   std::vector<Entry> m_Entries;
+  std::vector<int> m_Slots;  // numbers; at most half of the slots are taken
 };
 
 #endif  // HOST_MODEL_HX_IDTABLE_H

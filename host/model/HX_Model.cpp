@@ -71,7 +71,7 @@ constexpr HX_FieldBinding kBindings[] = {
 
 int HX_Ids::find(const HX_Use& use) {
   if (!use.isGiven()) return -1;
-  const int item = (*this)[use.entry].item;
+  const int item = HX_IdTable::item(use.entry);
   if (item < 0)
     ++m_Unknown.try_emplace(use.entry, Unknown{use.place, 0})
           .first->second.uses;
@@ -81,7 +81,7 @@ int HX_Ids::find(const HX_Use& use) {
 void HX_Ids::report(HX_Faults& faults) const {
   if (!isWhole) return;
   for (const auto& [entry, unknown] : m_Unknown) {
-    std::string found = HX_Quoted(*(*this)[entry].text);
+    std::string found = HX_Quoted(text(entry));
     if (unknown.uses > 1)
       found += " (" + std::to_string(unknown.uses) + " uses)";
     faults.add(unknown.first, found, std::string("the id of ") + what(),
@@ -91,21 +91,23 @@ void HX_Ids::report(HX_Faults& faults) const {
 
 void HX_ModelReading::define(HX_Ids& ids, const HX_Use& id, std::size_t item) {
   if (!id.isGiven() || ids.define(id.entry, static_cast<int>(item))) return;
-  faults.add(id.place, HX_Quoted(*ids[id.entry].text) + " again",
+  faults.add(id.place, HX_Quoted(ids.text(id.entry)) + " again",
              "an id that is not taken yet", kHxTakenId);
 }
 
 HX_Bindings HX_OptionBindings() { return {kBindings, std::size(kBindings)}; }
 
 HX_Model::HX_Model(HX_Document& document,
-                   const std::vector<std::string>& keywordFolders) {
+                   const std::vector<std::string>& keywordFolders,
+                   HX_Progress& progress) {
   HxCGlobal::setOptions(&options);
   HxCGlobal::setDataTypeServer(&typeServer);
   HX_DdTree::instance().clear();
   GLB_SetModelName("");
   GLB_SetSubsystemName("");
   HX_ModelReading reading(*this, document.faults, keywordFolders);
-  if (HX_ReadDocument(document, reading)) {
+  if (HX_ReadDocument(document, reading, progress)) {
+    progress.begin("building the model");
     if (names.empty() && document.faults.count() > 0)
       reading.nameIds.isWhole = false;
     HX_ResolveSources(reading);
@@ -118,6 +120,7 @@ HX_Model::HX_Model(HX_Document& document,
                               &reading.scopeIds, &reading.nameIds})
       ids->report(document.faults);
   }
+  progress.end();
   document.throwIfFaulty();
   for (HX_Circle* circle : {&typeCircle, &variableCircle}) {
     if (!circle->items.empty()) circle->place = document.placeText(circle->end);

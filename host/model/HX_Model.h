@@ -19,6 +19,7 @@
 #include <vector>
 
 #include "SourceRef/HxCDdSrcRef.h"
+#include "host/base/HX_Progress.h"
 #include "host/model/HX_SourcePaths.h"
 #include "host/model/HX_Types.h"
 #include "host/model/HX_WantedName.h"
@@ -57,7 +58,8 @@ struct HX_Model {
   /// or of a word list that no folder of \p keywordFolders has. The words of
   /// lists of the same name in several folders count together.
   HX_Model(HX_Document& document,
-           const std::vector<std::string>& keywordFolders);
+           const std::vector<std::string>& keywordFolders,
+           HX_Progress& progress);
   HX_Model(const HX_Model&) = delete;
   HX_Model& operator=(const HX_Model&) = delete;
   ~HX_Model();

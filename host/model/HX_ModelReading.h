@@ -254,7 +254,8 @@ HX_TypeItem* HX_FindDeclarableType(HX_ModelReading& reading, const HX_Use& use);
 
 /// Reads the text of \p document by the schema; faults go to \p reading.
 /// \return false if the reading stopped before the end of the document
-bool HX_ReadDocument(HX_Document& document, HX_ModelReading& reading);
+bool HX_ReadDocument(HX_Document& document, HX_ModelReading& reading,
+                     HX_Progress& progress);
 
 /// The limits of the schema that no single value can show.
 struct HX_ModelLimits {

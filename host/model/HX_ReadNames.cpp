@@ -31,14 +31,14 @@ HX_NameRecord& record(Reading& r) { return r.names.back(); }
 HX_RareUses& uses(Reading& r) { return r.rareUses[r.names.size() - 1]; }
 
 void beginName(Reading& r, HX_TokenEnd place) {
-  r.model.names.emplace_back();
+  r.model.names.emplace_back().index = r.names.size();
   r.names.emplace_back().place = place;
 }
 
 void endName(Reading& r, bool isFaulty) {
   record(r).isFaulty = isFaulty;
   if (record(r).id.isGiven())
-    name(r).id = *r.nameIds[record(r).id.entry].text;
+    name(r).id = r.nameIds.text(record(r).id.entry);
   else
     r.nameIds.isWhole = false;
 }
@@ -204,8 +204,8 @@ class Resolver {
     return m_Reading.names[static_cast<std::size_t>(index)].isFaulty;
   }
 
-  const std::string& textOf(const HX_Ids& ids, const HX_Use& use) {
-    return *ids[use.entry].text;
+  static std::string textOf(const HX_Ids& ids, const HX_Use& use) {
+    return std::string(ids.text(use.entry));
   }
 
   void resolve(const HX_NameRecord& record, HX_WantedName& name,
@@ -277,7 +277,7 @@ class Resolver {
       }
       name.dependsOn.push_back(first);
       graph.add(listed.name, static_cast<std::size_t>(
-                                 m_Reading.nameIds[listed.use.entry].item));
+                                 m_Reading.nameIds.item(listed.use.entry)));
     }
     graph.walk({}, [this](const HX_UseGraph::Circle& circle) {
       m_Model.variableCircle.enter(circle,

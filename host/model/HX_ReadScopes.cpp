@@ -68,8 +68,7 @@ class Maker {
     const std::size_t index = m_Model.scopes.size();
     HX_ScopeItem& item = m_Model.scopes.emplace_back();
     m_Reading.define(m_Reading.scopeIds, record.id, index);
-    if (record.id.isGiven())
-      item.id = *m_Reading.scopeIds[record.id.entry].text;
+    if (record.id.isGiven()) item.id = m_Reading.scopeIds.text(record.id.entry);
     item.kind = record.kind;
     HX_ScopeItem* parent = nullptr;
     if (record.parent >= 0)

@@ -143,7 +143,7 @@ class Maker {
   void begin(const HX_TypeRecord& record) {
     m_Reading.define(m_Reading.typeIds, record.id, m_Types.size());
     HX_TypeItem& item = m_Types.emplace_back(HX_FromUtf8(record.name));
-    if (record.id.isGiven()) item.id = *m_Reading.typeIds[record.id.entry].text;
+    if (record.id.isGiven()) item.id = m_Reading.typeIds.text(record.id.entry);
     item.name = record.name;
     item.kind = record.kind;
     item.cType = record.cType;

@@ -63,6 +63,7 @@ struct HX_RareWishes {
 /// reading.
 struct HX_WantedName {
   std::string id;
+  std::size_t index = 0;                      // in the document
   const HX_Template* nameTemplate = nullptr;  // owned by the model
   const std::string* rule = nullptr;          // owned by the model, or null
   HX_NameKind kind = HX_NameKind::eObject;

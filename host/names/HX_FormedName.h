@@ -3,9 +3,11 @@
 #ifndef HOST_NAMES_HX_FORMEDNAME_H
 #define HOST_NAMES_HX_FORMEDNAME_H
 
+#include <cstdint>
 #include <deque>
 #include <memory>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "host/model/HX_SourcePaths.h"
@@ -66,6 +68,16 @@ struct HX_FormedName {
  private:
   std::unique_ptr<const KyCXString> m_OtherFormal;  // null if equal to actual
 };
+
+/// The first eight bytes of a text as a number: where the numbers differ, texts
+/// have the order of the numbers. Sorting by numbers first reads less memory.
+inline std::uint64_t HX_PrefixOf(std::string_view text) {
+  std::uint64_t prefix = 0;
+  for (std::size_t i = 0; i < 8; ++i)
+    prefix = prefix << 8 |
+             (i < text.size() ? static_cast<unsigned char>(text[i]) : 0U);
+  return prefix;
+}
 
 /// The texts of \p name.changes in their order.
 std::string HX_JoinedChanges(const HX_FormedName& name, const char* separator);

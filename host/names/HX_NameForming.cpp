@@ -48,13 +48,13 @@ constexpr OsTextRow kOsTexts[] = {
 }  // namespace
 
 std::deque<HX_FormedName> HX_NameForming::formAll(
-    const std::deque<HX_WantedName>& names, const Progress& progress) {
+    const std::deque<HX_WantedName>& names, HX_Progress& progress) {
   std::deque<HX_FormedName> formed;
   for (const HX_WantedName& name : names) formed.emplace_back(name);
-  std::size_t done = 0;
+  progress.begin("names", names.size());
   for (const std::size_t index : HX_FormingOrder(names)) {
     form(formed[index]);
-    progress(++done, names.size());
+    progress.step();
   }
   return formed;
 }

@@ -8,13 +8,13 @@
 #define HOST_NAMES_HX_NAMEFORMING_H
 
 #include <deque>
-#include <functional>
 #include <map>
 #include <optional>
 #include <string>
 #include <vector>
 
 #include "Naming/HxCCIdentifier.h"
+#include "host/base/HX_Progress.h"
 #include "host/names/HX_FormedName.h"
 #include "host/names/HX_NameSpaces.h"
 
@@ -27,14 +27,12 @@ struct HX_ExplainedMacro {
 
 class HX_NameForming {
  public:
-  using Progress = std::function<void(std::size_t done, std::size_t all)>;
-
   explicit HX_NameForming(HX_NameSpaces& spaces) : m_Spaces(spaces) {}
 
   /// Forms names in the order of HX_FormingOrder().
   /// RETURNS: one formed name per wanted name, in the order of \p names.
   std::deque<HX_FormedName> formAll(const std::deque<HX_WantedName>& names,
-                                    const Progress& progress);
+                                    HX_Progress& progress);
 
   /// The value of each macro of the template. Reports nothing.
   std::vector<HX_ExplainedMacro> explain(const HX_WantedName& name);

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 #include <deque>
-#include <unordered_map>
+#include <vector>
 
 #include "DependencySorting/HxCDepSortComp.h"
 #include "DependencySorting/HxCDepSortNode.h"
@@ -66,18 +66,29 @@ class HxCSsNode : public Node {
 
 namespace {
 
-template <class NodeType, class Item, class DependenciesOf>
+// Positions of items are below \p count; \p eachDependency calls its second
+// argument with the positions of the items before.
+template <class NodeType, class Item, class PositionOf, class EachDependency>
 std::vector<const Item*> order(const std::vector<const Item*>& items,
-                               DependenciesOf dependenciesOf) {
+                               std::size_t count, PositionOf positionOf,
+                               EachDependency eachDependency) {
+  struct Key {
+    std::uint64_t prefix;
+    NodeType* node;
+  };
   std::deque<NodeType> nodes;
-  std::unordered_map<const Item*, NodeType*> nodeOf;  // looked up, never walked
-  std::vector<NodeType*> byName;
+  std::vector<NodeType*> nodeAt(count, nullptr);
+  std::vector<Key> byName;
   byName.reserve(items.size());
-  for (const Item* item : items)
-    byName.push_back(nodeOf[item] = &nodes.emplace_back(*item));
+  for (const Item* item : items) {
+    NodeType* node = nodeAt[positionOf(*item)] = &nodes.emplace_back(*item);
+    byName.push_back({HX_PrefixOf(node->getName().cstring()), node});
+  }
   // The order of the document does not decide between equal nodes.
-  std::sort(byName.begin(), byName.end(),
-            [](NodeType* a, NodeType* b) { return a->compareNames(*b) < 0; });
+  std::sort(byName.begin(), byName.end(), [](const Key& a, const Key& b) {
+    if (a.prefix != b.prefix) return a.prefix < b.prefix;
+    return a.node->compareNames(*b.node) < 0;
+  });
 
   ByWidth byWidth;
   ByName byNames;
@@ -86,12 +97,12 @@ std::vector<const Item*> order(const std::vector<const Item*>& items,
   criteria[1] = &byNames;
   HxCDependencySorting sorting;
   sorting.setSortingCriteriaAndInit(criteria);
-  for (NodeType* node : byName) sorting.add(node);
-  for (NodeType* node : byName) {
-    for (const Item* first : dependenciesOf(node->item)) {
-      const auto found = nodeOf.find(first);
-      if (found != nodeOf.end()) sorting.addDependency(found->second, node);
-    }
+  for (const Key& key : byName) sorting.add(key.node);
+  for (const Key& key : byName) {
+    eachDependency(key.node->item, [&](std::size_t before) {
+      if (nodeAt[before] != nullptr)
+        sorting.addDependency(nodeAt[before], key.node);
+    });
   }
   std::vector<const Item*> ordered;
   ordered.reserve(items.size());
@@ -110,22 +121,22 @@ std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model) {
     for (const HX_TypeItem& type : model.types) types.push_back(&type);
   for (const std::size_t index : model.typeCircle.items)
     types.push_back(&model.types[index]);
-  return order<HxCSdtNode>(types, [](const HX_TypeItem& type) {
-    std::vector<const HX_TypeItem*> before{type.of};
-    for (const HX_TypeItem::Field& field : type.fields)
-      before.push_back(field.type);
-    return before;
-  });
+  return order<HxCSdtNode>(
+      types, model.types.size(),
+      [](const HX_TypeItem& type) { return type.index; },
+      [](const HX_TypeItem& type, auto add) {
+        if (type.of != nullptr) add(type.of->index);
+        for (const HX_TypeItem::Field& field : type.fields)
+          add(field.type->index);
+      });
 }
 
 std::vector<const HX_FormedName*> HX_OrderVariables(
     const HX_Model& model, const std::deque<HX_FormedName>& names) {
   std::vector<const HX_FormedName*> variables;
-  std::unordered_map<const HX_WantedName*, const HX_FormedName*> formedOf;
   const auto add = [&](const HX_FormedName& name) {
-    if (name.wanted->kind != HX_NameKind::eVariable || !name.isDefined) return;
-    variables.push_back(&name);
-    formedOf.emplace(name.wanted, &name);
+    if (name.wanted->kind == HX_NameKind::eVariable && name.isDefined)
+      variables.push_back(&name);
   };
   const std::vector<std::size_t>& circle = model.variableCircle.items;
   const bool isWhole =
@@ -135,12 +146,11 @@ std::vector<const HX_FormedName*> HX_OrderVariables(
     for (const HX_FormedName& name : names) add(name);
   else
     for (const std::size_t index : circle) add(names[index]);
-  return order<HxCSsNode>(variables, [&](const HX_FormedName& name) {
-    std::vector<const HX_FormedName*> before;
-    for (const HX_WantedName* wanted : name.wanted->dependsOn) {
-      const auto found = formedOf.find(wanted);
-      if (found != formedOf.end()) before.push_back(found->second);
-    }
-    return before;
-  });
+  return order<HxCSsNode>(
+      variables, names.size(),
+      [](const HX_FormedName& name) { return name.wanted->index; },
+      [](const HX_FormedName& name, auto use) {
+        for (const HX_WantedName* wanted : name.wanted->dependsOn)
+          use(wanted->index);
+      });
 }

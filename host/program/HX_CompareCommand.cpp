@@ -64,9 +64,10 @@ void addDocument(HX_NameDiff& diff, HX_NameDiff::HxESideTag side,
   std::vector<std::string> folders{arguments.keywords};
   folders.insert(folders.end(), arguments.ownKeywords.begin(),
                  arguments.ownKeywords.end());
-  HX_Generator generator(profile, HX_ReadDocument(file, arguments, profile),
-                         folders);
-  generator.run([](std::size_t, std::size_t) {}, nullptr);
+  HX_Progress silent(false);
+  HX_Generator generator(profile, silent,
+                         HX_ReadDocument(file, arguments, profile), folders);
+  generator.run(nullptr);
   for (const HX_FormedName* name : generator.result.names)
     add(diff, side,
         {name->wanted->id,

@@ -8,19 +8,39 @@
 #include "host/write/HX_CWriter.h"
 #include "host/write/HX_NameMap.h"
 
-HX_Generator::HX_Generator(HX_Profile& timing, HX_Document read,
+namespace {
+
+void sortById(std::vector<const HX_FormedName*>& names) {
+  struct Key {
+    std::uint64_t prefix;
+    const HX_FormedName* name;
+  };
+  std::vector<Key> keys;
+  keys.reserve(names.size());
+  for (const HX_FormedName* name : names)
+    keys.push_back({HX_PrefixOf(name->wanted->id), name});
+  std::sort(keys.begin(), keys.end(), [](const Key& a, const Key& b) {
+    if (a.prefix != b.prefix) return a.prefix < b.prefix;
+    return a.name->wanted->id < b.name->wanted->id;
+  });
+  for (std::size_t i = 0; i < keys.size(); ++i) names[i] = keys[i].name;
+}
+
+}  // namespace
+
+HX_Generator::HX_Generator(HX_Profile& timing, HX_Progress& shown,
+                           HX_Document read,
                            const std::vector<std::string>& keywordFolders)
-    : profile(timing), document(std::move(read)) {
+    : profile(timing), progress(shown), document(std::move(read)) {
   const HX_Profile::Phase phase(profile, "Build model");
   std::vector<std::string> folders;
   for (const std::string& folder : keywordFolders)
     folders.push_back((profile.start / folder).lexically_normal().string());
-  model.emplace(document, folders);
+  model.emplace(document, folders, progress);
   profile.setModel(HX_NameText(model->name).cstring());
 }
 
-void HX_Generator::run(const HX_NameForming::Progress& progress,
-                       HX_NameLock* lock) {
+void HX_Generator::run(HX_NameLock* lock) {
   {
     const HX_Profile::Phase phase(profile, "Order types");
     result.types = HX_OrderTypes(*model);
@@ -35,17 +55,19 @@ void HX_Generator::run(const HX_NameForming::Progress& progress,
                         "a name that is no " + use.conflict.text(),
                         kHxReservedType);
   document.throwIfFaulty();
-  document.text = {};
+  std::string().swap(document.text);  // long, and not needed any more
   {
     const HX_Profile::Phase phase(profile, "Form names");
     result.formed = forming.emplace(*spaces).formAll(model->names, progress);
   }
   for (const HX_FormedName& name : result.formed) result.names.push_back(&name);
   const HX_Profile::Phase phase(profile, "Order variables");
+  progress.begin("ordering variables");
   const std::size_t before = result.findings.size();
   result.variables = HX_OrderVariables(*model, result.formed);
   if (result.findings.size() > before)
     result.findings.back().source = model->variableCircle.place;
+  progress.end();
   profile.note(std::to_string(result.names.size()) + " names, " +
                std::to_string(result.variables.size()) + " variables, " +
                std::to_string(result.types.size()) + " types");
@@ -53,12 +75,10 @@ void HX_Generator::run(const HX_NameForming::Progress& progress,
 
 std::size_t HX_Generator::write(HX_Output& output) {
   const HX_Profile::Phase phase(profile, "Write C");
-  std::sort(result.names.begin(), result.names.end(),
-            [](const HX_FormedName* a, const HX_FormedName* b) {
-              return a->wanted->id < b->wanted->id;
-            });
-  HX_CWriter(*model, result).write(output);
-  HX_WriteJson(output.open("name_map.json"), result);
-  HX_WriteCsv(output.open("name_map.csv"), result);
+  sortById(result.names);
+  HX_CWriter(*model, result, progress).write(output);
+  HX_WriteNameMap(output.open("name_map.json"), output.open("name_map.csv"),
+                  result, progress);
+  progress.end();
   return output.finish();
 }

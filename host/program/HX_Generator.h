@@ -13,6 +13,7 @@
 #include <string>
 
 #include "host/base/HX_Output.h"
+#include "host/base/HX_Progress.h"
 #include "host/model/HX_Document.h"
 #include "host/model/HX_Model.h"
 #include "host/names/HX_FormedName.h"
@@ -22,19 +23,20 @@
 
 struct HX_Generator {
   /// Throws HX_DocumentError. Folders count from the start of \p profile.
-  HX_Generator(HX_Profile& profile, HX_Document read,
+  HX_Generator(HX_Profile& profile, HX_Progress& progress, HX_Document read,
                const std::vector<std::string>& keywordFolders);
 
   /// Orders types, forms names, orders variables. A circle of types ends the
   /// run without names. Throws HX_DocumentError for reserved words among types.
   /// \param lock  names to keep, and to note; null for none
-  void run(const HX_NameForming::Progress& progress, HX_NameLock* lock);
+  void run(HX_NameLock* lock);
 
   /// Writes the C code, and the name map by id.
   /// \return the number of files that the commit of \p output changes
   std::size_t write(HX_Output& output);
 
   HX_Profile& profile;
+  HX_Progress& progress;
   HX_Document document;
   HX_RunResult result;
   const HX_MessageCollector collector{result.findings};

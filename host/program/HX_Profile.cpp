@@ -16,10 +16,10 @@ constexpr char kTransformations[] = "HX_Transformations.txt";
 HX_Profile::HX_Profile(const std::string& folder) : m_IsOn(!folder.empty()) {
   HX_TimingListener::install(this);
   if (!m_IsOn) return;
-  fs::create_directories(folder);
-  fs::current_path(folder);
-  fs::remove(kTransformations);  // the tracer appends, as the protocol does
-  fs::remove("HX_DebugProtocol.txt");
+  std::error_code error;
+  fs::current_path(m_Output.emplace(start / folder).place(), error);
+  if (error)
+    throw HX_OutputError(folder + ": cannot be entered: " + error.message());
   HX_SetCommandWindow([](const char*) {});
   HxCTransformationTracer::boot(kTransformations);
   m_Server.boot();
@@ -27,8 +27,14 @@ HX_Profile::HX_Profile(const std::string& folder) : m_IsOn(!folder.empty()) {
 
 HX_Profile::~HX_Profile() {
   HX_TimingListener::install(nullptr);
+  leaveFolder();
+}
+
+void HX_Profile::leaveFolder() {
   HxCTransformationTracer::shutdown();
   m_Server.shutdown();
+  std::error_code error;
+  if (m_Output) fs::current_path(start, error);
 }
 
 void HX_Profile::setModel(const std::string& name) {
@@ -49,13 +55,12 @@ void HX_Profile::finish() {
   m_IsOn = false;
   m_Server.printCurrentResults("Results");
   HX_StopWatch::endStopWatches();
-  HxCTransformationTracer::shutdown();
-
-  HX_Output output(fs::current_path());
-  HX_WriteTraceEvents(output.open("HX_Trace.json"), m_Runs);
-  HX_WriteFoldedStacks(output.open("HX_Stacks.folded"), m_Runs);
-  output.finish();
-  output.commit();
+  leaveFolder();
+  HX_WriteTraceEvents(m_Output->open("HX_Trace.json"), m_Runs);
+  HX_WriteFoldedStacks(m_Output->open("HX_Stacks.folded"), m_Runs);
+  m_Output->finish();
+  m_Output->commit();
+  m_Output.reset();
 }
 
 void HX_Profile::runEnded(const char* name, std::int64_t begin,

@@ -13,23 +13,26 @@
 #include <cstdint>
 #include <filesystem>
 #include <list>
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "Diagnostics/HX_StopWatch.h"
 #include "Diagnostics/HX_TimingListener.h"
 #include "Diagnostics/HxCDebugServer.h"
+#include "host/base/HX_Output.h"
 #include "host/write/HX_TimedRun.h"
 
-/// One per process. A folder becomes the working directory, because the servers
-/// of the library write their files there: HX_StopWatch.html, HX_DebugLog.txt,
-/// HX_DebugProtocol.txt and HX_Transformations.txt. HX_Trace.json has complete
-/// events of the trace-event format, HX_Stacks.folded has one line per stack of
-/// phases with the self time; both in microseconds.
+/// One per process. The servers of the library write into the working
+/// directory: a folder inside \p folder becomes the working directory until
+/// finish(), which puts all files in their places. Without finish() nothing is
+/// written. Files: HX_StopWatch.html, HX_DebugLog.txt, HX_DebugProtocol.txt and
+/// HX_Transformations.txt. HX_Trace.json has complete events of the trace-event
+/// format, HX_Stacks.folded has one line per stack of phases with the self
+/// time; both in microseconds.
 class HX_Profile : private HX_TimingListener {
  public:
-  /// Throws std::filesystem::filesystem_error for a folder that cannot be made
-  /// or entered.
+  /// Throws HX_OutputError for a folder that cannot be made or entered.
   explicit HX_Profile(const std::string& folder);
   HX_Profile(const HX_Profile&) = delete;
   HX_Profile& operator=(const HX_Profile&) = delete;
@@ -64,7 +67,10 @@ class HX_Profile : private HX_TimingListener {
   void runEnded(const char* name, std::int64_t begin,
                 std::int64_t duration) override;
 
+  void leaveFolder();
+
   bool m_IsOn;
+  std::optional<HX_Output> m_Output;
   HxCDebugServer m_Server;
   std::list<HX_StopWatch> m_Watches;  // stay registered until the report
   std::vector<HX_TimedRun> m_Runs;

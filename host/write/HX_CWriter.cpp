@@ -134,9 +134,11 @@ std::string fileName(const char* nameTemplate) {
 
 }  // namespace
 
-HX_CWriter::HX_CWriter(const HX_Model& model, HX_RunResult& result)
+HX_CWriter::HX_CWriter(const HX_Model& model, HX_RunResult& result,
+                       HX_Progress& progress)
     : m_Model(model),
       m_Result(result),
+      m_Progress(progress),
       m_TypesFile(fileName("$M_types")),
       m_CodeFile(fileName("$M")) {
   for (const HX_FormedName* name : result.names) {
@@ -153,8 +155,7 @@ HX_CWriter::HX_CWriter(const HX_Model& model, HX_RunResult& result)
 
 void HX_CWriter::write(HX_Output& output) {
   writeTypes(output.open(m_TypesFile + ".h"));
-  writeDeclarations(output.open(m_CodeFile + ".h"));
-  writeDefinitions(output.open(m_CodeFile + ".c"));
+  writeCode(output.open(m_CodeFile + ".h"), output.open(m_CodeFile + ".c"));
 }
 
 void HX_CWriter::writeTypes(std::ostream& out) const {
@@ -168,32 +169,33 @@ void HX_CWriter::writeTypes(std::ostream& out) const {
   out << "\n#endif /* " << guard << " */\n";
 }
 
-void HX_CWriter::writeDeclarations(std::ostream& out) {
+// Header and source in one pass: the variables of a large model do not fit the
+// caches, and each comment is made once.
+void HX_CWriter::writeCode(std::ostream& header, std::ostream& source) {
+  m_Progress.begin("writing C", m_Result.variables.size());
   const std::string guard = guardOf(m_CodeFile);
-  out << fileHead("Declarations", m_Model.name) << "#ifndef " << guard
-      << "\n#define " << guard << "\n\n#include \"" << m_TypesFile << ".h\"\n";
-  for (const HX_FormedName* name : m_VariablesIn[m_Model.fileScope])
-    out << '\n'
-        << comment(*name) << "extern " << name->wanted->type->name << ' '
-        << name->actual.cstring() << ";\n";
-  for (const HX_FormedName* name : m_Functions)
-    out << '\n'
-        << comment(*name) << "void " << name->actual.cstring() << "(void);\n";
-  out << "\n#endif /* " << guard << " */\n";
-}
-
-void HX_CWriter::writeDefinitions(std::ostream& out) {
-  out << fileHead("Definitions", m_Model.name) << "#include \"" << m_CodeFile
-      << ".h\"\n";
-  for (const HX_FormedName* name : m_VariablesIn[m_Model.fileScope])
-    out << '\n' << comment(*name) << definition(*name);
-  for (const HX_FormedName* name : m_Functions) {
-    out << '\n'
-        << comment(*name) << "void " << name->actual.cstring() << "(void) {\n";
-    if (name->wanted->body != nullptr)
-      writeLocals(out, *name->wanted->body, "  ");
-    out << "}\n";
+  header << fileHead("Declarations", m_Model.name) << "#ifndef " << guard
+         << "\n#define " << guard << "\n\n#include \"" << m_TypesFile
+         << ".h\"\n";
+  source << fileHead("Definitions", m_Model.name) << "#include \"" << m_CodeFile
+         << ".h\"\n";
+  for (const HX_FormedName* name : m_VariablesIn[m_Model.fileScope]) {
+    const std::string head = '\n' + comment(*name);
+    header << head << "extern " << name->wanted->type->name << ' '
+           << name->actual.cstring() << ";\n";
+    source << head << definition(*name);
+    m_Progress.step();
   }
+  for (const HX_FormedName* name : m_Functions) {
+    const std::string head =
+        '\n' + comment(*name) + "void " + name->actual.cstring() + "(void)";
+    header << head << ";\n";
+    source << head << " {\n";
+    if (name->wanted->body != nullptr)
+      writeLocals(source, *name->wanted->body, "  ");
+    source << "}\n";
+  }
+  header << "\n#endif /* " << guard << " */\n";
 }
 
 // The variables of a scope, then the inner blocks by id.

@@ -1,7 +1,7 @@
 // Writes C90: a header with the types, a header with the declarations, and a
 // source with the definitions.
 //
-//   HX_CWriter writer(model, result);
+//   HX_CWriter writer(model, result, progress);
 //   writer.write(output);
 
 #ifndef HOST_WRITE_HX_CWRITER_H
@@ -13,6 +13,7 @@
 #include <vector>
 
 #include "host/base/HX_Output.h"
+#include "host/base/HX_Progress.h"
 #include "host/model/HX_Model.h"
 #include "host/names/HX_FormedName.h"
 
@@ -24,14 +25,14 @@
 class HX_CWriter {
  public:
   /// Warnings go to \p result.
-  HX_CWriter(const HX_Model& model, HX_RunResult& result);
+  HX_CWriter(const HX_Model& model, HX_RunResult& result,
+             HX_Progress& progress);
 
   void write(HX_Output& output);
 
  private:
   void writeTypes(std::ostream& out) const;
-  void writeDeclarations(std::ostream& out);
-  void writeDefinitions(std::ostream& out);
+  void writeCode(std::ostream& header, std::ostream& source);
   void writeLocals(std::ostream& out, const HX_ScopeItem& scope,
                    const std::string& indent);
   std::string definition(const HX_FormedName& name);
@@ -43,6 +44,7 @@ class HX_CWriter {
 
   const HX_Model& m_Model;
   HX_RunResult& m_Result;
+  HX_Progress& m_Progress;
   std::string m_TypesFile;                        // without extension, as below
   std::string m_CodeFile;                         // header and source
   std::vector<const HX_FormedName*> m_Functions;  // by C name

@@ -25,12 +25,12 @@ void writeFindings(HX_JsonWriter& json,
   json.close(']');
 }
 
-void writeName(HX_JsonWriter& json, const HX_FormedName& name) {
+void writeName(HX_JsonWriter& json, const HX_FormedName& name,
+               const std::string& path) {
   json.next();
   json.open('{');
   json.field("id", name.wanted->id);
   const HxCSrcRef* best = HX_BestSource(*name.wanted);
-  const std::string path = HX_PathOf(best);
   json.field("source", path);
   json.key("sources");
   json.open('[');
@@ -66,14 +66,25 @@ void appendCsv(std::string& line, const std::string& text, char behind) {
   line += behind;
 }
 
-}  // namespace
+void writeCsvLine(std::string& out, const HX_FormedName& name,
+                  const std::string& path) {
+  appendCsv(out, name.wanted->id, ',');
+  appendCsv(out, *name.wanted->nameTemplate->shown, ',');
+  appendCsv(out, HX_ToUtf8(name.formal()), ',');
+  appendCsv(out, HX_ToUtf8(name.actual), ',');
+  appendCsv(out, HX_JoinedChanges(name, "; "), ',');
+  appendCsv(out, path, '\r');
+  out += '\n';
+}
 
-void HX_WriteJson(std::ostream& stream, const HX_RunResult& result) {
-  HX_JsonWriter json(stream, 2);
+void beginJson(HX_JsonWriter& json) {
   json.open('{');
   json.key("names");
   json.open('[');
-  for (const HX_FormedName* name : result.names) writeName(json, *name);
+}
+
+// Everything behind the names.
+void endJson(HX_JsonWriter& json, const HX_RunResult& result) {
   json.close(']');
   json.key("types");
   json.open('[');
@@ -89,17 +100,31 @@ void HX_WriteJson(std::ostream& stream, const HX_RunResult& result) {
   json.end();
 }
 
-void HX_WriteCsv(std::ostream& stream, const HX_RunResult& result) {
-  HX_TextPieces out(stream);
-  out.text += "id,template,formal,actual,changes,source\r\n";
+}  // namespace
+
+void HX_WriteJson(std::ostream& stream, const HX_RunResult& result) {
+  HX_JsonWriter json(stream, 2);
+  beginJson(json);
+  for (const HX_FormedName* name : result.names)
+    writeName(json, *name, name->sourcePath());
+  endJson(json, result);
+}
+
+// Both files in one pass: a large model does not fit the caches, and the path
+// is made once.
+void HX_WriteNameMap(std::ostream& jsonStream, std::ostream& csvStream,
+                     const HX_RunResult& result, HX_Progress& progress) {
+  progress.begin("writing the name map", result.names.size());
+  HX_JsonWriter json(jsonStream, 2);
+  HX_TextPieces csv(csvStream);
+  csv.text += "id,template,formal,actual,changes,source\r\n";
+  beginJson(json);
   for (const HX_FormedName* name : result.names) {
-    appendCsv(out.text, name->wanted->id, ',');
-    appendCsv(out.text, *name->wanted->nameTemplate->shown, ',');
-    appendCsv(out.text, HX_ToUtf8(name->formal()), ',');
-    appendCsv(out.text, HX_ToUtf8(name->actual), ',');
-    appendCsv(out.text, HX_JoinedChanges(*name, "; "), ',');
-    appendCsv(out.text, name->sourcePath(), '\r');
-    out.text += '\n';
-    out.endPiece();
+    const std::string path = name->sourcePath();
+    writeName(json, *name, path);
+    writeCsvLine(csv.text, *name, path);
+    csv.endPiece();
+    progress.step();
   }
+  endJson(json, result);
 }

@@ -5,11 +5,15 @@
 
 #include <iosfwd>
 
+#include "host/base/HX_Progress.h"
 #include "host/names/HX_FormedName.h"
 
-/// Writes name by name: a large map never stands in memory as a whole.
+// Both write name by name: a large map never stands in memory as a whole.
+
 void HX_WriteJson(std::ostream& out, const HX_RunResult& result);
-/// One line per name (RFC 4180): id, template, formal, actual, changes, source.
-void HX_WriteCsv(std::ostream& out, const HX_RunResult& result);
+/// The same JSON, and CSV with one line per name (RFC 4180): id, template,
+/// formal, actual, changes, source.
+void HX_WriteNameMap(std::ostream& json, std::ostream& csv,
+                     const HX_RunResult& result, HX_Progress& progress);
 
 #endif  // HOST_WRITE_HX_NAMEMAP_H

@@ -25,20 +25,23 @@ std::string padded(const std::string& text, std::size_t width) {
          std::string(std::max(width, widthOf(text)) - widthOf(text), ' ');
 }
 
-// The lines of a table; the last column is not padded.
-std::vector<std::string> aligned(const std::vector<Row>& rows) {
-  std::vector<std::size_t> widths(rows.front().size() - 1, 0);
-  for (const Row& row : rows) {
-    for (std::size_t i = 0; i < widths.size(); ++i)
-      widths[i] = std::max(widths[i], widthOf(row[i]));
-  }
-  std::vector<std::string> lines(rows.size());
-  for (std::size_t line = 0; line < rows.size(); ++line) {
-    for (std::size_t i = 0; i < widths.size(); ++i)
-      lines[line] += padded(rows[line][i], widths[i]) + "  ";
-    lines[line] += rows[line].back();
-  }
-  return lines;
+void widen(std::vector<std::size_t>& widths, const Row& row) {
+  for (std::size_t i = 0; i < widths.size(); ++i)
+    widths[i] = std::max(widths[i], widthOf(row[i]));
+}
+
+// Of all columns but the last column, which is not padded.
+std::vector<std::size_t> widthsOf(const Row& row) {
+  std::vector<std::size_t> widths(row.size() - 1, 0);
+  widen(widths, row);
+  return widths;
+}
+
+std::string aligned(const Row& row, const std::vector<std::size_t>& widths) {
+  std::string line;
+  for (std::size_t i = 0; i < widths.size(); ++i)
+    line += padded(row[i], widths[i]) + "  ";
+  return line + row.back();
 }
 
 // The end of a path tells more than its beginning.
@@ -53,8 +56,17 @@ std::string shortPath(const std::string& path) {
 std::string lineOf(const HX_Finding& finding, const std::string& knownSource) {
   const bool isKnown = finding.source.empty() || finding.source == knownSource;
   return padded(HX_MessageHandler::severityName(finding.severity), 8) +
-         padded(std::to_string(finding.id), 7) + finding.text +
-         (isKnown ? "" : "  [" + finding.source + "]");
+         padded(std::to_string(finding.id), 7) + HX_Visible(finding.text) +
+         (isKnown ? "" : "  [" + HX_Visible(finding.source) + "]");
+}
+
+Row rowOf(const HX_FormedName& name) {
+  return {HX_Visible(name.wanted->id),
+          shortPath(HX_Visible(name.sourcePath())),
+          orDash(HX_Visible(*name.wanted->nameTemplate->shown)),
+          orDash(HX_ToUtf8(name.formal())),
+          orDash(HX_ToUtf8(name.actual)),
+          name.isComplete ? "yes" : "no"};
 }
 
 template <class Item, class TextOf>
@@ -67,25 +79,30 @@ void writeOrder(std::ostream& out, const char* what,
 
 }  // namespace
 
-void HX_WriteTable(std::ostream& out, const HX_RunResult& result) {
-  std::vector<Row> rows{
-      {"name", "source", "template", "formal", "actual", "complete"}};
-  for (const HX_FormedName* name : result.names)
-    rows.push_back({name->wanted->id, shortPath(name->sourcePath()),
-                    orDash(*name->wanted->nameTemplate->shown),
-                    orDash(HX_ToUtf8(name->formal())),
-                    orDash(HX_ToUtf8(name->actual)),
-                    name->isComplete ? "yes" : "no"});
-  const std::vector<std::string> lines = aligned(rows);
-  out << lines[0] << '\n' << std::string(widthOf(lines[0]), '-') << '\n';
-  for (std::size_t i = 0; i < result.names.size(); ++i) {
-    const HX_FormedName& name = *result.names[i];
-    out << lines[i + 1] << '\n';
-    if (!name.changes.empty())
-      out << "    changed: " << HX_JoinedChanges(name, ", ") << '\n';
-    for (const HX_Finding& finding : name.findings)
-      out << "    " << lineOf(finding, name.sourcePath()) << '\n';
+// In two passes, for widths and for lines: the table never stands in memory.
+void HX_WriteTable(std::ostream& out, const HX_RunResult& result,
+                   HX_Progress& progress) {
+  progress.begin("measuring the table", result.names.size());
+  const Row head = {"name",   "source", "template",
+                    "formal", "actual", "complete"};
+  std::vector<std::size_t> widths = widthsOf(head);
+  for (const HX_FormedName* name : result.names) {
+    widen(widths, rowOf(*name));
+    progress.step();
   }
+  progress.begin("printing", result.names.size());
+  const std::string first = aligned(head, widths);
+  out << first << '\n' << std::string(widthOf(first), '-') << '\n';
+  for (const HX_FormedName* name : result.names) {
+    out << aligned(rowOf(*name), widths) << '\n';
+    if (!name->changes.empty())
+      out << "    changed: " << HX_Visible(HX_JoinedChanges(*name, ", "))
+          << '\n';
+    for (const HX_Finding& finding : name->findings)
+      out << "    " << lineOf(finding, name->sourcePath()) << '\n';
+    progress.step();
+  }
+  progress.end();
   writeOrder(out, "Types", result.types,
              [](const HX_TypeItem& type) { return type.name; });
   writeOrder(out, "Variables", result.variables,
@@ -103,8 +120,11 @@ void HX_WriteExplanation(std::ostream& out, const HX_FormedName& name,
   out << "source    " << orDash(name.sourcePath()) << "\n\n";
   std::vector<Row> rows{{"macro", "gives", "which is"}};
   for (const HX_ExplainedMacro& step : steps)
-    rows.push_back({step.macro, orDash(step.value), step.origin});
-  for (const std::string& line : aligned(rows)) out << "  " << line << '\n';
+    rows.push_back({HX_Visible(step.macro), orDash(HX_Visible(step.value)),
+                    HX_Visible(step.origin)});
+  std::vector<std::size_t> widths = widthsOf(rows.front());
+  for (const Row& row : rows) widen(widths, row);
+  for (const Row& row : rows) out << "  " << aligned(row, widths) << '\n';
   out << "\nformal    " << orDash(HX_ToUtf8(name.formal())) << "\nactual    "
       << orDash(HX_ToUtf8(name.actual)) << '\n';
   for (const HX_Change& change : name.changes)
