@@ -30,6 +30,21 @@ void readWordList(Reading& r, const Value& value) {
         "the name of a word list in " + HX_Visible(r.keywordFolders.back()));
 }
 
+// Words that a compiler of some edition refuses: the same code compiles as C90
+// to C23, with GNU extensions, and its headers as C++.
+constexpr const char* kLanguageLists[] = {"c99", "c11", "c23", "cpp20",
+                                          "gnu_c"};
+constexpr const char* kLibraryLists[] = {"main", "std_c90", "std_c99",
+                                         "std_c11", "std_c23"};
+
+void readInstalledList(const std::vector<std::string>& folders,
+                       const std::string& list, std::set<std::string>& words) {
+  for (const std::string& folder : folders)
+    if (HX_ReadWordList(folder + "/" + list + ".txt", words)) return;
+  throw HX_InputError(HX_Visible(folders.front()) + "/" + list +
+                      ".txt: cannot be read: expected a word list");
+}
+
 constexpr HX_FieldBinding kBindings[] = {
     {"$schema", [](Reading&, const Value&) {}},
     {"model.name",
@@ -105,6 +120,10 @@ HX_Model::HX_Model(HX_Document& document,
   HX_DdTree::instance().clear();
   GLB_SetModelName("");
   GLB_SetSubsystemName("");
+  for (const char* list : kLanguageLists)
+    readInstalledList(keywordFolders, list, words);
+  for (const char* list : kLibraryLists)
+    readInstalledList(keywordFolders, list, libraryWords);
   HX_ModelReading reading(*this, document.faults, keywordFolders);
   if (HX_ReadDocument(document, reading, progress)) {
     progress.begin("building the model");

@@ -65,9 +65,11 @@ struct HX_Model {
   ~HX_Model();
 
   std::string name;
-  std::set<std::string> words;  // of the word lists
+  std::set<std::string> words;  // of the word lists, and words of every C
+  std::set<std::string> libraryWords;  // main, and names of the C library
   unsigned int patterns = 0;    // HX_ReservedNames::HxEPatternTag
   HX_Significance significance;
+  HX_CodeOptions code;
   std::deque<HX_TypeItem> types;
   std::deque<HX_ScopeItem> scopes;  // parents first
   HX_ScopeItem* fileScope = nullptr;

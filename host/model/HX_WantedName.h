@@ -12,6 +12,7 @@
 
 #include "Naming/HxCNames.h"
 #include "SourceRef/HxCSrcRefSet.h"
+#include "host/model/HX_CodeOptions.h"
 #include "host/model/HX_Kinds.h"
 #include "host/model/HX_Types.h"
 #include "platform/model/HxCSymbol.h"
@@ -54,6 +55,8 @@ struct HX_RareWishes {
   std::optional<KyCXString> message;
   std::optional<KyCXString> messageVariable;
   std::optional<KyCXString> osObject;
+  HX_Placement placement;
+  std::string unit;
   double period = 0;
   double offset = 0;
   bool cyclic = true;

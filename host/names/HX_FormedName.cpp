@@ -21,7 +21,9 @@ constexpr const char* kReasons[] = {"",
                                     "held by the lock for",
                                     "retired by the lock with",
                                     "name of the lock",
-                                    "without a free variant"};
+                                    "without a free variant",
+                                    "name of the C library",
+                                    "macro of the generated code"};
 
 bool hasError(const std::vector<HX_Finding>& findings) {
   return std::any_of(findings.begin(), findings.end(),

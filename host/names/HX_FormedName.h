@@ -31,7 +31,9 @@ struct HX_Change {
     eHeld,        ///< the lock holds the name for the item in detail
     eRetired,     ///< the lock keeps the name of the item in detail
     eLocked,      ///< name of the lock
-    eNoVariant    ///< every variant is taken
+    eNoVariant,   ///< every variant is taken
+    eLibrary,     ///< function or object of the C library
+    eMacro        ///< macro that the generated code defines
   };
 
   HxEReasonTag reason = eNone;
@@ -43,6 +45,13 @@ struct HX_Change {
   std::string text() const;
 };
 
+/// Where a name is declared in the generated code.
+struct HX_CodePlace {
+  enum HxEFileTag { eNone, eHeader, eSource };
+  HxEFileTag file = eNone;
+  int line = 0;  // from 1
+};
+
 struct HX_FormedName {
   explicit HX_FormedName(const HX_WantedName& name) : wanted(&name) {}
 
@@ -50,6 +59,7 @@ struct HX_FormedName {
   KyCXString actual;
   bool isComplete = false;
   bool isDefined = false;  // stands in a scope and may be written into code
+  mutable HX_CodePlace code;  // entered by the writer of the code
   std::vector<HX_Change> changes;
   std::vector<HX_Finding> findings;
 

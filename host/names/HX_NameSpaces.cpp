@@ -3,6 +3,7 @@
 #include <new>
 
 #include "host/base/HX_Text.h"
+#include "host/names/HX_CFiles.h"
 
 namespace {
 
@@ -11,6 +12,11 @@ std::string pathOf(const HX_ScopeItem& scope) {
   return scope.parent == nullptr ? scope.id
                                  : pathOf(*scope.parent) + "/" + scope.id;
 }
+
+// Compilers define macros and types of these forms, in any number.
+constexpr unsigned int kCompilerPatterns =
+    HX_ReservedNames::ePatternUnderscoreCapital |
+    HX_ReservedNames::ePatternFirstUnderscores;
 
 HX_Change::HxEReasonTag wordReason(HxCNames::tagHxEDictEntryType kind) {
   switch (kind) {
@@ -29,8 +35,10 @@ HX_Change::HxEReasonTag wordReason(HxCNames::tagHxEDictEntryType kind) {
 HX_NameSpaces::HX_NameSpaces(const HX_Model& model,
                              const std::vector<const HX_TypeItem*>& types,
                              HX_NameLock* lock) {
+  m_Library.reason = HX_Change::eLibrary;
+  m_Macro.reason = HX_Change::eMacro;
   m_Patterns.setPatterns(model.patterns);
-  m_Safe.setReserved(&m_Patterns);
+  m_CodePatterns.setPatterns(model.patterns | kCompilerPatterns);
   m_Safe.setSignificance(model.significance.internal,
                          model.significance.external,
                          model.significance.ignoresCase);
@@ -44,11 +52,22 @@ HX_NameSpaces::HX_NameSpaces(const HX_Model& model,
   HxCNames::boot();
   for (const std::string& word : model.words)
     m_Names.addToKeywordDict(word.c_str(), HxCNames::eDictCKeyword);
+  reserveWordsOfCode(model.libraryWords, m_Scopes.at(model.fileScope));
   reserve(types, m_Scopes.at(model.fileScope));
   if (lock != nullptr && !m_Safe.useLock(lock)) throw std::bad_alloc();
 }
 
 HX_NameSpaces::~HX_NameSpaces() { HxCNames::shutdown(); }
+
+void HX_NameSpaces::reserveWordsOfCode(
+    const std::set<std::string>& libraryWords, HX_SafeNames::Scope* file) {
+  for (const std::string& macro : HX_CFiles::ofModel().macros()) {
+    m_Macros.insert(macro);
+    m_Safe.reserveName(macro.c_str(), file, &m_Macro);
+  }
+  for (const std::string& word : libraryWords)
+    m_Safe.reserveName(word.c_str(), file, &m_Library);
+}
 
 // Names of types are given, not formed. Each name is checked before the name
 // becomes a reserved word.
@@ -85,7 +104,14 @@ void HX_NameSpaces::check(const std::string& name, HX_TokenEnd place) {
       conflict.reason = HX_Change::eType;
       break;
     default:
-      return;
+      if (m_Macros.count(name) != 0)
+        conflict.reason = HX_Change::eMacro;
+      else if (const unsigned int pattern = HX_ReservedNames::matching(
+                   name.c_str(), kCompilerPatterns, true))
+        conflict = {HX_Change::ePattern, nullptr,
+                    HX_ReservedNames::patternName(pattern)};
+      else
+        return;
   }
   m_ReservedUses.push_back({name, place, conflict});
 }
@@ -101,6 +127,9 @@ bool HX_NameSpaces::define(const HX_WantedName& name, HxCCIdentifier& id,
   request.isExternal = name.scope->kind == HX_ScopeKind::eFile;
   request.symbol = &symbol;
   request.item = name.id;
+  const bool isCode =
+      name.kind == HX_NameKind::eVariable || name.isFunction();
+  m_Safe.setReserved(isCode ? &m_CodePatterns : &m_Patterns);
   const bool isDefined = m_Safe.define(id, request, safe);
   if (!isDefined) m_Symbols.pop_back();
   if (safe.stepCount() > 0 &&
@@ -128,7 +157,7 @@ HX_Change HX_NameSpaces::changeOf(const HX_SafeName::Step& step) {
       return {HX_Change::ePattern, nullptr, step.reason};
     case HX_SafeName::eTaken:
       if (step.symbol == nullptr) return {HX_Change::eTakenByConstant};
-      return {HX_Change::eTakenByName,
+      return {static_cast<const Symbol*>(step.symbol)->reason,
               static_cast<const Symbol*>(step.symbol)->owner};
     case HX_SafeName::eIndistinct:
       return {HX_Change::eIndistinct, nullptr, other()};

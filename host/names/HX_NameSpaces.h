@@ -10,6 +10,7 @@
 
 #include <deque>
 #include <map>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -22,8 +23,9 @@
 /// In file, function and block scopes a name is taken if the scope, an outer
 /// scope or an inner scope holds the name: no variable hides another variable.
 /// In a flat scope a name is taken if the scope holds the name. Reserved words
-/// are taken everywhere. The keyword dictionary of the library lives as long as
-/// this object.
+/// are taken everywhere, names of the C library and macros of the generated
+/// code in the file scope and the scopes inside. The keyword dictionary of the
+/// library lives as long as this object.
 class HX_NameSpaces {
  public:
   /// Reserves the words of the model and the names of \p types, constants in
@@ -61,16 +63,24 @@ class HX_NameSpaces {
   struct Symbol : HxCSymbol {
     using HxCSymbol::HxCSymbol;
     const HX_WantedName* owner = nullptr;
+    HX_Change::HxEReasonTag reason = HX_Change::eTakenByName;
   };
 
   void reserve(const std::vector<const HX_TypeItem*>& types,
                HX_SafeNames::Scope* file);
+  void reserveWordsOfCode(const std::set<std::string>& libraryWords,
+                          HX_SafeNames::Scope* file);
   void check(const std::string& name, HX_TokenEnd place);
 
   HX_ReservedNames m_Patterns;
+  HX_ReservedNames m_CodePatterns;  // for names of the code
   HX_SafeNames m_Safe;
   std::map<const HX_ScopeItem*, HX_SafeNames::Scope*> m_Scopes;
   std::deque<Symbol> m_Symbols;
+  // Stand for each name of the C library and for each macro of the code.
+  Symbol m_Library{KyCXString(), HxCSymbol::eVariable, nullptr};
+  Symbol m_Macro{KyCXString(), HxCSymbol::eVariable, nullptr};
+  std::set<std::string> m_Macros;
   std::vector<ReservedUse> m_ReservedUses;
   HxCNames m_Names;
 };

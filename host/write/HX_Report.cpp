@@ -94,6 +94,8 @@ int bitsOf(HX_Change::HxEReasonTag reason) {
     case HX_Change::eType:
       return kChanged | kReserved;
     case HX_Change::ePattern:
+    case HX_Change::eLibrary:
+    case HX_Change::eMacro:
       return kChanged | kReserved;
     case HX_Change::eRewritten:
     case HX_Change::eLocked:

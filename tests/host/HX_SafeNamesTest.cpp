@@ -120,7 +120,7 @@ TEST_F(HostSafeNamesTest, DiffTellsReasonsAndGivesAScriptForSed) {
   const Json before = modelOf({variable("a", "x"), variable("b", "x"),
                                variable("c", "v"), variable("d", "w")});
   const Json after = modelOf({variable("b", "x"), variable("c", "w"),
-                              variable("d", "v"), variable("e", "new")});
+                              variable("d", "v"), variable("e", "fresh")});
   ASSERT_EQ(0, generateLocked(before).code);
   const fs::path oldMap = m_Folder / "old_map.json";
   const fs::path oldLock = m_Folder / "old.lock";
@@ -137,7 +137,7 @@ TEST_F(HostSafeNamesTest, DiffTellsReasonsAndGivesAScriptForSed) {
       "renamed  b  x_a -> x  (no longer taken by 'a')\n"
       "renamed  c  v -> w  (template v -> w)\n"
       "renamed  d  w -> v  (template w -> v)\n"
-      "added  e  new\n"
+      "added  e  fresh\n"
       "0 kept, 1 added, 1 removed, 3 renamed\n";
   EXPECT_EQ(documents,
             codegen("diff " + oldModel.string() + " " + newModel).out);
@@ -147,7 +147,7 @@ TEST_F(HostSafeNamesTest, DiffTellsReasonsAndGivesAScriptForSed) {
       "renamed  b  x_a -> x\n"
       "renamed  c  v -> w  (wanted v -> w)\n"
       "renamed  d  w -> v  (wanted w -> v)\n"
-      "added  e  new\n"
+      "added  e  fresh\n"
       "0 kept, 1 added, 1 removed, 3 renamed\n",
       codegen("diff " + oldLock.string() + " " + m_Lock.string()).out);
 
