@@ -76,7 +76,7 @@ void HX_Generator::run(HX_NameLock* lock) {
 std::size_t HX_Generator::write(HX_Output& output) {
   const HX_Profile::Phase phase(profile, "Write C");
   sortById(result.names);
-  HX_CWriter(*model, result, progress).write(output);
+  HX_CWriter(*model, result, "", progress).write(output);
   HX_WriteNameMap(output.open("name_map.json"), output.open("name_map.csv"),
                   result, progress);
   progress.end();
