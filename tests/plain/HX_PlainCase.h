@@ -67,6 +67,7 @@ class LibraryModel {
   LibraryModel& operator=(const LibraryModel&) = delete;
   ~LibraryModel();
 
+  std::size_t ownRefs() const { return blocks.size() + objects.size(); }
   /// The index of a reference, kNone for null.
   int indexOf(const HxCSrcRef* ref) const;
   /// Messages since the last call, as of the plain form.

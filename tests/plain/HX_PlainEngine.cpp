@@ -36,10 +36,7 @@ bool Names::createNameFromForm(Id& id, int type, Bits retained,
     createSingleNameFromForm(id, type, retained, provisional, suppressMessages);
     const auto from = Id::eFormalName, to = Id::eActualName;
     id.setCookedName(id.getCookedName(Id::eActiveName), to);
-    // "$R" on one side of an empty or periodic template can match twice.
-    const bool matchedR = actual != formal;
-    id.setIdentifierChangeable(id.getIdentifierChangeable(from) || matchedR,
-                               to);
+    id.setIdentifierChangeable(id.getIdentifierChangeable(from) || hasR, to);
     id.setDollarLUsed(id.getDollarLUsed(from), to);
     id.setDollarEUsed(id.getDollarEUsed(from), to);
     id.setDollarNUsed(id.getDollarNUsed(from), to);

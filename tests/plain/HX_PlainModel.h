@@ -103,6 +103,7 @@ struct Model {
   int system = kNone;     // the generated system among the inputs
   std::vector<Ref> refs;  // first of all blocks, then of all objects, more
 
+  std::size_t ownRefs() const { return blocks.size() + objects.size(); }
   int blockRef(int block) const { return block; }
   int objectRef(int object) const {
     return static_cast<int>(blocks.size()) + object;

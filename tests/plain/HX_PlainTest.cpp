@@ -22,7 +22,7 @@ TEST_F(PlainTest, NamesAnswerAsThePlainForm) {
 
 TEST_F(PlainTest, SourceReferencesAnswerAsThePlainForm) {
   const std::string difference = plain::smallestDifference(
-      HX_Seed(), caseCount(600), 400, plain::differenceOfSrcRefs);
+      HX_Seed(), caseCount(1'500), 400, plain::differenceOfSrcRefs);
   EXPECT_TRUE(difference.empty()) << difference;
 }
 
