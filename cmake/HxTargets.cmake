@@ -1,5 +1,12 @@
 # Settings of every target of this project. No setting is global.
 
+# Compiles several sources of a library as one where HX_UNITY asks for that.
+# Sources of such a library use different local names.
+function(hx_target_unity target)
+  set_target_properties(${target} PROPERTIES
+    UNITY_BUILD ${HX_UNITY} UNITY_BUILD_BATCH_SIZE 12)
+endfunction()
+
 # Language, visibility, warnings and exact floating point for one target.
 function(hx_target_defaults target)
   target_compile_features(${target} PUBLIC cxx_std_20)
@@ -31,6 +38,8 @@ function(hx_target_defaults target)
       $<$<CXX_COMPILER_ID:GNU>:-Wno-restrict>
       $<$<CXX_COMPILER_ID:GNU>:-Wno-stringop-overflow>
       $<$<CXX_COMPILER_ID:GNU>:-Wno-stringop-overread>
+      # A unity build includes sources as if they were headers.
+      $<$<AND:$<BOOL:${HX_UNITY}>,$<CXX_COMPILER_ID:GNU>>:-Wno-subobject-linkage>
       # A double operation rounds once, to double: no fused multiply-add, and
       # on 32-bit x86 no 80-bit intermediate results.
       -ffp-contract=off)

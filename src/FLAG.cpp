@@ -12,7 +12,7 @@
 
 namespace {
 
-constexpr char kErrorCode[] = __FILE__ "_";
+constexpr char kFlagErrorCode[] = __FILE__ "_";
 constexpr char kReportHead[] = "Flag conflict found ! Flag ";
 
 using Text = std::basic_string<char, std::char_traits<char>,
@@ -21,7 +21,7 @@ using Text = std::basic_string<char, std::char_traits<char>,
 // The row of flag; -1, after the assertion, if the table has none.
 int rowOfFlag(unsigned int flag, int rowCount) {
   const int row = IMS_Log2(flag);
-  return HX_Assert(row < rowCount, kErrorCode) ? row : -1;
+  return HX_Assert(row < rowCount, kFlagErrorCode) ? row : -1;
 }
 
 const char* nameOf(const FLAG_flag_info& row) {
@@ -75,12 +75,12 @@ template struct HX_ExportInline<
     &FLAG_GetNumberOfFlagsInField, &FLAG_GetIthFlag, &FLAG_GetIthFlagInField,
     &FLAG_CompareFlagfields>;
 
-void hx_detail::failClearAll() { HX_Assert(false, kErrorCode); }
-void hx_detail::failClearFlag() { HX_Assert(false, kErrorCode); }
-void hx_detail::failSetFlag() { HX_Assert(false, kErrorCode); }
-void hx_detail::failGetFlag() { HX_Assert(false, kErrorCode); }
-void hx_detail::failGetFlags() { HX_Assert(false, kErrorCode); }
-void hx_detail::failGetAllFlags() { HX_Assert(false, kErrorCode); }
+void hx_detail::failClearAll() { HX_Assert(false, kFlagErrorCode); }
+void hx_detail::failClearFlag() { HX_Assert(false, kFlagErrorCode); }
+void hx_detail::failSetFlag() { HX_Assert(false, kFlagErrorCode); }
+void hx_detail::failGetFlag() { HX_Assert(false, kFlagErrorCode); }
+void hx_detail::failGetFlags() { HX_Assert(false, kFlagErrorCode); }
+void hx_detail::failGetAllFlags() { HX_Assert(false, kFlagErrorCode); }
 
 unsigned int* FLAG_NewField() {
   auto* field =

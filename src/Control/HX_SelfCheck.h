@@ -1,8 +1,8 @@
 // The two self-checks of the library.
 //
-//   namespace { constexpr char kErrorCode[] = __FILE__ "_"; }
+//   namespace { constexpr char kNodeErrorCode[] = __FILE__ "_"; }
 //
-//   if (!HX_Assert(field != nullptr, kErrorCode)) return;  // an invariant
+//   if (!HX_Assert(field != nullptr, kNodeErrorCode)) return;  // an invariant
 //   HX_DebugCheck(success, "success");                     // for developers
 
 #ifndef CONTROL_HX_SELFCHECK_H

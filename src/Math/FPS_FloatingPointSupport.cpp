@@ -57,7 +57,7 @@
 
 namespace {
 
-constexpr char kErrorCode[] = __FILE__ "_";
+constexpr char kFpsErrorCode[] = __FILE__ "_";
 
 constexpr int kUnsigned32 = 11;  // type codes of the data type server
 constexpr int kSigned32 = 15;
@@ -131,7 +131,7 @@ bool isIntegerValue(double x) {
 
 // The integer for a value near an integer.
 double snap(double x) {
-  HX_Assert(isIntegerValue(x), kErrorCode);
+  HX_Assert(isIntegerValue(x), kFpsErrorCode);
   const double nearest = std::floor(x + 0.5);
   if (x > 0.0) return truncate(nearest > x ? x + 1.0 : x);
   return truncate(nearest < x ? x - 1.0 : x);
@@ -201,9 +201,9 @@ void ModInit_FPS_FloatingPointSupport() {
   s_PosInf = HUGE_VAL;
   s_NegInf = -s_PosInf;
   s_Pi = std::atan(1.0) * 4.0;
-  HX_Assert(std::isnan(s_NaN), kErrorCode);
-  HX_Assert(!std::isfinite(s_PosInf), kErrorCode);
-  HX_Assert(!std::isfinite(s_NegInf), kErrorCode);
+  HX_Assert(std::isnan(s_NaN), kFpsErrorCode);
+  HX_Assert(!std::isfinite(s_PosInf), kFpsErrorCode);
+  HX_Assert(!std::isfinite(s_NegInf), kFpsErrorCode);
 }
 
 double FPS_GetFlNaN() { return s_NaN; }
@@ -246,7 +246,7 @@ int FPS_SatCastToInt(double x) { return satCastToInt(x); }
 long long FPS_SatCastToInt64(double x) { return satCastToInt64(x); }
 
 std::uint32_t FPS_SatCastToULong(double x) {
-  if (!HX_Assert(!(x < 0.0), kErrorCode) || DT_GetMax(kUnsigned32) > x) {
+  if (!HX_Assert(!(x < 0.0), kFpsErrorCode) || DT_GetMax(kUnsigned32) > x) {
     return static_cast<std::uint32_t>(satCastToInt64(x));
   }
   return static_cast<std::uint32_t>(DT_GetMaxAsInt64(kUnsigned32));
@@ -357,7 +357,7 @@ double FPS_FindGreatestCommonDivisor(double* pair) {
   double a = pair[0];
   double b = pair[1];
   for (;;) {
-    HX_Assert(false, kErrorCode);  // callers are to use the integer form
+    HX_Assert(false, kFpsErrorCode);  // callers are to use the integer form
     if (b == 0.0) return std::isnan(a) ? returnSpecial(a) : a;
     if (std::isnan(b)) return returnSpecial(b);
     const double remainder = std::fmod(a, b);

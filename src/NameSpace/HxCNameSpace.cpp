@@ -6,7 +6,7 @@
 
 namespace {
 
-constexpr char kErrorCode[] = "HxCNameSpace";
+constexpr char kNameSpaceErrorCode[] = "HxCNameSpace";
 
 bool symbolOf(const HxCSmbScopeData* data, HxCSymbol*& symbol,
               const char* expression) {
@@ -24,7 +24,7 @@ HxCNameSpace::HxCNameSpace(HxCXStringIdServer* idServer)
     : m_pIdServer(idServer), m_DebugIndex(sm_ObjectCount++) {}
 
 HxCNameSpace::Scope* HxCNameSpace::newEnv() {
-  if (!HX_Assert(m_pScope == nullptr, kErrorCode)) return m_pScope;
+  if (!HX_Assert(m_pScope == nullptr, kNameSpaceErrorCode)) return m_pScope;
   return newScope(nullptr);
 }
 
@@ -125,11 +125,11 @@ HxCSmbScopeData* HxCNameSpace::createScopeData(HxCSymbol* symbol) {
 }
 
 bool HxCNameSpace::hasScope() const {
-  return HX_Assert(m_pScope != nullptr, kErrorCode);
+  return HX_Assert(m_pScope != nullptr, kNameSpaceErrorCode);
 }
 
 // The server reports by itself that the server is down.
 bool HxCNameSpace::keyOf(const KyCXString& s, int& key) const {
-  return HX_Assert(m_pIdServer != nullptr, kErrorCode) &&
+  return HX_Assert(m_pIdServer != nullptr, kNameSpaceErrorCode) &&
          m_pIdServer->findOrAdd(s, key);
 }

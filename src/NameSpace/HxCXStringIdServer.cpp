@@ -33,7 +33,7 @@
 
 namespace {
 
-constexpr char kErrorCode[] = __FILE__ "_";
+constexpr char kIdServerErrorCode[] = __FILE__ "_";
 
 }  // namespace
 
@@ -60,11 +60,11 @@ int HxCXStringIdServer::getId(const KyCXString& s) {
 }
 
 int HxCXStringIdServer::getId(const KyCXString* s) {
-  return HX_Assert(s != nullptr, kErrorCode) ? getId(*s) : 0;
+  return HX_Assert(s != nullptr, kIdServerErrorCode) ? getId(*s) : 0;
 }
 
 bool HxCXStringIdServer::findOrAdd(const KyCXString& s, int& id) {
-  if (!HX_Assert(m_pTable != nullptr, kErrorCode)) return false;
+  if (!HX_Assert(m_pTable != nullptr, kIdServerErrorCode)) return false;
   if (s.isEmpty()) {
     id = 0;
     return true;
@@ -111,6 +111,6 @@ bool HxCXStringIdServer::add(int hash, const char* text, std::size_t length,
 }
 
 const char* HxCXStringIdServer::refuseText() {
-  HX_Assert(false, kErrorCode);
+  HX_Assert(false, kIdServerErrorCode);
   return nullptr;
 }

@@ -6,7 +6,7 @@
 
 namespace {
 
-constexpr char kErrorCode[] = __FILE__ "_";
+constexpr char kFallThroughErrorCode[] = __FILE__ "_";
 constexpr char kText[] = "trace fall through - early abortion";
 
 using Emitter = void (*)(const HxCSrcRef*, const char*);
@@ -24,7 +24,7 @@ bool report(Emitter emit, const Place&... place) {
 template <class... Place>
 bool reportDeadly(const Place&... place) {
   if (HxCTraceFallThrough::verbose()) return report(ERR_Msg1275, place...);
-  HX_Assert(false, kErrorCode);
+  HX_Assert(false, kFallThroughErrorCode);
   return false;
 }
 

@@ -4,7 +4,7 @@
 #         -P BuildExample.cmake
 set(example ${SOURCE}/docs/example)
 foreach(step IN ITEMS
-    "-G;${GENERATOR};-S;${example};-B;${WORK};-DHX_SOURCE=${SOURCE};-DCMAKE_CXX_COMPILER=${COMPILER}"
+    "-G;${GENERATOR};-S;${example};-B;${WORK};-DHX_SOURCE=${SOURCE};-DHX_UNITY=ON;-DCMAKE_CXX_COMPILER=${COMPILER}"
     "--build;${WORK};--target;generator")
   execute_process(COMMAND ${CMAKE_COMMAND} ${step} COMMAND_ERROR_IS_FATAL ANY
                   OUTPUT_QUIET)

@@ -3,7 +3,7 @@
 #   cmake -DSOURCE=<tree> -DWORK=<folder> -DGENERATOR=<name> -DCOMPILER=<c++>
 #         -P BuildForeign.cmake
 foreach(step IN ITEMS
-    "-G;${GENERATOR};-S;${CMAKE_CURRENT_LIST_DIR}/foreign;-B;${WORK};-DHX_SOURCE=${SOURCE};-DCMAKE_CXX_COMPILER=${COMPILER};-DCMAKE_CXX_FLAGS=-O0"
+    "-G;${GENERATOR};-S;${CMAKE_CURRENT_LIST_DIR}/foreign;-B;${WORK};-DHX_SOURCE=${SOURCE};-DHX_UNITY=ON;-DCMAKE_CXX_COMPILER=${COMPILER};-DCMAKE_CXX_FLAGS=-O0"
     "--build;${WORK};--target;foreign")
   execute_process(COMMAND ${CMAKE_COMMAND} ${step} COMMAND_ERROR_IS_FATAL ANY
                   OUTPUT_QUIET)

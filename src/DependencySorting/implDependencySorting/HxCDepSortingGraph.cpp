@@ -29,7 +29,7 @@
 
 namespace {
 
-constexpr char kErrorCode[] = __FILE__ "_";
+constexpr char kGraphErrorCode[] = __FILE__ "_";
 
 // Place in the text of the trace, fixed whatever moves in this file.
 constexpr char kTracedFile[] =
@@ -90,7 +90,7 @@ void HxCDepSortingGraph::append(const Nodes& nodes,
     edges.reserve(dependencies.size());
     for (const auto& [first, second] : dependencies) {
       const Edge edge = {vertexOf.find(first), vertexOf.find(second)};
-      if (HX_Assert(edge.source >= 0 && edge.target >= 0, kErrorCode))
+      if (HX_Assert(edge.source >= 0 && edge.target >= 0, kGraphErrorCode))
         edges.push_back(edge);
     }
   }
