@@ -113,7 +113,7 @@ TEST_F(FaultTest, MissingMemoryIsOneLine) {
   ASSERT_EQ(0, generate(model).code);
   const Files whole = filesIn(m_Out);
   std::set<int> codes;
-  for (int kilobytes = 16000; kilobytes <= 44000; kilobytes += 700) {
+  for (int kilobytes = 14000; kilobytes <= 21000; kilobytes += 175) {
     SCOPED_TRACE(kilobytes);
     fs::remove_all(m_Out);
     const Result result = shell("ulimit -v " + std::to_string(kilobytes) +
