@@ -1,6 +1,7 @@
 #include "plain/HX_PlainCase.h"
 #include "plain/HX_PlainNames.h"
 #include "platform/datadictionary/HX_DdTree.h"
+#include "platform/datadictionary/kyddapi.h"
 #include "platform/messages/HX_MessageHandler.h"
 #include "platform/model/HxCGlobal.h"
 
@@ -195,6 +196,7 @@ std::vector<std::string> LibraryModel::takeMessages() const {
                                : shownMessage(m.row, m.severity, m.text,
                                               indexOf(m.srcRef), m.source));
   handler.clear();
+  if (DDAPIHeapBalance() != 0) texts.push_back("text of the dictionary kept");
   return texts;
 }
 

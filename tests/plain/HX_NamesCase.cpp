@@ -68,7 +68,7 @@ struct Call {
   std::size_t row = 0;
   int id = 0, other = 0, third = 0;  // o, h
   bool flag = false;                 // f
-  Text text;                         // t template, m macro, w word
+  Text text;                         // t template, l label, m macro, w word
   int number = 0;                    // n
   int index = 0;  // r reference, i block, s symbol, T type, or kNone
   unsigned int retained = 0, provisional = 0;  // b
@@ -118,7 +118,7 @@ const auto& rows() {
     HX_DO("setSourceRef", "r", id.setSourceRef(s.ref(c.index))),
     HX_DO("setDdSourceRef", "r", id.setDdSourceRef(s.ref(c.index))),
     HX_DO("setSourceIVBlock", "i", id.setSourceIVBlock(s.ivBlock(c.index))),
-    HX_DO("setSignalLabel", "t", id.setSignalLabel(text)),
+    HX_DO("setSignalLabel", "l", id.setSignalLabel(text)),
     HX_DO("setDollarXValue", "t", id.setDollarXValue(text)),
     HX_DO("activateActualName", "", id.activateActualName()),
     HX_DO("activateFormalName", "", id.activateFormalName()),
@@ -184,67 +184,74 @@ const auto& rows() {
   return kRows;
 }
 
+// A template of macros and other pieces, or of any characters.
 Text templateFrom(Choices& c) {
-  return c.text("text", 6,
-                {u"x",
-                 u"_",
-                 u"$B",
-                 u"$S",
-                 u"$L",
-                 u"$C",
-                 u"$O",
-                 u"$D",
-                 u"$N",
-                 u"$E",
-                 u"$R",
-                 u"$X",
-                 u"$T",
-                 u"$I",
-                 u"$M",
-                 u"$H",
-                 u"$$",
-                 u"$",
-                 u":",
-                 u"$P",
-                 u"$V$v",
-                 u"$F$f",
-                 u"$Q",
-                 u"$l$n$e",
-                 u"$(Type)",
-                 u"$(BaseType)",
-                 u"$(Component)",
-                 u"$(Task)",
-                 u"$(ISR)",
-                 u"$(Event)",
-                 u"$(Msg)",
-                 u"$(MsgVar)",
-                 u"$(Ctr)",
-                 u"$(PObj)",
-                 u"$(Time)",
-                 u"$(Period)",
-                 u"$(Offset)",
-                 u"$(Time1ms)",
-                 u"$(Period10us)",
-                 u"$(Offset100ms)",
-                 u"$(Time1h)",
-                 u"$(Period1d)",
-                 u"$(DataVariantName)",
-                 u"$(Foo)",
-                 u"$(",
-                 u"$(Type",
-                 u"(",
-                 u")",
-                 u"'",
-                 u"$E(a-(b')'))",
-                 u"$x",
-                 u"$t$T",
-                 u"$\u0416",
-                 u"\u00FC",
-                 u" ",
-                 u"9",
-                 u"abcdefghijklmnopqrstuvwxyz",
-                 u"int",
-                 u"#"});
+  Text text = c.text("text", 6,
+                     {u"x",
+                      u"_",
+                      u"$B",
+                      u"$S",
+                      u"$L",
+                      u"$C",
+                      u"$O",
+                      u"$D",
+                      u"$N",
+                      u"$E",
+                      u"$R",
+                      u"$X",
+                      u"$T",
+                      u"$I",
+                      u"$M",
+                      u"$H",
+                      u"$$",
+                      u"$",
+                      u":",
+                      u"$P",
+                      u"$V$v",
+                      u"$F$f",
+                      u"$Q",
+                      u"$l$n$e",
+                      u"$(Type)",
+                      u"$(BaseType)",
+                      u"$(Component)",
+                      u"$(Task)",
+                      u"$(ISR)",
+                      u"$(Event)",
+                      u"$(Msg)",
+                      u"$(MsgVar)",
+                      u"$(Ctr)",
+                      u"$(PObj)",
+                      u"$(DataVariantName)",
+                      u"$(Foo)",
+                      u"$(",
+                      u"$(Type",
+                      u"(",
+                      u")",
+                      u"'",
+                      u"$E(a-(b')'))",
+                      u"$x",
+                      u"$t$T",
+                      u"$\u0142",
+                      u"\u00FC",
+                      u" ",
+                      u"9",
+                      u"abcdefghijklmnopqrstuvwxyz",
+                      u"int",
+                      u"#"});
+  if (c.byte() % 4 == 3) {
+    text += u"$(";
+    text += c.of(nullptr, {u"Time", u"Period", u"Offset"});
+    text += c.of(nullptr, {u"", u"1us", u"10us", u"100us", u"1ms", u"10ms",
+                           u"100ms", u"1s", u"1m", u"1h", u"1d"});
+    text += u")";
+  }
+  if (c.byte() % 12 == 11) text = c.anyText();
+  const int twice = c.byte() % 10;
+  if (twice == 1) text += u":" + text;
+  if (twice == 2) text += u":$R" + text;
+  if (twice == 3) text += u":" + text + u"$R";
+  c.tell(" " + shown(text));
+  return text;
 }
 
 unsigned int bitsFrom(Choices& c, const char* what) {
@@ -267,6 +274,8 @@ void drawArgument(Choices& c, const Model& m, char argument, Call& call) {
   if (argument == 'h') call.third = c.below("third", kIds);
   if (argument == 'f') call.flag = c.flag("flag");
   if (argument == 't') call.text = templateFrom(c);
+  if (argument == 'l')
+    call.text = c.text("label", 4, {u"<", u" ", u"a", u">", u"9-", u"\n"});
   if (argument == 'm')
     call.text =
         c.text("macro", 1,
@@ -359,7 +368,7 @@ std::string differenceOfNames(const std::string& bytes, std::string* log) {
   const std::size_t kSetters = 9, kRows = std::size(rows<PlainSide>());
   for (int id = 0; id < 2; ++id)
     for (std::size_t row = 2; row < kSetters; ++row)
-      if (choices.byte() % 4 > (row > 3 ? 2 : 0)) add(row, id);
+      if (choices.byte() % 4 > (row < 4 ? 0 : row == 4 ? 1 : 2)) add(row, id);
   while (calls.size() < 16 && !choices.isEmpty()) {
     const auto row = static_cast<std::size_t>(choices.byte()) % (2 * kRows);
     add(row < kRows ? row : row % 2, choices.byte() % kIds);

@@ -10,7 +10,18 @@ Text Choices::text(const char* what, int most,
   const int count = byte() % (most + 1);
   for (int i = 0; i < count; ++i)
     result += *(pieces.begin() + byte() % static_cast<int>(pieces.size()));
-  if (!result.empty()) tell(std::string(" ") + what + "=" + shown(result));
+  if (what != nullptr && !result.empty())
+    tell(std::string(" ") + what + "=" + shown(result));
+  return result;
+}
+
+Text Choices::anyText() {
+  Text result;
+  for (int count = byte() % 24; count > 0; --count) {
+    const int unit = byte();
+    if (unit != 0)
+      result += static_cast<char16_t>(unit | (unit < 0xF8 ? 0 : 0xFF00));
+  }
   return result;
 }
 

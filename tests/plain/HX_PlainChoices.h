@@ -40,9 +40,11 @@ class Choices {
     const int i = byte() % static_cast<int>(values.size());
     return told(what, *(values.begin() + i));
   }
-  /// Up to \p most pieces.
+  /// Up to \p most pieces; not logged without a name.
   Text text(const char* what, int most,
             std::initializer_list<const char16_t*> pieces);
+  /// Any units but 0; bytes from 0xF8 on stand for units from 0xFFF8 on.
+  Text anyText();
   void tell(const std::string& text) {
     if (m_pLog != nullptr) *m_pLog += text;
   }
@@ -51,7 +53,7 @@ class Choices {
   template <class T>
   T told(const char* what, T value) {
     if constexpr (std::is_arithmetic_v<T>) {
-      if (m_pLog != nullptr && value != T())
+      if (what != nullptr && m_pLog != nullptr && value != T())
         tell(std::string(" ") + what + "=" + std::to_string(value));
     }
     return value;

@@ -43,7 +43,7 @@ Type typeFrom(Choices& c, const std::vector<Type>& before) {
 
 Ref refFrom(Choices& c, const Model& m) {
   Ref ref;
-  ref.kind = c.of("kind", {Ref::eDd, Ref::eBlock, Ref::eStateflow,
+  ref.kind = c.of("kind", {Ref::eDd, Ref::eDd, Ref::eBlock, Ref::eStateflow,
                            Ref::eInternal, Ref::eOther, Ref::eInput});
   switch (ref.kind) {
     case Ref::eDd: {

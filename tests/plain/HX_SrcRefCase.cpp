@@ -32,7 +32,6 @@ class PlainSide {
   const Model& model;
   std::vector<Ref> refs;
   RefMaker maker;
-  RefSet set;
 };
 
 class LibrarySide {
@@ -52,7 +51,6 @@ class LibrarySide {
   LibraryModel model;
   const HxCSrcRef untouched;
   HxCSrcRefServer server;
-  HxCSrcRefSet set;
 
  private:
   std::deque<std::unique_ptr<HxCSrcRef>> m_Owned;
@@ -196,11 +194,11 @@ const Row kRows[] = {
     {"shutdown and boot", HX_PLAIN(return "true"),
      HX_LIBRARY(return s.server.shutdown() && s.server.boot() ? "true"
                                                               : "false")},
-    {"addSrcRef", HX_PLAIN(add(s.set, int(i))),
-     HX_LIBRARY(s.set.addSrcRef(ref))},
     {"getSpecificSrcRefFromSet",
-     HX_PLAIN(const Specific found =
-                  specific(s.refs, c.isNull ? RefSet() : s.set);
+     HX_PLAIN(RefSet set; for (std::size_t k = 0; k < c.other % 16; ++k)
+                  add(set, int((i + k) % s.count()));
+              const Specific found =
+                  specific(s.refs, c.isNull ? RefSet() : set);
               Result result; for (const int k
                                   : {0, 1, 2}) {
                 const int refs[] = {found.block, found.dd, found.other};
@@ -208,12 +206,13 @@ const Row kRows[] = {
                 result += std::to_string(isWanted ? refs[k] : -2) + " ";
               } return result),
      HX_LIBRARY(
+         HxCSrcRefSet set; for (std::size_t k = 0; k < c.other % 16; ++k)
+                               set.addSrcRef(s.model.refs[(i + k) % s.count()]);
          const HxCSrcRef* found[3]; const HxCSrcRef** places[3];
          for (int k = 0; k < 3; ++k) {
            found[k] = &s.untouched;
            places[k] = (c.number >> k & 1) != 0 ? &found[k] : nullptr;
-         } HxCSrcRefServer::getSpecificSrcRefFromSet(c.isNull ? nullptr
-                                                              : &s.set,
+         } HxCSrcRefServer::getSpecificSrcRefFromSet(c.isNull ? nullptr : &set,
                                                      places[0], places[1],
                                                      places[2]);
          Result result;
