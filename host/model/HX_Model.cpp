@@ -76,6 +76,17 @@ constexpr HX_FieldBinding kBindings[] = {
      [](Reading& r, const Value& v) {
        r.model.significance.external = v.integer();
      }},
+    {"options.code.stdint",
+     [](Reading& r, const Value& v) { r.model.code.usesStdint = v.boolean; }},
+    {"options.code.checkWidths",
+     [](Reading& r, const Value& v) { r.model.code.checksWidths = v.boolean; }},
+    {"options.code.banner",
+     [](Reading& r, const Value& v) { r.model.code.hasBanner = v.boolean; }},
+    {"options.code.comments",
+     [](Reading& r, const Value& v) {
+       if (!r.model.code.comments) r.model.code.comments.emplace();
+       r.model.code.comments->insert(HX_ValueOf(kHxCommentParts, v.text));
+     }},
     {"options.significant.ignoreCase",
      [](Reading& r, const Value& v) {
        r.model.significance.ignoresCase = v.boolean;
@@ -127,6 +138,9 @@ HX_Model::HX_Model(HX_Document& document,
   HX_ModelReading reading(*this, document.faults, keywordFolders);
   if (HX_ReadDocument(document, reading, progress)) {
     progress.begin("building the model");
+    // Headers that the code then includes define macros.
+    if (code.usesStdint || code.checksWidths)
+      readInstalledList(keywordFolders, "std_macros", words);
     if (names.empty() && document.faults.count() > 0)
       reading.nameIds.isWhole = false;
     HX_ResolveSources(reading);

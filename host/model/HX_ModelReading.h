@@ -178,8 +178,17 @@ struct HX_ListedUse {
   HX_Use use;
 };
 
+/// Where a variable wishes qualifiers and a place in memory; 0 for nowhere.
+struct HX_PlacementPlaces {
+  HX_TokenEnd any = 0;  // the last wish
+  HX_TokenEnd isStatic = 0;
+  HX_TokenEnd section = 0;
+  HX_TokenEnd alignment = 0;
+};
+
 /// Uses of a name that few names have.
 struct HX_RareUses {
+  HX_PlacementPlaces placement;
   HX_Use symbolType;
   HX_Use task;
   HX_Use isr;
@@ -251,6 +260,14 @@ void HX_ResolveNames(HX_ModelReading& reading);
 /// The type of \p use if the code can declare a variable of the type; else a
 /// fault, and null.
 HX_TypeItem* HX_FindDeclarableType(HX_ModelReading& reading, const HX_Use& use);
+
+/// Checks the initial values of a variable whose type is whole.
+/// \param place  of the last value; 0 for no value
+void HX_CheckInitial(HX_ModelReading& reading, HX_TokenEnd place,
+                     const HX_WantedName& name);
+
+/// Checks sections, alignments and static variables of all names.
+void HX_CheckPlacements(HX_ModelReading& reading);
 
 /// Reads the text of \p document by the schema; faults go to \p reading.
 /// \return false if the reading stopped before the end of the document

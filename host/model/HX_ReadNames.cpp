@@ -66,6 +66,27 @@ void addListed(Reading& r, const Value& value) {
 HX_Ids& sourceIds(Reading& r) { return r.sources.ids; }
 HX_Ids& nameIds(Reading& r) { return r.nameIds; }
 
+template <auto member>
+void setPlacement(Reading& r, const Value& value) {
+  rare(r).placement.*member = value.boolean;
+  uses(r).placement.any = value.place;
+}
+
+void setStatic(Reading& r, const Value& value) {
+  setPlacement<&HX_Placement::isStatic>(r, value);
+  uses(r).placement.isStatic = value.place;
+}
+
+void setSection(Reading& r, const Value& value) {
+  rare(r).placement.section = value.text;
+  uses(r).placement.any = uses(r).placement.section = value.place;
+}
+
+void setAlignment(Reading& r, const Value& value) {
+  rare(r).placement.alignment = value.integer();
+  uses(r).placement.any = uses(r).placement.alignment = value.place;
+}
+
 void setInitial(Reading& r, const Value& value) {
   name(r).initial.push_back(value.number);
   record(r).initialPlace = value.place;
@@ -144,6 +165,12 @@ constexpr HX_FieldBinding kBindings[] = {
      [](Reading& r, const Value& v) { rare(r).offset = v.number; }},
     {"name.cyclic",
      [](Reading& r, const Value& v) { rare(r).cyclic = v.boolean; }},
+    {"name.unit", [](Reading& r, const Value& v) { rare(r).unit = v.text; }},
+    {"name.const", setPlacement<&HX_Placement::isConst>},
+    {"name.volatile", setPlacement<&HX_Placement::isVolatile>},
+    {"name.static", setStatic},
+    {"name.section", setSection},
+    {"name.alignment", setAlignment},
     {"name.initial", setInitial},
     {"name.lsb", [](Reading& r, const Value& v) { name(r).lsb = v.number; }},
     {"name.zero", [](Reading& r, const Value& v) { name(r).zero = v.number; }},
@@ -166,6 +193,7 @@ class Resolver {
       name.makeRare().alsoFrom.push_back(source(also.use));
     }
     resolveDependencies();
+    HX_CheckPlacements(m_Reading);
   }
 
  private:
@@ -289,19 +317,7 @@ class Resolver {
     if (record.initialPlace == 0) return;
     for (const HX_TypeItem* at = name.type; at != nullptr; at = at->of)
       if (m_Reading.types[at->index].isFaulty) return;
-    if (!name.type->scalar()->numerical)
-      return m_Reading.faults.add(
-          record.initialPlace, "an initial value",
-          "no initial value for a structure or an enumeration");
-    std::size_t room = 1;
-    for (const HX_TypeItem* at = name.type; at != nullptr; at = at->of) {
-      if (at->kind == HX_TypeKind::eArray)
-        room *= static_cast<std::size_t>(at->length);
-    }
-    if (name.initial.size() > room)
-      m_Reading.faults.add(record.initialPlace,
-                           std::to_string(name.initial.size()) + " values",
-                           "1 to " + std::to_string(room) + " values");
+    HX_CheckInitial(m_Reading, record.initialPlace, name);
   }
 
   Reading& m_Reading;

@@ -1,4 +1,5 @@
 // The data types of a model.
+#include <algorithm>
 #include <cfloat>
 #include <cmath>
 
@@ -21,6 +22,18 @@ const std::map<HX_CType, HX_NumericalType> kCTypeRanges = {
     {HX_CType::eFloat, {-FLT_MAX, FLT_MAX, 32, true}},
     {HX_CType::eDouble, {-DBL_MAX, DBL_MAX, 64, true}},
 };
+
+// The types of <stdint.h> of C99: [u]int[_least|_fast]N_t, [u]intptr_t,
+// [u]intmax_t.
+bool isStdintName(std::string_view name) {
+  if (name.starts_with('u')) name.remove_prefix(1);
+  if (!name.starts_with("int") || !name.ends_with("_t")) return false;
+  name = name.substr(3, name.size() - 5);
+  if (name == "ptr" || name == "max") return true;
+  for (const std::string_view kind : {"_least", "_fast"})
+    if (name.starts_with(kind)) name.remove_prefix(kind.size());
+  return name == "8" || name == "16" || name == "32" || name == "64";
+}
 
 HX_TypeRecord& type(Reading& r) { return r.types.back(); }
 
@@ -153,7 +166,23 @@ class Maker {
     item.place = record.namePlace;
     item.index = m_Types.size() - 1;
     if (record.cut) item.type.setCut(*record.cut);
-    if (!item.isNameless) takeCodeName(record.name, record.namePlace);
+    if (item.isNameless) return;
+    takeCodeName(record.name, record.namePlace);
+    checkStdint(record);
+  }
+
+  // <stdint.h> defines its types itself, those of the same plain type only.
+  void checkStdint(const HX_TypeRecord& record) {
+    if (!m_Reading.model.code.usesStdint) return;
+    const auto row = std::find_if(
+        std::begin(kHxStdintTypes), std::end(kHxStdintTypes),
+        [&](const auto& each) { return each.word == record.name; });
+    const bool isSame = row != std::end(kHxStdintTypes) &&
+                        record.kind == HX_TypeKind::eBase &&
+                        record.cType == row->value;
+    if (!isSame && isStdintName(record.name))
+      m_Reading.faults.add(record.namePlace, HX_Quoted(record.name),
+                           "a name that <stdint.h> does not define");
   }
 
   // A type may stand on a later type.
@@ -171,6 +200,9 @@ class Maker {
     completeFields(record, item);
     for (const HX_TypeRecord::Constant& constant : record.values) {
       takeCodeName(constant.name, constant.namePlace);
+      if (m_Reading.model.code.usesStdint && isStdintName(constant.name))
+        m_Reading.faults.add(constant.namePlace, HX_Quoted(constant.name),
+                             "a name that <stdint.h> does not define");
       item.values.push_back(
           {constant.name, constant.value, constant.namePlace});
     }
@@ -190,6 +222,15 @@ class Maker {
       if (fieldType != nullptr)
         item.fields.push_back({field.name, fieldType, field.namePlace});
     }
+    // In C++ a field hides the type of the same name inside the structure.
+    std::set<std::string_view> types;
+    for (const HX_TypeItem::Field& field : item.fields)
+      if (field.type->kind != HX_TypeKind::eBitField)
+        types.insert(field.type->name);
+    for (const HX_TypeItem::Field& field : item.fields)
+      if (types.count(field.name) != 0)
+        m_Reading.faults.add(field.place, HX_Quoted(field.name),
+                             "a name that no type of a field has");
   }
 
   // What the types at the ends of the chains give to the types above them.

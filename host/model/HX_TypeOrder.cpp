@@ -55,6 +55,7 @@ class Check {
       size.elements = fits ? size.elements * length : most + 1;
     }
     checkLimits(m_Reading.types[index].place, size);
+    m_Reading.model.types[index].elements = size.elements;
   }
 
   // The first type beyond a limit is reported, not the types above.

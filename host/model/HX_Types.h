@@ -35,6 +35,7 @@ struct HX_TypeItem {
   std::optional<HX_CType> cType;
   int bits = 0;
   int length = 0;
+  std::size_t elements = 1;  // scalars in arrays and structures
   bool isNameless = false;
   HX_TypeItem* of = nullptr;
   std::vector<Field> fields;

@@ -3,8 +3,10 @@
 #include <algorithm>
 
 #include "host/base/HX_NameText.h"
+#include "host/base/HX_Sha256.h"
 #include "host/base/HX_Text.h"
 #include "host/names/HX_Ordering.h"
+#include "host/program/HX_Version.h"
 #include "host/write/HX_CWriter.h"
 #include "host/write/HX_NameMap.h"
 
@@ -37,6 +39,11 @@ HX_Generator::HX_Generator(HX_Profile& timing, HX_Progress& shown,
   for (const std::string& folder : keywordFolders)
     folders.push_back((profile.start / folder).lexically_normal().string());
   model.emplace(document, folders, progress);
+  if (model->code.hasBanner) {
+    const std::string version = HX_VersionText();
+    banner = version.substr(0, version.find('\n')) + ", document SHA-256 " +
+             HX_Sha256(document.text);
+  }
   profile.setModel(HX_NameText(model->name).cstring());
 }
 
@@ -51,9 +58,12 @@ void HX_Generator::run(HX_NameLock* lock) {
   }
   spaces.emplace(*model, result.types, lock);
   for (const HX_NameSpaces::ReservedUse& use : spaces->reservedUses())
-    document.faults.add(use.place, HX_Quoted(use.name),
-                        "a name that is no " + use.conflict.text(),
-                        kHxReservedType);
+    document.faults.add(
+        use.place, HX_Quoted(use.name),
+        (use.conflict.reason == HX_Change::ePattern ? "a name that is not "
+                                                    : "a name that is no ") +
+            use.conflict.text(),
+        kHxReservedType);
   document.throwIfFaulty();
   std::string().swap(document.text);  // long, and not needed any more
   {
@@ -76,7 +86,7 @@ void HX_Generator::run(HX_NameLock* lock) {
 std::size_t HX_Generator::write(HX_Output& output) {
   const HX_Profile::Phase phase(profile, "Write C");
   sortById(result.names);
-  HX_CWriter(*model, result, "", progress).write(output);
+  HX_CWriter(*model, result, banner, progress).write(output);
   HX_WriteNameMap(output.open("name_map.json"), output.open("name_map.csv"),
                   result, progress);
   progress.end();

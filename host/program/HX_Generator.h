@@ -41,6 +41,7 @@ struct HX_Generator {
   HX_RunResult result;
   const HX_MessageCollector collector{result.findings};
   std::optional<const HX_Model> model;
+  std::string banner;  // of the code; empty if the document wants none
   std::optional<HX_NameSpaces> spaces;
   std::optional<HX_NameForming> forming;
 };

@@ -70,7 +70,7 @@ const WidthRow kWidths[] = {
      "USHRT_MAX == 65535 && SHRT_MIN == -32768",
      "short has not 16 bits"},
     {{HX_CType::eInt, HX_CType::eUnsignedInt},
-     "UINT_MAX == 4294967295 && INT_MIN == -2147483647 - 1",
+     "UINT_MAX == 4294967295U && INT_MIN == -2147483647 - 1",
      "int has not 32 bits"},
     {{HX_CType::eFloat},
      "FLT_RADIX == 2 && FLT_MANT_DIG == 24 && FLT_MAX_EXP == 128",
@@ -80,20 +80,23 @@ const WidthRow kWidths[] = {
      "double has not 64 bits"},
 };
 
-// The types of C that the code uses.
-std::set<HX_CType> usedTypes(const std::vector<const HX_TypeItem*>& types) {
+// The types of C that the code uses, but for those of <stdint.h>.
+std::set<HX_CType> usedTypes(const std::vector<const HX_TypeItem*>& types,
+                             bool usesStdint) {
   std::set<HX_CType> used;
   for (const HX_TypeItem* type : types) {
-    if (type->cType) used.insert(*type->cType);
-    if (type->kind == HX_TypeKind::eInteger64 ||
-        type->kind == HX_TypeKind::eBitField)
+    if (type->cType && (!usesStdint || type->isFloating()))
+      used.insert(*type->cType);
+    if (type->kind == HX_TypeKind::eBitField ||
+        (type->kind == HX_TypeKind::eInteger64 && !usesStdint))
       used.insert(HX_CType::eUnsignedInt);
   }
   return used;
 }
 
-std::string widthChecks(const std::vector<const HX_TypeItem*>& types) {
-  const std::set<HX_CType> used = usedTypes(types);
+std::string widthChecks(const std::vector<const HX_TypeItem*>& types,
+                        bool usesStdint) {
+  const std::set<HX_CType> used = usedTypes(types, usesStdint);
   std::string checks;
   for (const WidthRow& row : kWidths) {
     if (std::none_of(row.types.begin(), row.types.end(),
@@ -135,7 +138,8 @@ std::string HX_TypesPrologue(const HX_Model& model,
                              const std::vector<const HX_TypeItem*>& types) {
   std::string text;
   if (model.code.usesStdint) text += "#include <stdint.h>\n\n";
-  if (model.code.checksWidths) text += widthChecks(types);
+  if (model.code.checksWidths)
+    text += widthChecks(types, model.code.usesStdint);
   const auto anyPlaced = [&](auto wish) {
     return std::any_of(
         model.names.begin(), model.names.end(),

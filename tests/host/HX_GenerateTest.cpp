@@ -48,6 +48,37 @@ TEST_F(GenerateTest, ValuesCommentsAndNameMapAreTheGoldenCopies) {
                                   {"messages.txt", result.err}});
 }
 
+// Every option of the code, and a model name that begins with '_'.
+TEST_F(GenerateTest, CodeOptionsGiveTheGoldenCopies) {
+  generateValid(parsed("code_options.json"));
+  Files files = filesIn(m_Out);
+  const std::string sum =
+      shell("sha256sum " + (m_Folder / "model.json").string()).out;
+  const std::string banner = "document SHA-256 ";
+  for (auto& [name, text] : files) {
+    if (name.starts_with("name_map")) continue;
+    const std::size_t at = text.find(banner) + banner.size();
+    EXPECT_EQ(sum.substr(0, 64), text.substr(at, 64)) << name;
+    text.replace(at, 64, "SUM");
+  }
+  files.erase("name_map.json");
+  expectGolden("code_options", files);
+}
+
+// Texts whose ends lie on both sides of a block of the sum.
+TEST_F(GenerateTest, BannerHasTheSumOfDocumentsOfAnyLength) {
+  for (int blanks = 0; blanks < 130; blanks += 3) {
+    const fs::path model = m_Folder / "model.json";
+    write(model, R"({"model": {"name": "m"}, "names": [], )"
+                 R"("options": {"code": {"banner": true}}})" +
+                     std::string(static_cast<std::size_t>(blanks), ' '));
+    EXPECT_EQ(0, generate(model).code);
+    EXPECT_THAT(
+        read(m_Out / "m.c"),
+        HasSubstr(shell("sha256sum " + model.string()).out.substr(0, 64)));
+  }
+}
+
 TEST_F(GenerateTest, SyntheticModelsAreTheSameForTheSameSeed) {
   const std::string first = codegen("synthesize --blocks 100").out;
   EXPECT_EQ(first, codegen("synthesize --blocks 100 --seed 1").out);
