@@ -273,7 +273,8 @@ struct HX_NameLock::Reader {
   }
 
   void noteName(View name, View scope, int number) {
-    const int key = keyOf(name) ^ keyOf(scope) * 31;
+    const auto bits = static_cast<unsigned>(keyOf(scope)) * 31;
+    const int key = static_cast<int>(bits) ^ keyOf(name);
     const auto* const slot = names.find(key, [&](const NamePlace& place) {
       return place.name == name && place.scope == scope;
     });
@@ -304,8 +305,12 @@ struct HX_NameLock::Reader {
 
 bool HX_NameLock::read(const char* text, std::size_t length,
                        HX_TextFaults& faults) {
-  if (m_pItems == nullptr) return false;
+  if (size() != 0) {
+    faults.add(0, "the lock is not empty");
+    return false;
+  }
   const bool isRead = HX_WithinMemory(false, [&] {
+    if (m_pItems == nullptr) return false;
     Reader reader{*m_pItems, faults};
     const View whole(text, length);
     hx_detail::forEachLine(
@@ -317,6 +322,7 @@ bool HX_NameLock::read(const char* text, std::size_t length,
   });
   if (isRead) return true;
   if (faults.count() == 0) faults.add(0, "no memory for the lock");
+  if (m_pItems == nullptr) return false;
   m_pItems->index.clear();
   while (m_pItems->items.size() != 0) m_pItems->items.dropLast();
   while (m_pItems->formers.size() != 0) m_pItems->formers.dropLast();

@@ -61,12 +61,11 @@ class HX_UTILS_API HX_NameLock : public HX_Allocated {
   HX_NameLock& operator=(const HX_NameLock&) = delete;
   ~HX_NameLock();
 
-  /// Reads a lock file of \p length bytes.
-  /// REQUIRES: the lock is empty.
-  /// RETURNS: false, with the lock empty, for another version, conflict
-  /// markers, an item or a name of a scope on two lines, lines out of order,
-  /// a wrong field, an unfinished last line, or no memory; \p faults has the
-  /// lines.
+  /// Reads a lock file of \p length bytes into an empty lock.
+  /// RETURNS: false, with the lock as before, for a lock that is not empty,
+  /// another version, conflict markers, an item or a name of a scope on two
+  /// lines, lines out of order, a wrong field, an unfinished last line, or no
+  /// memory; \p faults has the lines.
   bool read(const char* text, std::size_t length, HX_TextFaults& faults);
 
   /// Writes the lock file in pieces: \p sink(const char* text, size_t length).
