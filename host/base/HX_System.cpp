@@ -2,6 +2,7 @@
 
 #include <fcntl.h>
 #include <sys/file.h>
+#include <sys/ioctl.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -31,7 +32,25 @@ struct HeldFolder {
 };
 std::map<std::string, HeldFolder> s_HeldFolders;  // by canonical path
 
+HX_Terminal terminalOf(int descriptor) {
+  HX_Terminal terminal;
+  if (isatty(descriptor) == 0) return terminal;
+  winsize size = {};
+  const bool isKnown = ioctl(descriptor, TIOCGWINSZ, &size) == 0;
+  constexpr int kNarrowest = 40;  // below that, wrapping helps nobody
+  if (isKnown && size.ws_col >= kNarrowest) terminal.width = size.ws_col;
+  const char* noColor = std::getenv("NO_COLOR");
+  const char* kind = std::getenv("TERM");
+  terminal.hasColors = (noColor == nullptr || *noColor == '\0') &&
+                       kind != nullptr && std::strcmp(kind, "dumb") != 0;
+  return terminal;
+}
+
 }  // namespace
+
+HX_Terminal HX_OutputTerminal() { return terminalOf(STDOUT_FILENO); }
+
+HX_Terminal HX_ErrorTerminal() { return terminalOf(STDERR_FILENO); }
 
 void HX_WriteError(const char* text) {
   std::size_t length = std::strlen(text);

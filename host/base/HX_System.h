@@ -25,6 +25,14 @@ bool HX_DidMemoryEnd();
 /// Whether a person may read the standard error output.
 bool HX_IsErrorOutputTerminal();
 
+/// How to write for a person; nothing special without a terminal.
+struct HX_Terminal {
+  int width = 0;           ///< columns; 0 for lines of any length
+  bool hasColors = false;  ///< never if NO_COLOR is set, or TERM is "dumb"
+};
+HX_Terminal HX_OutputTerminal();
+HX_Terminal HX_ErrorTerminal();
+
 /// The folder of the program file.
 std::filesystem::path HX_ProgramFolder();
 

@@ -86,6 +86,11 @@ std::string HX_Latin1ToUtf8(const std::string& latin1) {
   return HX_ToUtf8(KyCXString(latin1.c_str()));
 }
 
+std::size_t HX_WidthOf(std::string_view utf8) {
+  return static_cast<std::size_t>(std::count_if(
+      utf8.begin(), utf8.end(), [](char c) { return (c & '\xC0') != '\x80'; }));
+}
+
 std::string HX_Visible(std::string_view utf8) {
   if (std::none_of(utf8.begin(), utf8.end(), isControl))
     return std::string(utf8);

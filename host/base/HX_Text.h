@@ -20,6 +20,10 @@ KyCXString HX_FromUtf8(std::string_view utf8);
 std::string HX_ToUtf8(const KyCXString& text);
 std::string HX_Latin1ToUtf8(const std::string& latin1);
 
+/// RETURNS: the columns of a terminal: bytes that continue a character have no
+/// column.
+std::size_t HX_WidthOf(std::string_view utf8);
+
 /// The text with control characters as escapes of JSON: a terminal shows the
 /// text and obeys nothing in the text.
 std::string HX_Visible(std::string_view utf8);

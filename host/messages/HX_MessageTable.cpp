@@ -87,7 +87,7 @@ constexpr HX_MessageRow kRows[] = {
      "The name template has more than two parts; the first two count.",
      "A template has a formal and an actual part, separated by ':'.",
      "Remove the further ':'."},
-    {kHxNotInLock, 2, "{}: {}",
+    {kHxNotInLock, 2, "The lock has another name or none: {} {}",
      "The lock file has no name for the item, or a name of another wanted "
      "form, and the run may not change the lock.",
      "Run \"hx_codegen generate MODEL --lock FILE\" for the whole model."},
@@ -97,7 +97,7 @@ constexpr HX_MessageRow kRows[] = {
      "The physical value, divided by the resolution, lies outside the range of "
      "the type.",
      "Correct the initial value, the resolution (lsb) or the type."},
-    {kHxOutdated, 2, "{} would change",
+    {kHxOutdated, 2, "would change",
      "The file is absent or differs from the file that this model gives.",
      "Run \"hx_codegen generate\" with the same options."},
     {kHxImportRefused, 2, "{}",
@@ -235,4 +235,13 @@ std::string HX_MessageHelp(int number) {
          HX_MessageHandler::severityName(facts.severity) + "\n\ntext   " +
          facts.text + "\ncause  " + facts.cause + "\ncure   " + facts.cure +
          "\n";
+}
+
+std::string HX_AllMessageHelp() {
+  std::string all;
+  for (const HX_MessageRow& row : kRows)
+    all += (all.empty() ? "" : "\n") + HX_MessageHelp(row.number);
+  for (const ERR_CatalogueRow& row : kErrCatalogue)
+    all += "\n" + HX_MessageHelp(row.number);
+  return all;
 }

@@ -72,6 +72,10 @@ std::string HX_MessageText(HX_MessageNumber number,
 /// RETURNS: empty for an unknown number.
 std::string HX_MessageHelp(int number);
 
+/// The same of all messages, those of the program first, with an empty line
+/// between messages.
+std::string HX_AllMessageHelp();
+
 /// Text, cause and cure of a message, as rules of a log need them.
 struct HX_MessageFacts {
   int severity = 2;

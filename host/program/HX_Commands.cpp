@@ -8,12 +8,14 @@
 
 #include "host/base/HX_System.h"
 #include "host/base/HX_Text.h"
+#include "host/messages/HX_MessageTable.h"
 #include "host/model/HX_Document.h"
 #include "host/model/HX_Synthesis.h"
 #include "host/program/HX_Generator.h"
 #include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_LockFile.h"
 #include "host/program/HX_Version.h"
+#include "host/write/HX_DiagnosticLog.h"
 #include "host/write/HX_NameMap.h"
 #include "host/write/HX_NameTable.h"
 #include "host/write/HX_Report.h"
@@ -27,6 +29,8 @@ void requireMemory() {
 
 void showNames(const HX_Arguments& arguments, HX_Generator& generator) {
   const HX_Profile::Phase phase(generator.profile, "Print");
+  if (arguments.log->format != HX_DiagnosticLog::eText)
+    arguments.log->add(generator.result);
   if (arguments.json)
     HX_WriteJson(std::cout, generator.result);
   else
@@ -35,21 +39,22 @@ void showNames(const HX_Arguments& arguments, HX_Generator& generator) {
 
 void explainName(const HX_Arguments& arguments, HX_Generator& generator) {
   if (!generator.forming)  // a circle of types
-    return HX_WriteFindings(std::cerr, generator.result);
+    return arguments.log->add(generator.result);
   for (const HX_FormedName* name : generator.result.names) {
     if (name->wanted->id == arguments.name)
       return HX_WriteExplanation(std::cout, *name,
                                  generator.forming->explain(*name->wanted));
   }
-  throw HX_InputError(HX_Visible(arguments.model) + ": /names: found no id " +
-                      HX_Quoted(arguments.name) +
-                      ", expected the id of a name");
+  throw HX_InputError(
+      HX_MessageText(kHxUnknownName,
+                     {HX_Visible(arguments.model), HX_Quoted(arguments.name)}),
+      kHxUnknownName);
 }
 
 void generateCode(const HX_Arguments& arguments, HX_Generator& generator,
                   const HX_LockFile* lock) {
-  const HX_RunResult& result = generator.result;
-  if (result.hasErrors()) return HX_WriteFindings(std::cerr, result);
+  HX_RunResult& result = generator.result;
+  if (result.hasErrors()) return arguments.log->add(result);
   std::optional<HX_Output> lockOutput;
   if (lock != nullptr) {
     lock->write(lockOutput.emplace(lock->folder()));
@@ -57,7 +62,9 @@ void generateCode(const HX_Arguments& arguments, HX_Generator& generator,
   }
   HX_Output output(generator.profile.start / arguments.out);
   const std::size_t changed = generator.write(output);
-  HX_WriteFindings(std::cerr, result);
+  arguments.log->choose(result);
+  arguments.log->add(result);
+  if (result.hasErrors()) return;
   if (arguments.json) HX_WriteJson(std::cout, result);
   // If a report cannot be written, no file of the code changes.
   generator.profile.finish();
@@ -123,6 +130,7 @@ struct ModelRun {
             HX_ReadDocument(arguments.model, arguments, profile),
             keywordFolders(arguments))) {
     generator->run(lock.lock());
+    arguments.log->choose(generator->result);
     requireMemory();
   }
 
@@ -164,7 +172,7 @@ HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments) {
   const bool hasErrors = run.generator->result.hasErrors();
   const bool writesLock = run.lock.lock() != nullptr && !arguments.locked &&
                           !hasErrors && run.generator->forming.has_value();
-  if (arguments.locked && !hasErrors && run.lock.writeChanges(std::cerr) > 0)
+  if (arguments.locked && !hasErrors && run.lock.addChanges(*arguments.log) > 0)
     return kHxErrorsFound;
   if (writesLock) run.lock.lock()->endRun(arguments.retireRuns);
   generateCode(arguments, *run.generator, writesLock ? &run.lock : nullptr);
@@ -183,6 +191,18 @@ HX_ExitCode HX_PruneLock(const HX_Arguments& arguments) {
   lock.write(output);
   output.finish();
   output.commit();
+  return kHxDone;
+}
+
+HX_ExitCode HX_HelpMessage(const HX_Arguments& arguments) {
+  const std::string help = arguments.number == 0
+                               ? HX_AllMessageHelp()
+                               : HX_MessageHelp(arguments.number);
+  if (help.empty())
+    throw HX_InputError(
+        HX_MessageText(kHxUnknownNumber, {std::to_string(arguments.number)}),
+        kHxUnknownNumber);
+  std::cout << help;
   return kHxDone;
 }
 

@@ -7,10 +7,13 @@
 #include <string>
 #include <vector>
 
+class HX_DiagnosticLog;
+
 enum HX_ExitCode { kHxDone = 0, kHxErrorsFound = 1, kHxRefused = 2 };
 
 /// The command line.
 struct HX_Arguments {
+  HX_DiagnosticLog* log = nullptr;  ///< never null in a command
   std::string model;
   std::string name;
   std::string keywords;                  ///< folder of the installed word lists
@@ -30,6 +33,7 @@ struct HX_Arguments {
   bool schema = false;
   bool json = false;
   bool quiet = false;
+  int number = 0;  ///< of a message; 0 for all
   int blocks = 1000;
   std::uint64_t seed = 1;
 };
@@ -43,6 +47,7 @@ HX_ExitCode HX_ReportNames(const HX_Arguments& arguments);
 HX_ExitCode HX_PruneLock(const HX_Arguments& arguments);
 HX_ExitCode HX_CompareNames(const HX_Arguments& arguments);
 HX_ExitCode HX_LintTemplates(const HX_Arguments& arguments);
+HX_ExitCode HX_HelpMessage(const HX_Arguments& arguments);
 HX_ExitCode HX_SynthesizeDocument(const HX_Arguments& arguments);
 
 /// Throws HX_OutputError if the standard output cannot be written.

@@ -44,18 +44,18 @@ HX_LockFile::HX_LockFile(std::string file, std::filesystem::path path,
     HX_ReadLock(m_Lock, m_File, HX_ReadWholeFile(m_File, m_Path));
 }
 
-int HX_LockFile::writeChanges(std::ostream& out) const {
+int HX_LockFile::addChanges(HX_DiagnosticLog& log) const {
   int changes = 0;
   for (int at = 0; at < m_Lock.size(); ++at) {
     const HX_NameLock::HxEChangeTag change = m_Lock.change(at);
     if (change == HX_NameLock::eGone || change == HX_NameLock::eKept) continue;
     const HX_NameLock::Entry& entry = m_Lock.entry(at);
+    const char* what = change == HX_NameLock::eRenamed   ? "renamed to"
+                       : change == HX_NameLock::eRevived ? "back with"
+                                                         : "new,";
+    log.add({kHxNotInLock, 2, HX_MessageText(kHxNotInLock, {what, entry.name}),
+             std::string(entry.item), ""});
     ++changes;
-    out << entry.item << ": "
-        << (change == HX_NameLock::eRenamed   ? "renamed to "
-            : change == HX_NameLock::eRevived ? "back with "
-                                              : "new, ")
-        << entry.name << '\n';
   }
   return changes;
 }

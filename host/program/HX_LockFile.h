@@ -10,11 +10,11 @@
 #define HOST_PROGRAM_HX_LOCKFILE_H
 
 #include <filesystem>
-#include <iosfwd>
 #include <string>
 
 #include "SafeNames/HX_NameLock.h"
 #include "host/base/HX_Output.h"
+#include "host/write/HX_DiagnosticLog.h"
 
 class HX_LockFile {
  public:
@@ -30,9 +30,9 @@ class HX_LockFile {
   /// Where the file lies.
   std::filesystem::path folder() const { return m_Path.parent_path(); }
 
-  /// Writes new and changed names to \p out.
+  /// Adds a message for each new and each changed name.
   /// RETURNS: the number of such names.
-  int writeChanges(std::ostream& out) const;
+  int addChanges(HX_DiagnosticLog& log) const;
 
   /// Writes the file into \p output; REQUIRES: lock() is not null.
   void write(HX_Output& output) const;

@@ -3,15 +3,19 @@
 #include <charconv>
 #include <cstdint>
 #include <iostream>
+#include <map>
 #include <new>
 
 #include "SafeNames/HX_ReservedNames.h"
 #include "host/base/HX_Faults.h"
+#include "host/base/HX_Output.h"
 #include "host/base/HX_System.h"
 #include "host/base/HX_Text.h"
+#include "host/import/HX_ImportError.h"
 #include "host/program/HX_Commands.h"
 #include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_Version.h"
+#include "host/write/HX_DiagnosticLog.h"
 
 namespace {
 
@@ -45,16 +49,23 @@ const CLI::Validator isSeed(
     },
     "SEED");
 
+const std::map<std::string, HX_DiagnosticLog::HxEFormatTag> kFormats = {
+    {"text", HX_DiagnosticLog::eText},
+    {"json", HX_DiagnosticLog::eJson},
+    {"sarif", HX_DiagnosticLog::eSarif}};
+
 using Command = HX_ExitCode (*)(const HX_Arguments&);
 
 /// The command line and the command that it chooses.
 struct CommandLine {
-  CommandLine();
+  /// Options about messages go to \p log.
+  explicit CommandLine(HX_DiagnosticLog& log);
 
   CLI::App* add(const char* name, const char* description, Command chosen);
   CLI::App* addOverModel(const char* name, const char* description,
                          Command chosen);
   void addImportOptions(CLI::App& added);
+  void addMessageOptions(CLI::App& added);
 
   CLI::App app{"Forms the names of a model and writes its C code.",
                "hx_codegen"};
@@ -66,6 +77,7 @@ CLI::App* CommandLine::add(const char* name, const char* description,
                            Command chosen) {
   CLI::App* added = app.add_subcommand(name, description);
   added->callback([this, chosen] { command = chosen; });
+  addMessageOptions(*added);
   return added;
 }
 
@@ -81,6 +93,22 @@ CLI::App* CommandLine::addOverModel(const char* name, const char* description,
                     "folder for reports on what took how long");
   addImportOptions(*added);
   return added;
+}
+
+void CommandLine::addMessageOptions(CLI::App& added) {
+  HX_DiagnosticLog& log = *arguments.log;
+  added
+      .add_option_function<std::string>(
+          "--diagnostics",
+          [&log](const std::string& form) { log.format = kFormats.at(form); },
+          "form of the messages on the error output")
+      ->check(CLI::IsMember({"text", "json", "sarif"}));
+  added.add_flag("--werror", log.warningsAreErrors, "warnings are errors");
+  added
+      .add_option("--silence", log.silenced,
+                  "numbers of warnings and notes to leave out, with ','")
+      ->delimiter(',')
+      ->allow_extra_args(false);
 }
 
 void CommandLine::addImportOptions(CLI::App& added) {
@@ -99,7 +127,8 @@ void CommandLine::addImportOptions(CLI::App& added) {
   added.add_flag("--quiet", arguments.quiet, "no progress, notes, summary");
 }
 
-CommandLine::CommandLine() {
+CommandLine::CommandLine(HX_DiagnosticLog& log) {
+  arguments.log = &log;
   app.footer(kFooter);
   app.require_subcommand(1);
   app.set_version_flag("--version", HX_VersionText());
@@ -132,6 +161,7 @@ CommandLine::CommandLine() {
   CLI::App* prune = lock->add_subcommand(
       "prune", "free the names of items that went, and former names");
   prune->callback([this] { command = HX_PruneLock; });
+  addMessageOptions(*prune);
   prune->add_option("LOCK", arguments.lock, "the lock file")->required();
 
   CLI::App* compare = add(
@@ -174,6 +204,11 @@ CommandLine::CommandLine() {
       ->add_option("--out", arguments.out, "the file, for example report.html")
       ->required();
 
+  add("help", "print text, cause and cure of a message", HX_HelpMessage)
+      ->add_option("NUMBER", arguments.number,
+                   "the number of the message; without it all are printed")
+      ->check(CLI::PositiveNumber);
+
   CLI::App* synthesis =
       add("synthesize", "print a document of any size, for trying scale",
           HX_SynthesizeDocument);
@@ -184,31 +219,68 @@ CommandLine::CommandLine() {
 }
 
 // One line with the word that is wrong.
-HX_ExitCode refuse(CLI::App& app, const CLI::ParseError& error) {
+std::string textOf(CLI::App& app, const CLI::ParseError& error) {
   std::string what = error.what();
   const std::vector<std::string> unread = app.remaining(true);
   if (app.get_subcommands().empty() && !unread.empty())
     what = "no command " + HX_Quoted(unread.front());
   constexpr std::size_t kMost = 300;
   if (what.size() > kMost) what = what.substr(0, kMost) + "...";
-  std::cerr << "hx_codegen: " << HX_Visible(what)
-            << "; see hx_codegen --help\n";
-  return kHxRefused;
+  return HX_MessageText(kHxBadCommandLine, {HX_Visible(what)});
 }
 
-int run(int argc, char** argv) {
-  CommandLine line;
-  HX_ExitCode code = kHxDone;
+// The form of the messages about a wrong command line.
+void findFormat(int argc, char** argv, HX_DiagnosticLog& log) {
+  const std::string option = "--diagnostics";
+  for (int i = 1; i < argc; ++i) {
+    const std::string word = argv[i];
+    std::string value;
+    if (word == option && i + 1 < argc) value = argv[i + 1];
+    if (word.starts_with(option + "=")) value = word.substr(option.size() + 1);
+    if (kFormats.count(value) > 0) log.format = kFormats.at(value);
+  }
+}
+
+int run(int argc, char** argv, HX_DiagnosticLog& log) {
+  CommandLine line(log);
+  int code = kHxDone;
   try {
     line.app.parse(argc, argv);
+    log.model = line.arguments.model;
     code = line.command(line.arguments);
   } catch (const CLI::Success& help) {
     line.app.exit(help);
   } catch (const CLI::ParseError& error) {
-    return refuse(line.app, error);
+    findFormat(argc, argv, log);
+    log.add({kHxBadCommandLine, 2, textOf(line.app, error), "", ""});
+    return kHxRefused;
   }
   HX_FlushOutput();
   return code;
+}
+
+// Failures end as messages.
+int runWithLog(int argc, char** argv, HX_DiagnosticLog& log) {
+  const auto add = [&log](HX_MessageNumber number,
+                          const std::exception& error) {
+    log.add({number, 2, error.what(), "", ""});
+  };
+  try {
+    return run(argc, argv, log);
+  } catch (const std::bad_alloc&) {
+    throw;
+  } catch (const HX_DocumentError& error) {
+    for (const HX_Diagnostic& fault : error.faults) log.add(fault);
+  } catch (const HX_InputError& error) {
+    add(error.number, error);
+  } catch (const HX_OutputError& error) {
+    add(kHxUnwritable, error);
+  } catch (const HX_ImportError& error) {
+    add(kHxImportRefused, error);
+  } catch (const std::exception& error) {
+    add(kHxSystemFailure, error);
+  }
+  return kHxRefused;
 }
 
 }  // namespace
@@ -217,11 +289,12 @@ int main(int argc, char** argv) {
   try {
     HX_PrepareProcess();
     HX_KeepMemoryBack();
-    return run(argc, argv);
+    HX_DiagnosticLog log;
+    const int code = runWithLog(argc, argv, log);
+    log.write(std::cerr, code, HX_ErrorTerminal());
+    return code;
   } catch (const std::bad_alloc&) {
-    HX_WriteError("hx_codegen: out of memory\n");
-  } catch (const HX_DocumentError& error) {
-    std::cerr << error.what() << '\n';
+    HX_WriteError("hx_codegen: out of memory [203]\n");
   } catch (const std::exception& error) {
     std::cerr << "hx_codegen: " << error.what() << '\n';
   }

@@ -14,20 +14,14 @@ std::string orDash(const std::string& text) {
   return text.empty() ? "-" : text;
 }
 
-// Columns of a terminal: continuation bytes of UTF-8 have no column.
-std::size_t widthOf(const std::string& text) {
-  return static_cast<std::size_t>(std::count_if(
-      text.begin(), text.end(), [](char c) { return (c & '\xC0') != '\x80'; }));
-}
-
 std::string padded(const std::string& text, std::size_t width) {
   return text +
-         std::string(std::max(width, widthOf(text)) - widthOf(text), ' ');
+         std::string(std::max(width, HX_WidthOf(text)) - HX_WidthOf(text), ' ');
 }
 
 void widen(std::vector<std::size_t>& widths, const Row& row) {
   for (std::size_t i = 0; i < widths.size(); ++i)
-    widths[i] = std::max(widths[i], widthOf(row[i]));
+    widths[i] = std::max(widths[i], HX_WidthOf(row[i]));
 }
 
 // Of all columns but the last column, which is not padded.
@@ -92,7 +86,7 @@ void HX_WriteTable(std::ostream& out, const HX_RunResult& result,
   }
   progress.begin("printing", result.names.size());
   const std::string first = aligned(head, widths);
-  out << first << '\n' << std::string(widthOf(first), '-') << '\n';
+  out << first << '\n' << std::string(HX_WidthOf(first), '-') << '\n';
   for (const HX_FormedName* name : result.names) {
     out << aligned(rowOf(*name), widths) << '\n';
     if (!name->changes.empty())

@@ -42,7 +42,7 @@ TEST_F(CommandLineTest, ManualPageHasTheOptionsOfTheHelp) {
   std::string help = codegen("--help").out;
   for (const std::string command :
        {"names", "explain", "generate", "lock", "diff", "lint", "import",
-        "rules", "synthesize"}) {
+        "rules", "report", "help", "synthesize"}) {
     EXPECT_THAT(help, HasSubstr("\n  " + command + " "));
     EXPECT_THAT(page, HasSubstr("\n.SS " + command + "\n"));
     help += codegen(command + " --help").out;

@@ -5,6 +5,7 @@
 #include <cstdlib>
 #include <fstream>
 #include <iterator>
+#include <regex>
 #include <sstream>
 
 namespace fs = std::filesystem;
@@ -28,7 +29,10 @@ HX_HostTest::Result HX_HostTest::shell(const std::string& command) const {
   const std::string out = m_Folder / "stdout.txt";
   const std::string err = m_Folder / "stderr.txt";
   const int status = std::system((command + " >" + out + " 2>" + err).c_str());
-  return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, read(out), read(err)};
+  static const std::regex number(R"( \[[1-9][0-9]{2}\]\n)");
+  const std::string whole = read(err);
+  return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, read(out),
+          std::regex_replace(whole, number, "\n"), whole};
 }
 
 HX_HostTest::Result HX_HostTest::codegen(const std::string& arguments) const {

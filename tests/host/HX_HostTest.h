@@ -25,7 +25,8 @@ class HX_HostTest : public testing::Test {
   struct Result {
     int code;
     std::string out;
-    std::string err;
+    std::string err;  // without the numbers of messages at ends of lines
+    std::string wholeErr;
   };
 
   HX_HostTest();

@@ -72,7 +72,10 @@ TEST_F(HostSafeNamesTest, LockedRefusesNewAndChangedNames) {
       modelOf({variable("a", "z"), variable("b", "y"), variable("c", "y")});
   const Result refused = generateLocked(changed, "--locked");
   EXPECT_EQ(1, refused.code);
-  EXPECT_EQ("a: renamed to z\nc: new, y_a\n", refused.err);
+  const std::string text = "The lock has another name or none: ";
+  EXPECT_EQ("a: error   421    " + text + "renamed to z\n" +
+                "c: error   421    " + text + "new, y_a\n",
+            refused.err);
   EXPECT_EQ(lock, read(m_Lock));
   EXPECT_EQ(files, filesIn(m_Out));
   EXPECT_EQ(0, generateLocked(modelOf({variable("b", "y")}), "--locked").code);
