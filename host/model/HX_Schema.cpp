@@ -70,7 +70,14 @@ class Compiler {
   static const KeywordRow kKeywords[];
 
   HX_SchemaNode* compile(const Json& json, const std::string& path) {
-    if (json.HasMember("$ref")) return definition(json["$ref"]);
+    if (json.HasMember("$ref")) {
+      // A reference stands alone, or with a comment.
+      const bool hasMore =
+          json.MemberCount() > 2 ||
+          (json.MemberCount() == 2 && !json.HasMember("description"));
+      if (hasMore) refuse("keywords beside a reference");
+      return definition(json["$ref"]);
+    }
     HX_SchemaNode& node =
         *m_Schema.nodes.emplace_back(std::make_unique<HX_SchemaNode>());
     fill(node, json, path);
