@@ -8,6 +8,7 @@
 #include "SourceRef/HxCDdSrcRef.h"
 #include "SourceRef/HxCStateflowSrcRef.h"
 #include "fuzz/HX_Fuzz.h"
+#include "plain/HX_PlainCase.h"
 #include "platform/datadictionary/HX_DdTree.h"
 #include "platform/datatypes/HX_DataType.h"
 #include "platform/datatypes/HX_DataTypeServer.h"
@@ -19,7 +20,6 @@
 #include "platform/model/HxCSymbol.h"
 #include "platform/model/SC_Chart.h"
 #include "platform/model/SC_State.h"
-#include "support/HX_PlainTemplate.h"
 
 namespace {
 
@@ -150,45 +150,6 @@ struct Item {
   unsigned int provisional = 0;
 };
 
-// A name is the sum of the expansions of the literal texts and macros in the
-// template.
-void checkSum(const Item& item, const std::string& form) {
-  if (form.empty()) return;  // stands for a default
-  HxCNames names;
-  KyCXString sum;
-  bool complete = true, changeable = false;
-  HX_MessageHandler::instance().clear();
-  for (std::size_t at = 0, end = 0; at < form.size(); at = end) {
-    end = HX_PlainTokenEnd(form, at);
-    const std::string token = form.substr(at, end - at);
-    Id part = item.begin((token + ":" + token).c_str());
-    complete &= item.expand(names, part);
-    sum += part.getCookedName(Id::eFormalName);
-    changeable |= part.getIdentifierChangeable(Id::eFormalName);
-  }
-  const std::size_t messages = messageCount();
-  Id whole = item.begin((form + ":" + form).c_str());
-  HX_Require(item.expand(names, whole) == complete, "complete as the parts");
-  HX_Require(whole.getCookedName(Id::eFormalName) == sum,
-             "the parts give " + std::string(sum.cstring()));
-  HX_Require(whole.getIdentifierChangeable(Id::eFormalName) == changeable,
-             "changeable as the parts");
-  HX_Require(messageCount() == 2 * messages, "the messages of the parts");
-}
-
-void checkSubstitution(int kind, const Item& item, std::string form) {
-  const std::string macro = item.label.cstring();
-  std::string value = item.x.cstring();
-  std::erase(form, ':');
-  std::erase(value, ':');
-  Id id((form + ":").c_str());
-  HxCNames().substAllDollarZByValue(
-      id, macro.c_str(), Id(value.c_str()),
-      static_cast<HxCNames::tagMacroKindEnum>(kind));
-  const std::string plain = HX_PlainSubstitution(form, macro, value, kind);
-  HX_Require(id.getCookedName(Id::eFormalName) == plain.c_str(), plain);
-}
-
 void substitute(Model& model, HX_Bytes& bytes, const Item& item, Id& id) {
   HxCNames names;
   if (model.choices.flag()) {
@@ -260,18 +221,20 @@ void checkVariant(HX_LimitedNameSpace& taken, std::set<std::string>& given,
 
 }  // namespace
 
-// The first line chooses; the texts of the model and of all names follow.
+// The plain form reads all bytes as choices. For the road of a name the first
+// line chooses, and the texts of the model and of all names follow.
 void HX_CheckNames(HX_Bytes& bytes) {
+  const std::string choices = HX_Bytes(bytes).rest();
+  const std::string difference = plain::differenceOfNames(choices, nullptr) +
+                                 plain::differenceOfSrcRefs(choices, nullptr);
+  HX_Require(difference.empty(), difference);
   constexpr int kNames = 40;
   Model model(bytes);
   HX_LimitedNameSpace taken;
   std::set<std::string> given;
   for (int i = 0; i == 0 || (i < kNames && !bytes.isEmpty()); ++i) {
     const KyCXString text = bytes.text();
-    const std::string form = text.cstring();
     const Item item(model, bytes);
-    checkSum(item, form.substr(0, form.find(':')));
-    checkSubstitution(model.choices.below(3), item, form);
     Id id = item.begin(text);
     substitute(model, bytes, item, id);
     checkRoad(model, item, id);

@@ -21,8 +21,7 @@
 //    leaves names, flags, active name and cook level as before.
 // 3. Messages name the reference before the context moved to a parent or chart.
 //
-// The test EveryShortTemplateExpandsAsThePlainScanDoes compares with the plain
-// form.
+// The tests in tests/plain compare with the plain form.
 
 #include "Naming/HxCNames.h"
 

@@ -18,8 +18,7 @@
 // 2. Both texts exist before the identifier takes a text: missing memory
 //    changes nothing.
 //
-// The test EveryShortTemplateIsSubstitutedAsPlainly compares with the plain
-// form.
+// The tests in tests/plain compare with the plain form.
 
 #include <utility>
 

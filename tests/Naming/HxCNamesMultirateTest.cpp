@@ -1,7 +1,6 @@
 #include <cmath>
 #include <limits>
 #include <tuple>
-#include <utility>
 
 #include "Naming/HX_NamingFixture.h"
 #include "support/HX_ForeignLocale.h"
@@ -9,7 +8,6 @@
 namespace {
 
 using testing::ElementsAre;
-using testing::EndsWith;
 using testing::HasSubstr;
 
 class MultirateTest : public HX_NamingFixture {
@@ -66,114 +64,6 @@ TEST_F(MultirateTest, TimesAreRoundedAndReportedWhereTheyAreUsed) {
                   "precisely with the $(Time) name macro. "
                   "[car/Ctrl/Speed Gain]",
                   HasSubstr("The offset 0.0000025000 cannot")));
-}
-
-TEST_F(MultirateTest, EachUnitHasItsMacros) {
-  const std::pair<std::string, double> units[] = {
-      {"1us", 1e-6},  {"10us", 1e-5}, {"100us", 1e-4}, {"1ms", 1e-3},
-      {"10ms", 0.01}, {"100ms", 0.1}, {"1s", 1},       {"1m", 60},
-      {"1h", 3600},   {"1d", 86400}};
-  for (const auto& [unit, seconds] : units) {
-    const std::string form =
-        "$(Period" + unit + ")/$(Offset" + unit + ")/$(Time" + unit + ")";
-    for (int count = 1; count < 24; ++count) {
-      const std::string text = std::to_string(count);
-      const std::string all = text + "/1/" + text + "_1";
-      const double period = count * seconds;
-      EXPECT_EQ(time(form, period, seconds), all);
-      for (const double off : {-0.49 * seconds, 0.49 * seconds}) {
-        EXPECT_EQ(time(form, period + off, seconds), all + " 1206 1206");
-        EXPECT_THAT(messages().back(),
-                    HasSubstr("'Period' with the time base " + unit + " is"));
-        clearMessages();
-      }
-      if (unit.find('0') != unit.npos) continue;
-      EXPECT_EQ(time("$(Period)", period, 0), text + unit.substr(1));
-    }
-  }
-}
-
-TEST_F(MultirateTest, NoncyclicTasksHaveNoTime) {
-  EXPECT_EQ(time("$(Task)", 1, 0, false), "__Task_");
-  EXPECT_EQ(time("$(Period10ms)_$(Time)$(Offset1d)x", 1, 0, false),
-            "ACYCLIC_ACYCLICACYCLICx 1205");
-  EXPECT_THAT(messages(),
-              ElementsAre("1205/2 A time/period/offset name macro is used in a "
-                          "noncyclic task. Name template: "
-                          "$(Period10ms)_$(Time)$(Offset1d)x "
-                          "[car/Ctrl/Speed Gain]"));
-}
-
-TEST_F(MultirateTest, MessagesShowTheActiveRawNameAndSomeReference) {
-  const HxCDdSrcRef ddRef(HX_DdTree::instance().add("//DD0/Pool/K"));
-  Id id("$(Time)$(Task):$(Task)_$(Time1s)$(Period)");
-  id.setDdSourceRef(&ddRef);
-  id.activateActualName();
-  for (const bool cyclic : {false, true}) {
-    Id named(id);
-    names.replaceMultirateTaskISRName(named, Id(), Id(), true);
-    names.replaceMultirateTimeName(named, 0.1234567, 0, cyclic);
-  }
-  const std::string raw = "$(Task)_$(Time1s)$(Period)";
-  const std::string ofTask =
-      "1204/2 The $Task name macro is used in the task "
-      "name template " +
-      raw +
-      ". This is not allowed. "
-      "[//DD0/Pool/K]";
-  EXPECT_THAT(messages(),
-              ElementsAre(ofTask,
-                          "1205/2 A time/period/offset name macro is used in a "
-                          "noncyclic task. Name template: " +
-                              raw + " [//DD0/Pool/K]",
-                          ofTask, EndsWith("time base. [//DD0/Pool/K]"),
-                          EndsWith("$(Time) name macro. [//DD0/Pool/K]")));
-}
-
-TEST_F(MultirateTest, TasksAndIsrsStandInForEachOther) {
-  const Id task("fast task:fast task"), isr("irq-1:irq-1");
-  const auto replace = [&](const Id& used, bool isTaskName) {
-    Id id = identifier("$(Task)/$(ISR):x");
-    names.replaceMultirateTaskISRName(id, used, isr, isTaskName);
-    return shown(id);
-  };
-  EXPECT_EQ(replace(task, false), "fast_task/irq_1:x");
-  EXPECT_EQ(replace(Id(), false), "irq_1/irq_1:x");
-  Id half("fast task:");  // the active name decides
-  EXPECT_EQ(replace(half, false), "fast_task/irq_1:x");
-  half.activateActualName();
-  EXPECT_EQ(replace(half, false), "irq_1/irq_1:x");
-  EXPECT_EQ(replace(task, true), "__Task_/irq_1:x 1204");
-  EXPECT_THAT(messages(),
-              ElementsAre("1204/2 The $Task name macro is used in the task "
-                          "name template $(Task)/$(ISR). This is not allowed. "
-                          "[car/Ctrl/Speed Gain]"));
-  Id own("$(Task)/$(ISR):x");
-  names.replaceMultirateTaskISRName(own, task, own, false);
-  EXPECT_EQ(shown(own), "fast_task/__Task____ISR_:x");
-}
-
-TEST_F(MultirateTest, ObjectsAreMadeCIdentifiers) {
-  const Id value("a b:a b");
-  Id id("$(PObj)$(Event)$(ISR)$(Msg)$(Ctr)$(MsgVar):x");
-  names.replaceMultirateObjName(id, value);
-  names.replaceMultirateEventName(id, value);
-  names.replaceMultirateISRName(id, value);
-  names.replaceMultirateMsgName(id, value);
-  names.replaceMultirateCtrName(id, value);
-  EXPECT_EQ(shown(id), "a_ba_ba_ba_ba_b$(MsgVar):x");
-  // Text, text of $(MsgVar), notes of the macros in the text.
-  const std::tuple<const char*, std::string, const char*> rows[] = {
-      {"abc", "1", ":"},    {"msg#7;", "7", ":"},  {"a#b#12x", "12", ":"},
-      {"a#", "", ":"},      {"#a b;", "a b", ":"}, {"", "1", ":"},
-      {"a#$N;", "$N", "N:"}};
-  for (const auto& [message, text, notes] : rows) {
-    Id variable("<$(MsgVar)>:$(MsgVar)");
-    names.replaceMultirateMsgVarName(variable, message);
-    EXPECT_EQ(shown(variable), "<" + text + ">:" + text + "$R") << message;
-    variable.setCookLevel(Id::eCookLevelFull);
-    EXPECT_EQ(notedOf(variable), notes);
-  }
 }
 
 TEST_F(MultirateTest, BaseTimeUnitChangesAtAThousandAndAMillion) {

@@ -71,10 +71,10 @@ Ref refFrom(Choices& c, const Model& m) {
 }
 
 void addBlocksAndObjects(Choices& c, Model& m) {
-  m.charts.resize(static_cast<std::size_t>(c.below("charts", 3)));
+  m.charts.resize(static_cast<std::size_t>(c.below("charts", 4)));
   for (Text& chart : m.charts) chart = nameFrom(c, "chartId");
-  m.blocks.resize(static_cast<std::size_t>(c.below("\n  blocks", 5)));
-  m.objects.resize(static_cast<std::size_t>(c.below("objects", 4)));
+  m.blocks.resize(static_cast<std::size_t>(c.below("\n  blocks", 6)));
+  m.objects.resize(static_cast<std::size_t>(c.below("objects", 5)));
   std::vector<int> states{kNone};
   for (std::size_t i = 0; i < m.objects.size(); ++i) {
     Object& o = m.objects[i];
