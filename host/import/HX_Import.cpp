@@ -21,7 +21,8 @@ namespace {
 bool readWords(const fs::path& file, HX_TypeTable::Reserved& words) {
   std::ifstream stream(file);
   for (std::string line; std::getline(stream, line);) {
-    const std::string_view word = HX_Trimmed(line.substr(0, line.find('#')));
+    const std::string_view text = line;
+    const std::string_view word = HX_Trimmed(text.substr(0, text.find('#')));
     if (!word.empty()) words.emplace(word);
   }
   return stream.is_open();
