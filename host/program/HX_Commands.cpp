@@ -14,6 +14,7 @@
 #include "host/program/HX_Generator.h"
 #include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_LockFile.h"
+#include "host/program/HX_NameSets.h"
 #include "host/program/HX_Version.h"
 #include "host/write/HX_DiagnosticLog.h"
 #include "host/write/HX_NameMap.h"
@@ -87,16 +88,36 @@ std::string firstLine(const std::string& text) {
   return text.substr(0, text.find('\n'));
 }
 
+// The renamed names by id; \p since has the names of the older run.
+std::map<std::string, HX_OlderName> renamedSince(HX_NameDiff& since,
+                                                 const std::string& older,
+                                                 const HX_RunResult& result) {
+  std::map<std::string, HX_OlderName> renamed;
+  if (older.empty()) return renamed;
+  HX_AddFormedNames(since, HX_NameDiff::eNew, result);
+  if (!since.compare()) throw std::bad_alloc();
+  for (int i = 0; i < since.rowCount(); ++i) {
+    const HX_NameDiff::Row& row = since.row(i);
+    if (row.change == HX_NameDiff::eRenamed)
+      renamed[std::string(row.after.item)] = {std::string(row.before.name),
+                                              HX_ReasonOf(row)};
+  }
+  return renamed;
+}
+
 // A circle of types leaves no names; the page shows the circle.
-void writeReport(const HX_Arguments& arguments, HX_Generator& generator) {
+void writeReport(const HX_Arguments& arguments, HX_Generator& generator,
+                 HX_NameDiff& since) {
   const std::filesystem::path file = generator.profile.start / arguments.out;
   HX_Output output(file.parent_path());
   const auto explain = [&](const HX_WantedName& name) {
     return generator.forming->explain(name);
   };
-  HX_WriteReport(output.open(file.filename().string()),
-                 {*generator.model, generator.result, explain,
-                  generator.profile.runs(), firstLine(HX_VersionText())});
+  HX_WriteReport(
+      output.open(file.filename().string()),
+      {*generator.model, generator.result, explain, generator.profile.runs(),
+       firstLine(HX_VersionText()), arguments.older,
+       renamedSince(since, arguments.older, generator.result)});
   output.finish();
   if (!arguments.quiet)
     std::cout << generator.result.names.size() << " names in " << arguments.out
@@ -180,7 +201,12 @@ HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments) {
 }
 
 HX_ExitCode HX_ReportNames(const HX_Arguments& arguments) {
-  return runOverModel(arguments, writeReport);
+  HX_NameDiff since;
+  if (!arguments.older.empty())
+    HX_AddNames(since, HX_NameDiff::eOld, arguments.older, arguments);
+  ModelRun run(arguments);
+  writeReport(arguments, *run.generator, since);
+  return run.finish();
 }
 
 HX_ExitCode HX_PruneLock(const HX_Arguments& arguments) {

@@ -199,10 +199,15 @@ CommandLine::CommandLine(HX_DiagnosticLog& log) {
   addImportOptions(*import);
   add("rules", "print the built-in naming rules", HX_PrintRules)
       ->add_flag("--schema", arguments.schema, "print the schema of rules");
-  addOverModel("report", "write a page with names, model, types and times",
-               HX_ReportNames)
+  CLI::App* report =
+      addOverModel("report", "write a page with names, model, types and times",
+                   HX_ReportNames);
+  report
       ->add_option("--out", arguments.out, "the file, for example report.html")
       ->required();
+  report->add_option(
+      "--since", arguments.older,
+      "document, lock or name map to mark renamed names against");
 
   add("help", "print text, cause and cure of a message", HX_HelpMessage)
       ->add_option("NUMBER", arguments.number,

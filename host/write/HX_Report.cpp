@@ -78,7 +78,8 @@ enum HxEStateBit {
   kReserved = 8,
   kError = 16,
   kWarning = 32,
-  kIncomplete = 64
+  kIncomplete = 64,
+  kRenamed = 128
 };
 
 int bitsOf(HX_Change::HxEReasonTag reason) {
@@ -170,7 +171,7 @@ class Report {
     m_Writer.StartObject();
     writeText("model", m_Input.model.name);
     writeText("program", m_Input.program);
-    writeText("since", "");
+    writeText("since", m_Input.since);
     writeNames();
     writeTree("places", m_Places);
     writeTree("scopes", m_Scopes);
@@ -282,6 +283,8 @@ class Report {
       changes.push_back(changesOf(*name));
       messages.push_back(messagesOf(*name));
       const auto scope = m_NumberOfScope.find(wanted.scope);
+      const auto& renamed = m_Input.renamed;
+      const auto older = renamed.find(wanted.id);
       const int row[kCount] = {
           m_Texts.add(wanted.id),
           m_Texts.add(HX_WordOf(kHxNameKinds, wanted.kind)),
@@ -292,9 +295,9 @@ class Report {
           m_Texts.add(expanded),
           m_Texts.add(name->formal()),
           m_Texts.add(name->actual),
-          stateOf(*name),
-          -1,
-          -1};
+          stateOf(*name) | (older != renamed.end() ? kRenamed : 0),
+          older != renamed.end() ? m_Texts.add(older->second.name) : -1,
+          older != renamed.end() ? m_Texts.add(older->second.reason) : -1};
       for (int i = 0; i < kCount; ++i) columns[i].push_back(row[i]);
     }
     m_Writer.Key("names");

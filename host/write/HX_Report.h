@@ -11,6 +11,7 @@
 
 #include <functional>
 #include <iosfwd>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -19,6 +20,12 @@
 #include "host/names/HX_NameForming.h"
 #include "host/write/HX_TimedRun.h"
 
+/// The name of an item in an older run, and why the name differs.
+struct HX_OlderName {
+  std::string name;
+  std::string reason;
+};
+
 struct HX_ReportInput {
   const HX_Model& model;
   const HX_RunResult& result;
@@ -26,6 +33,8 @@ struct HX_ReportInput {
   std::function<std::vector<HX_ExplainedMacro>(const HX_WantedName&)> explain;
   const std::vector<HX_TimedRun>& runs;
   std::string program;  ///< name and version
+  std::string since;    ///< the older run; empty for none
+  std::map<std::string, HX_OlderName> renamed;  ///< by id
 };
 
 /// Texts of the model appear as data only, never as HTML.
