@@ -1,6 +1,6 @@
-// The program beside public generators, each as a process of its own.
+// The program beside public generators; every measurement is a process.
 //
-// One item is one declaration: a variable of ours, a field of the other
+// An item is a declaration: a variable of ours, a field of the peers'
 // languages, 50 to a structure. Time is processor time of the process, user and
 // system, because a loaded machine must not decide. Memory is the largest
 // resident set, told as time: a millisecond stands for a megabyte.
@@ -33,7 +33,7 @@ double secondsOf(const timeval& time) {
          static_cast<double>(time.tv_usec) * 1e-6;
 }
 
-// Runs a program without its output.
+// Runs a program and drops the output.
 Usage run(const std::vector<std::string>& command) {
   const pid_t child = fork();
   if (child == 0) {
@@ -54,7 +54,7 @@ Usage run(const std::vector<std::string>& command) {
   return usage;
 }
 
-/// A public generator and a description of structures in its language.
+/// A public generator and the form of structures in the language.
 struct Peer {
   const char* package;
   const char* file;

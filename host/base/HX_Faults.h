@@ -1,4 +1,4 @@
-// The faults of a text file: one line for each fault, as compilers write them.
+// The faults of a text file: a line per fault, in the form of compilers.
 //
 //   HX_Faults faults;
 //   faults.add(place, "7", "a text");
@@ -18,10 +18,10 @@
 #include "host/messages/HX_Diagnostic.h"
 #include "host/messages/HX_MessageTable.h"
 
-/// The place of a token of a document: its end, in bytes from the start.
+/// The place of a token of a document: the end, in bytes from the start.
 using HX_TokenEnd = std::uint32_t;
 
-/// A file that cannot be read, or an argument without an item: one line.
+/// A line about an unreadable file, or about an argument without an item.
 class HX_InputError : public std::runtime_error {
  public:
   explicit HX_InputError(const std::string& text,
@@ -63,7 +63,7 @@ class HX_Faults {
     std::string expected;
     HX_MessageNumber number;
   };
-  /// The kept faults by place; at one place in the order of add().
+  /// The kept faults by place; equal places in the order of add().
   const std::multimap<std::size_t, Fault>& kept() const { return m_Kept; }
   /// Adds what stands behind the kept faults: "... and 3 more".
   void addRest(std::vector<HX_Diagnostic>& list) const;

@@ -1,8 +1,8 @@
 // Checks a document against the schema while the text is read, and passes the
-// values on to their bindings.
+// values on to the bindings.
 //
-// One frame per open list or object; no recursion. A fault of a value does not
-// end the reading: the value is left out, with all its parts.
+// A frame per open list or object; no recursion. A fault of a value does not
+// end the reading: the value is left out, with all parts.
 #include <algorithm>
 #include <charconv>
 
@@ -40,8 +40,8 @@ HX_Schema boundSchema() {
   return schema;
 }
 
-// What stands at the place of a syntax fault, up to bytes beyond ASCII, since
-// they may be ill-formed.
+// The text at the place of a syntax fault, up to bytes beyond ASCII, because
+// such bytes may be ill-formed.
 std::string_view printable(std::string_view text, std::size_t at) {
   constexpr std::size_t kMost = 12;
   text = text.substr(at, kMost);
@@ -168,7 +168,7 @@ class Reader : public HX_JsonEvents {
   }
 
  private:
-  /// What the next value has to be.
+  /// The expectation of the next value.
   struct Target {
     const HX_SchemaNode* node = nullptr;  // null: the value is left out
     const HX_FieldBinding* binding = nullptr;

@@ -67,7 +67,7 @@ struct HX_Model {
   std::string name;
   std::set<std::string> words;  // of the word lists, and words of every C
   std::set<std::string> libraryWords;  // main, and names of the C library
-  unsigned int patterns = 0;    // HX_ReservedNames::HxEPatternTag
+  unsigned int patterns = 0;           // HX_ReservedNames::HxEPatternTag
   HX_Significance significance;
   HX_CodeOptions code;
   std::deque<HX_TypeItem> types;

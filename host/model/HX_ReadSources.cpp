@@ -145,7 +145,7 @@ class Maker {
         m_Sources(reading.sources),
         m_Model(reading.model) {}
 
-  // Records are freed as they become blocks.
+  // A record is freed when the block exists.
   void makeBlocks() {
     m_Model.blocks.reserve(m_Sources.blocks.size());
     for (int index = 0; !m_Sources.blocks.empty(); ++index) {
@@ -164,8 +164,8 @@ class Maker {
     }
   }
 
-  // A variable belongs to the first component that names the variable.
-  // Components are entered by name: their order in the document has no
+  // A variable belongs to the first component with the name of the variable.
+  // Components are entered by name: the order of the document has no
   // influence.
   void makeComponents() {
     std::map<KyCXString, const HX_ComponentRecord*> byName;
@@ -230,14 +230,14 @@ class Maker {
     record.objects.clear();
   }
 
-  /// What an object hands down to the objects inside.
+  /// Data of an object for the objects inside.
   struct Around {
     KyCXString path;
     KyCXString hierarchy;
     std::string shownPath;
   };
 
-  // Data and states alike: names depend on no difference between them.
+  // Data and states alike: names depend on no difference.
   void makeObjects(int chartIndex, SC_State& chart, const Around& outermost) {
     const auto& objects =
         m_Sources.charts[static_cast<std::size_t>(chartIndex)].objects;

@@ -13,7 +13,7 @@
 class HX_Block;
 class HxCSrcRef;
 
-/// The model that lives has the one object.
+/// The living model has the only object.
 class HX_SourcePaths {
  public:
   HX_SourcePaths() { s_Current = this; }
@@ -42,7 +42,7 @@ class HX_SourcePaths {
   std::unordered_map<const HxCSrcRef*, std::string> m_Paths;
 };
 
-/// The path in the model that lives, in UTF-8, white space as blanks; empty for
+/// The path in the living model, in UTF-8, white space as blanks; empty for
 /// null.
 std::string HX_PathOf(const HxCSrcRef* source);
 

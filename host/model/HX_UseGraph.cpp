@@ -1,9 +1,9 @@
-// Depth-first walk with a stack of its own: a document may chain any number of
+// Depth-first walk with an explicit stack: a document may chain any number of
 // items.
 //
-// Plain form: follow all uses of each item, again and again; quadratic. Idea:
-// an item is finished after all items that it uses. An item that is met while
-// it is open closes a circle: the stack holds the circle, from that item on.
+// Plain form: follow all uses of every item, again and again; quadratic. Idea:
+// an item is finished after all used items. A use of an open item closes a
+// circle: the stack holds the circle, from the open item on.
 //
 // Example: a uses b and c, b uses c: finished in the order c, b, a. If c used
 // a, c would meet a on the stack a, b, c: circle a, b, c.

@@ -1,4 +1,4 @@
-// Which items use which items, for finding circles.
+// The uses between items, for finding circles.
 //
 //   HX_UseGraph graph(2);
 //   graph.add(0, 1);
@@ -19,15 +19,15 @@ class HX_UseGraph {
   /// Items are numbered from 0 to \p count - 1.
   explicit HX_UseGraph(std::size_t count) : m_Uses(count) {}
 
-  /// Enters that \p item uses \p used.
+  /// Enters a use of \p used by \p item.
   void add(std::size_t item, std::size_t used) { m_Uses[item].push_back(used); }
   const std::vector<std::size_t>& usesOf(std::size_t item) const {
     return m_Uses[item];
   }
 
-  /// Visits each item after all items that it uses, circles excepted.
+  /// Visits every item after all used items, circles excepted.
   /// \param finished  may be empty
-  /// \param circle  gets each use that closes a circle: the items of the circle
+  /// \param circle  gets the items of every circle
   /// COST: linear in items and uses; no recursion.
   void walk(const std::function<void(std::size_t)>& finished,
             const std::function<void(const Circle&)>& circle) const;

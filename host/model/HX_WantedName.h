@@ -1,4 +1,4 @@
-// A name as the document asks for the name. Names that were formed stand in
+// A name as the document asks for the name. Formed names stand in
 // host/names/HX_FormedName.h.
 
 #ifndef HOST_MODEL_HX_WANTEDNAME_H
@@ -26,7 +26,7 @@ struct HX_ScopeItem {
   std::map<std::string, const HX_ScopeItem*> blocks;  // inner blocks by id
 };
 
-/// A template; names with equal templates share one.
+/// A template, shared by all names with an equal template.
 struct HX_Template {
   KyCXString text;                     // in ASCII, for the library
   const std::string* shown = nullptr;  // as in the document
@@ -38,7 +38,7 @@ struct HX_Substitution {
   HxCNames::tagMacroKindEnum kind = HxCNames::eMacroKindExact;
 };
 
-/// What few names ask for.
+/// Wishes of few names.
 struct HX_RareWishes {
   std::optional<KyCXString> ivBlock;
   KyCXString x;
@@ -62,7 +62,7 @@ struct HX_RareWishes {
   bool cyclic = true;
 };
 
-/// Fields without a comment mean what the schema says. Never changed after
+/// Fields without a comment have the meaning of the schema. Never changed after
 /// reading.
 struct HX_WantedName {
   std::string id;

@@ -38,7 +38,7 @@ constexpr char kFooter[] =
     "  2  refused: the command line or the document is wrong, or something\n"
     "     cannot be read or written; the output folder is as it was";
 
-// The library of the command line takes negative numbers for unsigned ones.
+// CLI11 reads negative numbers as unsigned numbers.
 const CLI::Validator isSeed(
     [](std::string& text) -> std::string {
       std::uint64_t seed = 0;
@@ -56,7 +56,7 @@ const std::map<std::string, HX_DiagnosticLog::HxEFormatTag> kFormats = {
 
 using Command = HX_ExitCode (*)(const HX_Arguments&);
 
-/// The command line and the command that it chooses.
+/// The command line and the chosen command.
 struct CommandLine {
   /// Options about messages go to \p log.
   explicit CommandLine(HX_DiagnosticLog& log);
@@ -223,7 +223,7 @@ CommandLine::CommandLine(HX_DiagnosticLog& log) {
       ->check(isSeed);
 }
 
-// One line with the word that is wrong.
+// A line with the wrong word.
 std::string textOf(CLI::App& app, const CLI::ParseError& error) {
   std::string what = error.what();
   const std::vector<std::string> unread = app.remaining(true);

@@ -91,7 +91,7 @@ void HX_CWriter::writeTypes(HX_CFile file) const {
 }
 
 // Header and source in one pass: the variables of a large model do not fit the
-// caches, and each comment is made once.
+// caches, and a comment is made once.
 void HX_CWriter::writeCode(HX_CFile header, HX_CFile source) {
   m_Progress.begin("writing C", m_Result.variables.size());
   const std::string guard = HX_CFiles::guardOf(m_Files.code);

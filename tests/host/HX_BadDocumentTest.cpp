@@ -1,5 +1,5 @@
-// Documents that are refused: one line for each fault, with file, place, what
-// was found and what was expected.
+// Refused documents: a line per fault, with file, place, finding and
+// expectation.
 #include <functional>
 
 #include "host/HX_HostTest.h"
@@ -35,9 +35,9 @@ class BadDocumentTest : public HX_HostTest {
   const fs::path m_Model = m_Folder / "model.json";
 };
 
-// A row has a text or patches the demo (RFC 6902), counting on its first
+// A row has a text or patches the demo (RFC 6902), counting on the first
 // entries: block 0 is the root, type 10 "Bool" is derived, type 14 an array,
-// names 0 an isr, 10 a variable. A message that ends in '*' is a beginning.
+// names 0 an isr, 10 a variable. '*' ends the beginning of a message.
 TEST_F(BadDocumentTest, EveryFaultIsALineWithPlaceAndExpectation) {
   const Json demo = parsed(HX_DEMO_MODEL);
   for (const Json& row : parsed("bad_documents.json")) {
@@ -93,7 +93,7 @@ struct HostileCase {
   const char* message;
 };
 
-// Each of these ended the program with a signal once.
+// Every row ended the program with a signal in the past.
 const HostileCase kHostile[] = {
     {"text of 26400 characters for a pattern",
      [] {

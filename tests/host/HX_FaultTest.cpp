@@ -1,5 +1,5 @@
-// What the program does where it cannot write, is stopped or has no memory: one
-// line, and nothing is left behind.
+// Failed writes, signals and missing memory: the program prints a line and
+// leaves nothing behind.
 #include <algorithm>
 #include <csignal>
 #include <set>
@@ -102,7 +102,7 @@ TEST_F(FaultTest, RefusedDocumentsLeaveNoProfile) {
   }
 }
 
-// Memory that ends anywhere is one line, and no file is written; with enough
+// Memory that ends anywhere gives a line, and no file is written; with enough
 // memory the files are the same as ever.
 TEST_F(FaultTest, MissingMemoryIsOneLine) {
   // Sanitizers and emulators need far more addresses than the program.
@@ -119,7 +119,7 @@ TEST_F(FaultTest, MissingMemoryIsOneLine) {
     const Result result = shell("ulimit -v " + std::to_string(kilobytes) +
                                 "; " + HX_CODEGEN_COMMAND " generate --quiet " +
                                 model + " --out " + m_Out.string());
-    // The loader of programs has an exit code and words of its own.
+    // The loader of programs reports in another way.
     if (result.code == 127) continue;
     codes.insert(result.code);
     if (result.code == 0) {

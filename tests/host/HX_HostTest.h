@@ -16,7 +16,7 @@
 #include <string>
 #include <vector>
 
-/// Each test has a folder of its own, empty at the start.
+/// Every test has a folder, empty at the start.
 class HX_HostTest : public testing::Test {
  protected:
   using Json = nlohmann::json;
@@ -31,22 +31,22 @@ class HX_HostTest : public testing::Test {
 
   HX_HostTest();
 
-  /// Runs a shell command with its output caught.
+  /// Runs a shell command and catches the output.
   Result shell(const std::string& command) const;
   Result codegen(const std::string& arguments) const;
   /// Writes code into m_Out.
   Result generate(const std::string& model) const;
-  /// The same of a document, whose code has to compile without a warning.
+  /// Generates code of a document; the code has to compile without a warning.
   Result generateValid(const Json& model) const;
 
-  /// Writes a document and gives its path.
+  /// Writes a document. RETURNS: the path.
   std::string save(const Json& model) const;
   static void write(const std::filesystem::path& path, const std::string& text);
   static std::string read(const std::filesystem::path& path);
   static std::vector<std::string> linesOf(const std::string& text);
   static Files filesIn(const std::filesystem::path& folder);
 
-  /// A file by its path or its name in this folder.
+  /// A file by path, or by name in this folder.
   static Json parsed(const std::filesystem::path& file);
   /// A block, some types, scopes and functions; \p additions has further
   /// "types" and "names".
