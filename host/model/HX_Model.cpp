@@ -15,16 +15,22 @@ using Reading = HX_ModelReading;
 using Value = HX_BoundValue;
 
 // A list of the user adds to the installed list of the same name.
-void readWordList(Reading& r, const Value& value) {
+// RETURNS: false if no folder has the list, or a list cannot be read.
+bool readWords(const std::vector<std::string>& folders, std::string_view list,
+               std::set<std::string>& words) {
   bool isFound = false;
-  for (const std::string& folder : r.keywordFolders) {
-    const std::string file = folder + "/" + std::string(value.text) + ".txt";
+  for (const std::string& folder : folders) {
+    const std::string file = folder + "/" + std::string(list) + ".txt";
     std::error_code error;
     if (!std::filesystem::exists(file, error)) continue;
-    isFound = HX_ReadWordList(file, r.model.words);
+    isFound = HX_ReadWordList(file, words);
     if (!isFound) break;
   }
-  if (!isFound)
+  return isFound;
+}
+
+void readWordList(Reading& r, const Value& value) {
+  if (!readWords(r.keywordFolders, value.text, r.model.words))
     r.faults.add(
         value.place, HX_Quoted(value.text),
         "the name of a word list in " + HX_Visible(r.keywordFolders.back()));
@@ -125,7 +131,7 @@ HX_Bindings HX_OptionBindings() { return {kBindings, std::size(kBindings)}; }
 
 HX_Model::HX_Model(HX_Document& document,
                    const std::vector<std::string>& keywordFolders,
-                   HX_Progress& progress) {
+                   HX_Progress& progress, const HX_ReservedChoice& more) {
   HxCGlobal::setOptions(&options);
   HxCGlobal::setDataTypeServer(&typeServer);
   HX_DdTree::instance().clear();
@@ -155,6 +161,12 @@ HX_Model::HX_Model(HX_Document& document,
   }
   progress.end();
   document.throwIfFaulty();
+  for (const std::string& list : more.lists)
+    if (!readWords(keywordFolders, list, words))
+      throw HX_InputError("found no word list " + HX_Quoted(list) + " in " +
+                          HX_Visible(keywordFolders.back()));
+  for (const std::string& pattern : more.patterns)
+    patterns |= HX_ReservedNames::patternOf(pattern.c_str());
   for (HX_Circle* circle : {&typeCircle, &variableCircle}) {
     if (!circle->items.empty()) circle->place = document.placeText(circle->end);
   }

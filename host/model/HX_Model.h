@@ -52,14 +52,21 @@ struct HX_Significance {
   bool ignoresCase = false;
 };
 
+/// Reserved words and patterns beside those of a document.
+struct HX_ReservedChoice {
+  std::vector<std::string> lists;     ///< file names without ".txt"
+  std::vector<std::string> patterns;  ///< names of HX_ReservedNames
+};
+
 /// Owns all items of the document, in document order.
 struct HX_Model {
   /// Throws HX_DocumentError with the faults of the document, of a word list,
   /// or of a word list that no folder of \p keywordFolders has. The words of
-  /// lists of the same name in several folders count together.
+  /// lists of the same name in several folders count together. Throws
+  /// HX_InputError for a missing list of \p more.
   HX_Model(HX_Document& document,
            const std::vector<std::string>& keywordFolders,
-           HX_Progress& progress);
+           HX_Progress& progress, const HX_ReservedChoice& more = {});
   HX_Model(const HX_Model&) = delete;
   HX_Model& operator=(const HX_Model&) = delete;
   ~HX_Model();

@@ -33,11 +33,13 @@ bool hasError(const std::vector<HX_Finding>& findings) {
 }  // namespace
 
 std::string HX_Change::text() const {
-  if (reason != eTakenByName)
-    return kReasons[reason] + (detail.empty() ? "" : " '" + detail + "'");
+  std::string text = kReasons[reason];
+  if (!detail.empty()) text += " '" + detail + "'";
+  if (owner == nullptr) return text;
   const std::string path = HX_PathOf(HX_BestSource(*owner));
   const std::string id = "'" + owner->id + "'";
-  return "taken by " + (path.empty() ? id : path + " (" + id + ")");
+  const char* const of = detail.empty() ? " " : " of ";
+  return text + of + (path.empty() ? id : path + " (" + id + ")");
 }
 
 std::string HX_FormedName::sourcePath() const {

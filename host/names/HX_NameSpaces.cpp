@@ -127,8 +127,7 @@ bool HX_NameSpaces::define(const HX_WantedName& name, HxCCIdentifier& id,
   request.isExternal = name.scope->kind == HX_ScopeKind::eFile;
   request.symbol = &symbol;
   request.item = name.id;
-  const bool isCode =
-      name.kind == HX_NameKind::eVariable || name.isFunction();
+  const bool isCode = name.kind == HX_NameKind::eVariable || name.isFunction();
   m_Safe.setReserved(isCode ? &m_CodePatterns : &m_Patterns);
   const bool isDefined = m_Safe.define(id, request, safe);
   if (!isDefined) m_Symbols.pop_back();
@@ -160,7 +159,11 @@ HX_Change HX_NameSpaces::changeOf(const HX_SafeName::Step& step) {
       return {static_cast<const Symbol*>(step.symbol)->reason,
               static_cast<const Symbol*>(step.symbol)->owner};
     case HX_SafeName::eIndistinct:
-      return {HX_Change::eIndistinct, nullptr, other()};
+      return {HX_Change::eIndistinct,
+              step.symbol == nullptr
+                  ? nullptr
+                  : static_cast<const Symbol*>(step.symbol)->owner,
+              other()};
     case HX_SafeName::eHeld:
       return {HX_Change::eHeld, nullptr, other()};
     case HX_SafeName::eRetired:

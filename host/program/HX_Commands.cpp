@@ -149,7 +149,8 @@ struct ModelRun {
         generator(std::make_unique<HX_Generator>(
             profile, progress,
             HX_ReadDocument(arguments.model, arguments, profile),
-            keywordFolders(arguments))) {
+            keywordFolders(arguments),
+            HX_ReservedChoice{arguments.reserved, arguments.patterns})) {
     generator->run(lock.lock());
     arguments.log->choose(generator->result);
     requireMemory();

@@ -23,6 +23,7 @@ struct HX_Arguments {
   std::string format = "table";
   std::vector<std::string> templates;
   std::vector<std::string> patterns;
+  std::vector<std::string> reserved;  ///< word lists beside the document's
   int retireRuns = 0;
   bool locked = false;
   std::string out;

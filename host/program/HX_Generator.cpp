@@ -32,13 +32,14 @@ void sortById(std::vector<const HX_FormedName*>& names) {
 
 HX_Generator::HX_Generator(HX_Profile& timing, HX_Progress& shown,
                            HX_Document read,
-                           const std::vector<std::string>& keywordFolders)
+                           const std::vector<std::string>& keywordFolders,
+                           const HX_ReservedChoice& more)
     : profile(timing), progress(shown), document(std::move(read)) {
   const HX_Profile::Phase phase(profile, "Build model");
   std::vector<std::string> folders;
   for (const std::string& folder : keywordFolders)
     folders.push_back((profile.start / folder).lexically_normal().string());
-  model.emplace(document, folders, progress);
+  model.emplace(document, folders, progress, more);
   if (model->code.hasBanner) {
     const std::string version = HX_VersionText();
     banner = version.substr(0, version.find('\n')) + ", document SHA-256 " +

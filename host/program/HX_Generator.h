@@ -24,7 +24,8 @@
 struct HX_Generator {
   /// Throws HX_DocumentError. Folders count from the start of \p profile.
   HX_Generator(HX_Profile& profile, HX_Progress& progress, HX_Document read,
-               const std::vector<std::string>& keywordFolders);
+               const std::vector<std::string>& keywordFolders,
+               const HX_ReservedChoice& more = {});
 
   /// Orders types, forms names, orders variables. A circle of types ends the
   /// run without names. Throws HX_DocumentError for reserved words among types.

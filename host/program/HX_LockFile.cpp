@@ -48,11 +48,10 @@ int HX_LockFile::addChanges(HX_DiagnosticLog& log) const {
   int changes = 0;
   for (int at = 0; at < m_Lock.size(); ++at) {
     const HX_NameLock::HxEChangeTag change = m_Lock.change(at);
-    if (change == HX_NameLock::eGone || change == HX_NameLock::eKept) continue;
+    if (change != HX_NameLock::eAdded && change != HX_NameLock::eRenamed)
+      continue;
     const HX_NameLock::Entry& entry = m_Lock.entry(at);
-    const char* what = change == HX_NameLock::eRenamed   ? "renamed to"
-                       : change == HX_NameLock::eRevived ? "back with"
-                                                         : "new,";
+    const char* what = change == HX_NameLock::eRenamed ? "renamed to" : "new,";
     log.add({kHxNotInLock, 2, HX_MessageText(kHxNotInLock, {what, entry.name}),
              std::string(entry.item), ""});
     ++changes;

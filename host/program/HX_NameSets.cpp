@@ -63,7 +63,8 @@ void addDocument(HX_NameDiff& diff, HX_NameDiff::HxESideTag side,
                  arguments.ownKeywords.end());
   HX_Progress silent(false);
   HX_Generator generator(profile, silent,
-                         HX_ReadDocument(file, arguments, profile), folders);
+                         HX_ReadDocument(file, arguments, profile), folders,
+                         {arguments.reserved, arguments.patterns});
   generator.run(nullptr);
   HX_AddFormedNames(diff, side, generator.result);
 }

@@ -64,6 +64,7 @@ struct CommandLine {
   CLI::App* add(const char* name, const char* description, Command chosen);
   CLI::App* addOverModel(const char* name, const char* description,
                          Command chosen);
+  void addPatterns(CLI::App& added);
   void addImportOptions(CLI::App& added);
   void addMessageOptions(CLI::App& added);
 
@@ -91,6 +92,11 @@ CLI::App* CommandLine::addOverModel(const char* name, const char* description,
   added->add_option("--lock", arguments.lock, "file of the names to keep");
   added->add_option("--profile", arguments.profile,
                     "folder for reports on what took how long");
+  added
+      ->add_option("--reserved", arguments.reserved,
+                   "word list beside those of the document; may be repeated")
+      ->allow_extra_args(false);
+  addPatterns(*added);
   addImportOptions(*added);
   return added;
 }
@@ -109,6 +115,20 @@ void CommandLine::addMessageOptions(CLI::App& added) {
                   "numbers of warnings and notes to leave out, with ','")
       ->delimiter(',')
       ->allow_extra_args(false);
+}
+
+void CommandLine::addPatterns(CLI::App& added) {
+  const auto check = [](const std::string& name) {
+    return HX_ReservedNames::patternOf(name.c_str()) != 0
+               ? std::string()
+               : "unknown pattern " + name;
+  };
+  added
+      .add_option("--pattern", arguments.patterns,
+                  "reserved pattern that names must not match; may be "
+                  "repeated")
+      ->allow_extra_args(false)
+      ->check(CLI::Validator(check, ""));
 }
 
 void CommandLine::addImportOptions(CLI::App& added) {
@@ -179,17 +199,7 @@ CommandLine::CommandLine(HX_DiagnosticLog& log) {
       add("lint", "check name templates without a model", HX_LintTemplates);
   lint->add_option("TEMPLATE", arguments.templates, "templates to check");
   lint->add_option("--rules", arguments.rules, "file of naming rules");
-  lint->add_option("--pattern", arguments.patterns,
-                   "reserved pattern that names must not match; may be "
-                   "repeated")
-      ->allow_extra_args(false)
-      ->check(CLI::Validator(
-          [](const std::string& name) {
-            return HX_ReservedNames::patternOf(name.c_str()) != 0
-                       ? std::string()
-                       : "unknown pattern " + name;
-          },
-          ""));
+  addPatterns(*lint);
   lint->add_flag("--json", arguments.json, "print JSON instead");
 
   CLI::App* import = add("import", "print a model file as a model document",

@@ -227,6 +227,25 @@ TEST_F(HostSafeNamesTest, WordsPatternsAndSignificanceOfADocumentCount) {
       {"d", "n_strong"}, {"e", "engine_speed"}, {"f", "ENGI_a"}};
   EXPECT_EQ(expected, names());
 
+  // Further lists and patterns by options, and the place of the other name.
+  const Json again =
+      modelOf({variable("a", "READY"),
+               variable("b", "E9"),
+               {{"id", "c"}, {"template", "engine:engine"}},
+               {{"id", "d"}, {"template", "ENGINE_load:ENGINE_load"}}},
+              {{"significant", {{"external", 6}, {"ignoreCase", true}}}});
+  const std::string names = "names " + save(again);
+  const Result more = codegen(names + " --reserved osek --pattern E");
+  EXPECT_THAT(more.out, HasSubstr("READ_a"));
+  EXPECT_THAT(more.out, HasSubstr("n_E9"));
+  EXPECT_THAT(
+      more.out,
+      HasSubstr("The name 'ENGINE_load' is reserved by the pattern 'E'"));
+  EXPECT_THAT(codegen(names).out,
+              HasSubstr("is not distinct from 'engine' of 'c', and"));
+  EXPECT_EQ(2, codegen(names + " --reserved osec").code);
+
+  save(model);
   write(own / "main.txt", "mine\ntwo words\n");
   const Result refused = codegen(command);
   EXPECT_EQ(2, refused.code);
