@@ -1,5 +1,6 @@
 #include "Strings/STR_StringSupport.h"
 
+#include <cmath>
 #include <cstdarg>
 #include <cstddef>
 #include <cstdint>
@@ -41,6 +42,8 @@ std::size_t blockSize(double value, int precision, int decimals) {
     const std::size_t digits = digitCount(static_cast<std::int64_t>(value));
     return digits + static_cast<std::size_t>(precision) + 3 + sign;
   }
+  // The C run-times differ in the sign of NaN, HX_WriteFixed() writes the sign.
+  if (std::isnan(value)) return std::signbit(value) ? 5 : 4;
   const int length = std::snprintf(nullptr, 0, "%.*f", decimals, value);
   // Of more than INT_MAX characters the C library says -1, but 0 for a
   // precision of INT_MAX itself.

@@ -4,6 +4,7 @@
 #include <string>
 #include <vector>
 
+#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -100,6 +101,7 @@ bool parsesTexts() {
 }
 
 TEST(StringParserTest, WithoutMemoryResultsKeepTheirTexts) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   ASSERT_TRUE(parsesTexts());
   HX_WithoutEachHeapBlock("parse", parsesTexts);
 }

@@ -2,6 +2,7 @@
 
 #include <cctype>
 #include <climits>
+#include <cmath>
 #include <cstdio>
 #include <cstring>
 #include <limits>
@@ -55,6 +56,8 @@ TEST_F(StringSupportTest, NumbersAreWrittenInFull) {
     for (int precision : {-1, 0, 1, 2, 17, 1080}) {
       char expected[1500];
       std::snprintf(expected, sizeof expected, "%.*f", precision, value);
+      if (value != value)
+        std::strcpy(expected, std::signbit(value) ? "-nan" : "nan");
       const HX_ForeignLocale foreign;
       EXPECT_EQ(taken(STR_DoubleToString(value, precision)), expected);
     }
