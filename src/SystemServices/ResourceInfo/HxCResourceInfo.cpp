@@ -73,26 +73,27 @@ bool HxCResourceInfo::readResource() {
 
   // All or nothing: a copy takes the numbers and texts first.
   HxCResourceInfo read(*this);
-  read.setVersions(info);
+  read.setVersions(
+      {highWord(info.dwProductVersionMS), lowWord(info.dwProductVersionMS),
+       highWord(info.dwProductVersionLS), lowWord(info.dwProductVersionLS)},
+      {highWord(info.dwFileVersionMS), lowWord(info.dwFileVersionMS),
+       highWord(info.dwFileVersionLS), lowWord(info.dwFileVersionLS)});
   read.setTexts(block.get());
   *this = std::move(read);
   return true;
 }
 
-void HxCResourceInfo::setVersions(const VS_FIXEDFILEINFO& info) {
-  m_Product = {
-      highWord(info.dwProductVersionMS), lowWord(info.dwProductVersionMS),
-      highWord(info.dwProductVersionLS), lowWord(info.dwProductVersionLS)};
-  m_File = {highWord(info.dwFileVersionMS), lowWord(info.dwFileVersionMS),
-            highWord(info.dwFileVersionLS), lowWord(info.dwFileVersionLS)};
+void HxCResourceInfo::setVersions(const Version& product, const Version& file) {
+  m_Product = product;
+  m_File = file;
 
-  KyCXString product =
+  KyCXString shown =
       HX_Decimal(m_Product.majorPart) + "." + HX_Decimal(m_Product.minorPart);
   if (m_Product.subPart > 0 || m_Product.maintenance > 0)
-    product += KyCXString(".") + HX_Decimal(m_Product.subPart);
+    shown += KyCXString(".") + HX_Decimal(m_Product.subPart);
   if (m_Product.maintenance > 0)
-    product += KyCXString(".") + HX_Decimal(m_Product.maintenance);
-  m_pProductVersion = HX_SharedText(product);
+    shown += KyCXString(".") + HX_Decimal(m_Product.maintenance);
+  m_pProductVersion = HX_SharedText(shown);
   m_pFileVersion = HX_SharedText(
       HX_Decimal(m_File.majorPart) + "." + HX_Decimal(m_File.minorPart) + "." +
       HX_Decimal(m_File.subPart) + "." + HX_Decimal(m_File.maintenance));

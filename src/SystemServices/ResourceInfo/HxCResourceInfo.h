@@ -13,7 +13,6 @@
 #include "HX_Export.h"
 
 class KyCXString;
-struct VS_FIXEDFILEINFO;
 
 /// Reads the resource once. Until then numbers are -1 and texts null.
 /// OWNERSHIP: object and copies share the texts; a text is released with the
@@ -64,7 +63,7 @@ class HX_UTILS_API HxCResourceInfo : public HX_Allocated {
   };
 
   bool readResource();
-  void setVersions(const VS_FIXEDFILEINFO& info);
+  void setVersions(const Version& product, const Version& file);
   void setTexts(const void* block);
 
   bool m_IsRetrieved = false;
