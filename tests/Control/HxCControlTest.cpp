@@ -221,6 +221,7 @@ TEST_F(ControlTest, ADebugReportBreaksOnTheAnswer1Alone) {
 #endif
 
 TEST_F(ControlTest, WithoutMemoryTimersStayAndNothingIsThrown) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   HxCControl::setProfiling(1.0);
   HxCControl control, assigned;
   std::optional<HxCControl> copy;

@@ -460,6 +460,7 @@ bool sortsMixedNodes() {
 }
 
 TEST_F(DependencySortingTest, BlocksComeFromTheController) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   HX_CountingController memory;
   HxCDependencySorting sorting;
   std::vector<HxCSsNode> nodes(40, HxCSsNode("n"));
@@ -476,6 +477,7 @@ TEST_F(DependencySortingTest, BlocksComeFromTheController) {
 }
 
 TEST_F(DependencySortingTest, WithoutMemoryTheSortFails) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   ASSERT_TRUE(sortsMixedNodes());
   HX_WithoutEachBlock("sort", sortsMixedNodes);
   HX_WithoutEachHeapBlock("sort", sortsMixedNodes);

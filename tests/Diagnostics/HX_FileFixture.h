@@ -10,6 +10,7 @@
 
 #include "Diagnostics/HX_TimingListener.h"
 #include "support/HX_Environment.h"
+#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
 
 class HX_FileFixture : public HX_TestFixture {
@@ -21,9 +22,10 @@ class HX_FileFixture : public HX_TestFixture {
     std::filesystem::remove_all(directory);
   }
 
-  /// The bytes of a file of the directory; "(none)" for a missing file.
+  /// The text of a file of the directory, with line ends of one character on
+  /// every system; "(none)" for a missing file.
   static std::string content(const char* name) {
-    std::ifstream file(name, std::ios::binary);
+    std::ifstream file(name);
     if (!file) return "(none)";
     return std::string(std::istreambuf_iterator<char>(file), {});
   }

@@ -269,6 +269,7 @@ bool reportsTwoWatches() {
 }
 
 TEST_F(StopWatchTest, MissingMemoryLosesRecordsButNoTimes) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   setFrequency(1'000'000);
   ASSERT_TRUE(reportsTwoWatches());
   HX_WithoutEachHeapBlock("watches", reportsTwoWatches);

@@ -213,6 +213,7 @@ TEST_F(DebugServerTest, ModelInformationIsCutToItsFields) {
 }
 
 TEST_F(DebugServerTest, MissingMemoryCostsOnlyTheTableOfResults) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   HX_CountingController controller;
   controller.fail();
   {

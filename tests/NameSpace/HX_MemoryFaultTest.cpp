@@ -88,6 +88,7 @@ bool derivesLongNames() {
 }
 
 TEST_F(MemoryFaultTest, EachBlockMayBeMissing) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   HX_WithoutEachBlock("intern names", internsNames);
   HX_WithoutEachBlock("derive names", derivesNames);
   HX_WithoutEachBlock("derive long names", derivesLongNames);
@@ -95,6 +96,7 @@ TEST_F(MemoryFaultTest, EachBlockMayBeMissing) {
 }
 
 TEST_F(MemoryFaultTest, EveryBlockComesFromTheController) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   HX_CountingController memory;
   const int before = HX_HeapBlocks();
   internsNames();

@@ -1,6 +1,7 @@
 // Names while memory runs out: all or nothing.
 #include "Naming/HX_NamingFixture.h"
 #include "platform/model/HxCSymbol.h"
+#include "support/HX_HeapCount.h"
 
 namespace {
 
@@ -54,6 +55,7 @@ bool isWhole() {
 class NamingMemoryTest : public HX_NamingFixture {};
 
 TEST_F(NamingMemoryTest, AnIdentifierChangesAsAWholeOrNotAtAll) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   const unsigned short units[] = {0x4F60, 0x597D};
   const KyCXString wide(units, 2);
   const KyCXString text(kLong);
@@ -117,6 +119,7 @@ TEST_F(NamingMemoryTest, WithoutAControllerBlockNothingIsMadeOrExpanded) {
 }
 
 TEST_F(NamingMemoryTest, SeveralMacrosAreReplacedOneByOne) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   static HxCSymbol symbol(kLong, HxCSymbol::eFunction);
   symbol.setDollarX(kLong);
   HX_WithoutEachHeapBlock("several macros", [] {
@@ -136,6 +139,7 @@ TEST_F(NamingMemoryTest, SeveralMacrosAreReplacedOneByOne) {
 }
 
 TEST_F(NamingMemoryTest, ADictionaryIsReplacedAsAWhole) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   static bool isLost = false;
   HX_WithoutEachHeapBlock("dictionary", [] {
     const KyCXString word("word");

@@ -7,7 +7,6 @@ namespace {
 using testing::Each;
 using testing::ElementsAre;
 using testing::IsEmpty;
-using testing::MatchesRegex;
 
 class KeywordsTest : public HX_NamingFixture {
  protected:
@@ -65,7 +64,7 @@ TEST_F(KeywordsTest, WithoutADictionaryEveryUseIsAsserted) {
   EXPECT_FALSE(isValid("1"));
   EXPECT_FALSE(isValid(""));
   EXPECT_EQ(messages().size(), 3U);
-  EXPECT_THAT(messages(), Each(MatchesRegex(kAssertion)));
+  EXPECT_THAT(messages(), Each(HX_Fits(kAssertion)));
 }
 
 TEST_F(KeywordsTest, TheReasonIsToldWithoutAMessage) {

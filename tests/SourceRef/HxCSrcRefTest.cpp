@@ -20,6 +20,7 @@
 #include "platform/model/HX_SlBlockHandlesDB.h"
 #include "platform/model/HxCGlobal.h"
 #include "platform/model/SC_Model.h"
+#include "support/HX_HeapCount.h"
 #include "support/HX_TestFixture.h"
 
 namespace {
@@ -128,6 +129,7 @@ bool comparesOrigins() {
 }
 
 TEST_F(SrcRefTest, WithoutMemoryNothingIsThrownOrHalfDone) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   const LongModel model;
   s_Model = &model;
   HX_WithoutEachHeapBlock("texts", formsTexts);

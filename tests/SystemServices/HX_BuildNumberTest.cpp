@@ -83,6 +83,7 @@ TEST_F(BuildNumberTest, CopiesOutliveTheirOriginalsRedefinition) {
 }
 
 TEST_F(BuildNumberTest, TextsAreBlocksOfTheController) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   HX_CountingController controller;
   {
     HX_BuildNumber build;
@@ -135,6 +136,7 @@ class OfficialVersionTest : public HX_TestFixture {
 };
 
 TEST_F(OfficialVersionTest, EvaluationKeepsWhatItGot) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   EXPECT_FALSE(m_Official.evalBrennicVersionAndReleaseDate()) << "no function";
   EXPECT_EQ(evaluate(structure("1", "2"), 1), "||");
   EXPECT_EQ(evaluate(nullptr, 0), "||");

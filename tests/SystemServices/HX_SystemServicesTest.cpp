@@ -118,6 +118,7 @@ TEST_F(SystemServicesTest, HolderCreatesOnDemandAndClosesItsFiles) {
 }
 
 TEST_F(SystemServicesTest, MissingMemoryGivesNothing) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
 #if defined(_WIN32)
   static constexpr char kNull[] = "NUL";
 #else

@@ -187,6 +187,7 @@ constexpr Change kChanges[] = {
     }};
 
 TEST_F(PlatformTest, TextsStayAsTheyWereWithoutMemory) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   const KyCXString narrow(("1 " + std::string(96, 'a') + "b ").c_str());
   const unsigned short kUnit = 0x416;
   const KyCXString wide = narrow.head(50) + KyCXString(&kUnit, 1) + narrow;
@@ -217,6 +218,7 @@ TEST_F(PlatformTest, TextsStayAsTheyWereWithoutMemory) {
 }
 
 TEST_F(PlatformTest, MessagesWithoutMemoryReachStatusAndSink) {
+  HX_NEEDS_HEAP_OF_LIBRARY();
   HX_MessageHandler& handler = HX_MessageHandler::instance();
   const std::string argument(100, 'x');
   int heard = 0;

@@ -5,6 +5,8 @@
 #include <cstdlib>
 #include <new>
 
+#include "platform/strings/KyCXString.h"
+
 namespace {
 
 int s_Asked = 0;
@@ -30,6 +32,13 @@ void release(void* block) noexcept {
 int HX_HeapBlocks() { return s_Asked; }
 
 int HX_LiveHeapBlocks() { return s_Live; }
+
+bool HX_HeapReachesLibrary() {
+  const int before = s_Asked;
+  KyCXString text;
+  text.reserve(1000);
+  return s_Asked > before;
+}
 
 HX_FailingHeap::HX_FailingHeap(int number, bool allAfter)
     : m_Start(s_Asked), m_LiveAtStart(s_Live) {

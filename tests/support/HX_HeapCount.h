@@ -11,6 +11,16 @@ int HX_HeapBlocks();
 /// Blocks of new that no delete has given back yet.
 int HX_LiveHeapBlocks();
 
+/// True if the operator new of the test program is the one of the library too.
+/// A DLL of Windows has an operator new of its own.
+bool HX_HeapReachesLibrary();
+
+/// Skips a test that lets the library run out of memory where the test program
+/// cannot.
+#define HX_NEEDS_HEAP_OF_LIBRARY() \
+  if (!HX_HeapReachesLibrary())    \
+  GTEST_SKIP() << "the library has an operator new of its own"
+
 /// Heap that runs out, installed while the object lives. Only operator new
 /// fails, by std::bad_alloc; malloc() does not.
 class HX_FailingHeap {

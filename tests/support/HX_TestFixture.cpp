@@ -1,5 +1,7 @@
 #include "support/HX_TestFixture.h"
 
+#include <regex>
+
 #include "platform/messages/HX_MessageHandler.h"
 #include "support/HX_HeapCount.h"
 
@@ -92,6 +94,10 @@ struct FailingController : HX_CountingController {
 };
 
 }  // namespace
+
+bool HX_FitsPattern(const std::string& text, const std::string& pattern) {
+  return std::regex_match(text, std::regex(pattern));
+}
 
 void HX_WithoutEachBlock(const char* why, bool (*job)()) {
   withoutEachBlock<FailingController>(why, job);

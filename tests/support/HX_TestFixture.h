@@ -24,6 +24,13 @@ inline unsigned HX_Seed() {
   return static_cast<unsigned>(testing::UnitTest::GetInstance()->random_seed());
 }
 
+/// True if \p pattern describes all of \p text. GoogleTest's own matcher knows
+/// no [0-9] on Windows.
+bool HX_FitsPattern(const std::string& text, const std::string& pattern);
+MATCHER_P(HX_Fits, pattern, "fits " + std::string(pattern)) {
+  return HX_FitsPattern(arg, pattern);
+}
+
 /// Starts each test with an empty message handler that shows nothing, internal
 /// information off, no memory controller and the system's clocks.
 class HX_TestFixture : public testing::Test {
