@@ -114,6 +114,11 @@ const auto& rows() {
     HX_ROW("substAllDollarZByValue", "omn",
            return told(s.names.substAllDollarZByValue(id, text, s.ids[c.other],
                                                       Kind(c.number % 3)))),
+    HX_DO("replaceMultirateTimeName", "pf",
+          s.names.replaceMultirateTimeName(id, c.period, c.offset, c.flag)),
+    HX_DO("replaceMultirateTaskISRName", "ohf",
+          s.names.replaceMultirateTaskISRName(id, s.ids[c.other],
+                                              s.ids[c.third], c.flag)),
     HX_ROW("setName", "t", return told(id.setName(text))),
     HX_DO("setSourceRef", "r", id.setSourceRef(s.ref(c.index))),
     HX_DO("setDdSourceRef", "r", id.setDdSourceRef(s.ref(c.index))),
@@ -134,11 +139,6 @@ const auto& rows() {
     HX_DO("handleSymbolNameMacro", "s",
           if (c.index != kNone)
               s.names.handleSymbolNameMacro(id, s.symbol(c.index))),
-    HX_DO("replaceMultirateTimeName", "pf",
-          s.names.replaceMultirateTimeName(id, c.period, c.offset, c.flag)),
-    HX_DO("replaceMultirateTaskISRName", "ohf",
-          s.names.replaceMultirateTaskISRName(id, s.ids[c.other],
-                                              s.ids[c.third], c.flag)),
     HX_DO("replaceMultirateObjName", "o",
           s.names.replaceMultirateObjName(id, s.ids[c.other])),
     HX_DO("replaceMultirateEventName", "o",
@@ -363,15 +363,16 @@ std::string differenceOfNames(const std::string& bytes, std::string* log) {
     for (const char* argument = operation.arguments; *argument; ++argument)
       drawArgument(choices, model, *argument, calls.back());
   };
-  // First identifiers with template and references, then any calls, mostly
-  // expansions and substitutions.
-  const std::size_t kSetters = 9, kRows = std::size(rows<PlainSide>());
+  // First identifiers with template and references, then any calls, half of
+  // them expansions, substitutions and multirate names.
+  const std::size_t kSetters = 11, kRows = std::size(rows<PlainSide>());
   for (int id = 0; id < 2; ++id)
-    for (std::size_t row = 2; row < kSetters; ++row)
-      if (choices.byte() % 4 > (row < 4 ? 0 : row == 4 ? 1 : 2)) add(row, id);
+    for (std::size_t row = 4; row < kSetters; ++row)
+      if (choices.byte() % 4 > (row < 6 ? 0 : row == 6 ? 1 : 2)) add(row, id);
   while (calls.size() < 16 && !choices.isEmpty()) {
+    const std::size_t often[] = {0, 1, 0, 1, 2, 3};
     const auto row = static_cast<std::size_t>(choices.byte()) % (2 * kRows);
-    add(row < kRows ? row : row % 2, choices.byte() % kIds);
+    add(row < kRows ? row : often[row % 6], choices.byte() % kIds);
   }
   LibrarySide library(model);
   PlainSide plain(model);
