@@ -8,7 +8,7 @@ namespace plain {
 
 namespace {
 
-constexpr std::size_t kIds = 3;
+constexpr int kIds = 3;
 
 // The plain side: indices stay indices, texts stay texts.
 struct PlainSide {
