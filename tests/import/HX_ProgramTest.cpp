@@ -67,7 +67,7 @@ TEST_F(ProgramTest, RefusalsAreOneLine) {
   EXPECT_EQ(2, m_Code);
   EXPECT_EQ(
       "hx_codegen: m.slx: simulink/blockdiagram.xml:1:3: expected "
-      "well-formed XML: Start-end tags mismatch\n",
+      "well-formed XML: Start-end tags mismatch [601]\n",
       codegen("generate m.slx --out code"));
   EXPECT_EQ(2, m_Code);
 }
