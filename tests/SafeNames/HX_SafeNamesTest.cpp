@@ -73,6 +73,9 @@ const StepCase kStepCases[] = {
     {"shortened beside an underscore", "abcdefghijklmn_pqrstuvwxyz0_2345678_",
      Reserved::ePatternUnderscores,
      "abcdefghijklmn_vwxyz0_2345678_: shortened"},
+    {"shortened before an underscore", "abcdefghijklmnopqrstu_wxyz0123456789",
+     Reserved::ePatternUnderscores,
+     "abcdefghijklmno_wxyz0123456789: shortened"},
     {"fixed and long",
      "abcdefghijklmnopqrstuvwxyz0123456:"
      "abcdefghijklmnopqrstuvwxyz0123456",
@@ -174,6 +177,12 @@ TEST_F(SafeNamesTest, ConflictsTellTheOtherName) {
       {body, false, "maximux_y", "maximux_y"},
       {body, false, "MAXIMUX", "MAXIMUX"},
       {file, false, "MAXIMUX", "MAXIMU_b: taken by MAXIMUX, derived"},
+      // Variants taken among external names stay free for internal names.
+      {file, true, "va", "va"},
+      {file, true, "va_a", "va_a"},
+      {other, true, "va", "va_b: taken by va, derived"},
+      {other, false, "va", "va"},
+      {other, false, "va", "va_a: taken by va, derived"},
   };
   HX_SafeName name;
   for (const auto& row : kRows) {
@@ -529,6 +538,15 @@ TEST_F(SafeNamesLockTest, GivesAndHoldsNames) {
     for (std::size_t i = 0; i < items.size(); ++i)
       EXPECT_EQ(row.results[i], steps[items[i].id]) << items[i].id;
   }
+}
+
+// Such a lock comes from scopes that were apart before.
+TEST_F(SafeNamesLockTest, ANameOfAnOuterScopeIsNotHeldInside) {
+  std::string lock =
+      "hx_names_lock 1\na\tx\tx\tfile\ti\t-\nb\tx\tx\tbody\ti\t-\n";
+  run({{"b", "x", 1, false}, {"a", "x", 0, false}}, lock);
+  EXPECT_EQ("x_a: held by a, derived", steps["b"]);
+  EXPECT_EQ("x", steps["a"]);
 }
 
 TEST_F(SafeNamesLockTest, ANameReservedSinceIsGivenAnew) {
