@@ -3,18 +3,18 @@
   reserved_words.py write FOLDER    writes the lists that come from headers
   reserved_words.py check FOLDER    proves every list, prints each fault
 
-A list from headers holds what the headers of one edition declare (functions,
-types, enumeration constants, variables) or define (macros). The compiler says
-so: every token of the preprocessed headers is tried as `int TOKEN = 1;` behind
-the headers, and a token that the compiler refuses is taken. One run of the
-compiler tries all tokens, because each stands on a line of its own.
+A list from headers holds the functions, types, constants, variables and macros
+of the headers of an edition. The script tries every token of the preprocessed
+headers as `int TOKEN = 1;` behind the headers; a token that the compiler refuses
+is taken. Every token stands on a line of its own, so a single run of the compiler
+tries all tokens.
 
-check demands of each word of each list one of:
+check demands of every word in every list one of:
   - a compiler of that mode refuses `int WORD = 1;`
   - a header of that mode declares or defines the word
   - the word stands in ACCEPTED or STANDARD below: the installed compilers and
     headers are older than the word, or the word is reserved in places only
-and of the headers that each word they take stands in the list.
+and that every word taken by the headers stands in the list.
 """
 
 import pathlib

@@ -39,7 +39,7 @@ bool isMarker(View line) {
       [&](View marker) { return line.substr(0, marker.size()) == marker; });
 }
 
-// False for a backslash that starts no escape.
+// False for a backslash without a known escape.
 bool unescape(View field, std::string& text) {
   text.clear();
   for (std::size_t i = 0; i < field.size(); ++i) {
@@ -111,7 +111,7 @@ struct HX_NameLock::Items : HX_Allocated {
     return slot == nullptr ? -1 : static_cast<int>(slot->value);
   }
 
-  // A copy that lives as long as the lock. Throws std::bad_alloc.
+  // Copy for the life of the lock. Throws std::bad_alloc.
   View keep(View text) {
     if (text.empty()) return {};
     const char* const kept = texts.add(text.data(), text.size());
@@ -119,7 +119,7 @@ struct HX_NameLock::Items : HX_Allocated {
     return {kept, text.size()};
   }
 
-  // Takes the texts of \p entry as they are. Throws std::bad_alloc.
+  // Takes the texts of \p entry without a copy. Throws std::bad_alloc.
   void add(const Entry& entry, HxEChangeTag change) {
     if (!items.append(Item{entry, -1, change})) throw std::bad_alloc();
     if (index.add(keyOf(entry.item), items.size() - 1) != nullptr) return;
@@ -127,7 +127,7 @@ struct HX_NameLock::Items : HX_Allocated {
     throw std::bad_alloc();
   }
 
-  // In front of the other former names. Throws std::bad_alloc.
+  // In front of older former names. Throws std::bad_alloc.
   void addFormer(Item& item, const Former& added) {
     if (!formers.append(added)) throw std::bad_alloc();
     const int position = static_cast<int>(formers.size()) - 1;
@@ -367,7 +367,7 @@ bool HX_NameLock::note(const Entry& entry) {
   return HX_WithinMemory([&] {
     const int position = find(entry.item);
     const Entry old = position < 0 ? Entry{} : this->entry(position);
-    // Texts that stay the same are kept once.
+    // Equal texts share a copy.
     const auto kept = [this](View text, View before) {
       return text == before ? before : m_pItems->keep(text);
     };
@@ -413,7 +413,7 @@ void HX_NameLock::endRun(int retireRuns) {
   for (int at = 0; at < size(); ++at) {
     Items::Item& item = m_pItems->item(at);
     if (item.entry.item.empty()) continue;
-    // The name that this run has replaced starts to count with the next run.
+    // A name replaced in this run starts to count with the next run.
     const Items::Former* const replaced =
         item.change == eRenamed ? &m_pItems->former(item.firstFormer) : nullptr;
     m_pItems->dropFormers(item, [&](Items::Former& former) {

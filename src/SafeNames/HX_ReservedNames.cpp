@@ -68,7 +68,7 @@ constexpr PatternRow kPatterns[] = {
      [](Name n) { return n.size() > 1 && n.substr(n.size() - 2) == "_t"; }},
 };
 
-// The word of a line without its comment and the blanks around it.
+// Word of a line, without comment and surrounding blanks.
 Name wordOf(Name line) {
   line = line.substr(0, line.find('#'));
   const std::size_t from = line.find_first_not_of(" \t");
@@ -82,7 +82,7 @@ bool readWhole(const char* path, std::string& content) {
   if (file == nullptr) return false;
   char block[4096];
   bool isRead = true;
-  // A text that cannot grow must not leave the file open.
+  // Missing memory must not leave the file open.
   const bool isKept = HX_WithinMemory([&] {
     std::size_t count = 0;
     while ((count = std::fread(block, 1, sizeof block, file)) != 0)
@@ -101,7 +101,7 @@ struct HX_ReservedNames::Words : HX_Allocated {
     const char* profile;
   };
 
-  // Null for a text that is no word.
+  // Null for any other text.
   const Word* find(Name wanted) const {
     const auto* const slot =
         index.find(hx_detail::keyOf(wanted),

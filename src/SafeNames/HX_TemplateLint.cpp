@@ -26,8 +26,8 @@ constexpr BoundRow kBounds[] = {
 // Macros that mark a name changeable.
 constexpr const char* kChanging[] = {"$R", "$S", "$C"};
 
-// Values that stand for all values of macros: a pattern that matches with each
-// of them depends on literal text alone.
+// Samples of macro values: a pattern that matches with all samples depends on
+// literal text alone.
 constexpr const char* kValues[] = {"", "a", "Q", "_1", "z_q", "x0"};
 
 int boundOf(const HX_TemplateLint::Macro& macro) {

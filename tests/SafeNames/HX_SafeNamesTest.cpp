@@ -1,5 +1,5 @@
-// One call for a safe name: its steps, random names against a plain form, and
-// locks over runs that differ.
+// Steps of a safe name, random names against a plain form, locks over runs with
+// changes.
 #include "SafeNames/HX_SafeNames.h"
 
 #include <algorithm>
@@ -52,7 +52,7 @@ struct StepCase {
   const char* result;
 };
 
-// One set of names for all rows, which are defined in this order. The limit is
+// The rows share a set of names and are defined in this order. The limit is
 // on; "goto" is a keyword, "printf" a word of the profile "lib".
 const StepCase kStepCases[] = {
     {"as it is", "speed", 0, "speed"},
@@ -213,7 +213,7 @@ std::string randomForm(std::mt19937& random) {
   return form;
 }
 
-// What the plain form knows of a defined name.
+// A defined name in the plain form.
 struct Given {
   std::string name;
   int scope;
@@ -464,7 +464,7 @@ TEST_F(SafeNamesLockTest, ChangesRenameNoOtherItem) {
         EXPECT_EQ(before.at(item), name) << item;
         continue;
       }
-      // A new item has no name of an item that went, in the same scope.
+      // No new item has the name of a removed item of the same scope.
       const auto old =
           std::find_if(before.begin(), before.end(), [&](const auto& entry) {
             return entry.second == name && after.count(entry.first) == 0 &&
@@ -540,7 +540,7 @@ TEST_F(SafeNamesLockTest, GivesAndHoldsNames) {
   }
 }
 
-// Such a lock comes from scopes that were apart before.
+// Separate scopes became nested after the lock was written.
 TEST_F(SafeNamesLockTest, ANameOfAnOuterScopeIsNotHeldInside) {
   std::string lock =
       "hx_names_lock 1\na\tx\tx\tfile\ti\t-\nb\tx\tx\tbody\ti\t-\n";
