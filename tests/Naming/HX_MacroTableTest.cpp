@@ -66,6 +66,26 @@ std::string code(const std::string& text) {
   return text.empty() ? text : "`" + text + "`";
 }
 
+// Text for a manual page: hyphens stay hyphens, and no backquotes.
+std::string manualText(const std::string& text) {
+  std::string result;
+  for (const char c : text) {
+    if (c == '-') result += '\\';
+    if (c != '`') result += c;
+  }
+  return result;
+}
+
+std::string manualRow(const HX_Macro& macro) {
+  std::string row = std::string(".TP\n.B ") + macro.text + "\n" +
+                    manualText(macro.meaning) + ".\n";
+  if (*macro.example != 0)
+    row += "Example: " + manualText(macro.example) + ".\n";
+  if (*macro.placeholder != 0)
+    row += std::string("Without a value: ") + macro.placeholder + ".\n";
+  return row;
+}
+
 TEST_F(MacroTableTest, PageAndDictionaryShowTheTable) {
   const std::pair<const char*, const char*> stages[] = {
       {"Macros of the caller",
@@ -93,6 +113,14 @@ TEST_F(MacroTableTest, PageAndDictionaryShowTheTable) {
       "The expansion writes the text of the column \"without a value\" where "
       "the object is missing or an earlier stage left the macro in the "
       "name.\n";
+  std::string manual =
+      ".TH HX_TEMPLATES 7\n.SH NAME\nhx_templates \\- macros of name "
+      "templates\n.SH DESCRIPTION\n"
+      "A name template is text with macros. A template of two parts, "
+      "\"formal:actual\", gives the two names apart.\n"
+      "Examples: block \"Speed Gain\" in subsystem a3, chart object \"go#\" "
+      "with number 7 in a chart of subsystem c, period 10 ms with offset 5 ms, "
+      "for fixed units two units with an offset of one unit.\n";
   std::string dictionary =
       "# Macros of name templates, written by script/macros.\n";
   for (int stage = 0; stage < 4; ++stage) {
@@ -100,8 +128,11 @@ TEST_F(MacroTableTest, PageAndDictionaryShowTheTable) {
             stages[stage].second +
             "\n\n| macro | value | from | example | without a value | bit |\n"
             "|---|---|---|---|---|---|\n";
+    manual += std::string(".SS ") + stages[stage].first + "\n" +
+              manualText(stages[stage].second) + "\n";
     for (const HX_Macro& macro : HX_Macros()) {
       if (macro.stage != stage) continue;
+      manual += manualRow(macro);
       page += "| " + code(macro.text) + " | " + macro.meaning + " | " +
               origins[macro.origin] + " | " + code(macro.example) + " | " +
               code(macro.placeholder) + " | " + bitText(macro.bit) + " |\n";
@@ -110,7 +141,9 @@ TEST_F(MacroTableTest, PageAndDictionaryShowTheTable) {
   }
   for (const char* part : {"$E(", "$(", ")", "'", ":"})
     dictionary += std::string("\"") + part + "\"\n";
+  manual += ".SH SEE ALSO\n.BR hx_codegen (1)\n";
   expectFile("docs/templates.md", page);
+  expectFile("docs/hx_templates.7", manual);
   expectFile("fuzz/names.dict", dictionary);
 }
 
