@@ -275,7 +275,8 @@ void drawArgument(Choices& c, const Model& m, char argument, Call& call) {
   if (argument == 'f') call.flag = c.flag("flag");
   if (argument == 't') call.text = templateFrom(c);
   if (argument == 'l')
-    call.text = c.text("label", 4, {u"<", u" ", u"a", u">", u"9-", u"\n"});
+    call.text =
+        c.text("label", 3, {u"<", u" ", u"a", u">", u"9-", u"\n", u"< a >"});
   if (argument == 'm')
     call.text =
         c.text("macro", 1,
