@@ -4,28 +4,10 @@
 #include <rapidjson/reader.h>
 
 #include <cstdint>
-#include <cstdlib>
-#include <new>
+
+#include "host/base/HX_CheckedAllocator.h"
 
 namespace {
-
-// The allocators of the parser do not check for missing memory.
-struct Allocator {
-  static constexpr bool kNeedFree = true;
-  static void* checked(void* memory) {
-    if (memory == nullptr) throw std::bad_alloc();
-    return memory;
-  }
-  void* Malloc(std::size_t size) {
-    return size == 0 ? nullptr : checked(std::malloc(size));
-  }
-  void* Realloc(void* original, std::size_t, std::size_t size) {
-    if (size != 0) return checked(std::realloc(original, size));
-    std::free(original);
-    return nullptr;
-  }
-  static void Free(void* memory) { std::free(memory); }
-};
 
 /// Turns the calls of the parser into events.
 class Adapter {
@@ -128,7 +110,8 @@ HX_JsonEnd HX_ReadJson(std::string_view text, HX_JsonEvents& events) {
       text.starts_with(kByteOrderMark) ? kByteOrderMark.size() : 0;
   rapidjson::MemoryStream stream(text.data() + skipped, text.size() - skipped);
   Adapter adapter(stream, skipped, events);
-  rapidjson::GenericReader<rapidjson::UTF8<>, rapidjson::UTF8<>, Allocator>
+  rapidjson::GenericReader<rapidjson::UTF8<>, rapidjson::UTF8<>,
+                           HX_CheckedAllocator>
       reader;
   const rapidjson::ParseResult result = reader.Parse<kFlags>(stream, adapter);
   HX_JsonEnd end;

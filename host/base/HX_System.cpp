@@ -62,7 +62,7 @@ void HX_WriteError(const char* text) {
   }
 }
 
-void HX_KeepMemoryBack() {
+bool HX_KeepMemoryBack() {
   constexpr std::size_t kEnough = 1 << 20;
   s_MemoryKept = std::malloc(kEnough);
   std::set_new_handler([] {
@@ -71,6 +71,7 @@ void HX_KeepMemoryBack() {
     s_MemoryKept = nullptr;
     throw std::bad_alloc();
   });
+  return s_MemoryKept != nullptr;
 }
 
 bool HX_DidMemoryEnd() { return s_DidMemoryEnd; }

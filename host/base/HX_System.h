@@ -17,7 +17,8 @@ void HX_WriteError(const char* text);
 
 /// Keeps memory back for the way out: when the memory ends, that memory is
 /// freed and std::bad_alloc is thrown once.
-void HX_KeepMemoryBack();
+/// \return false without memory to keep: exceptions may then end the program
+bool HX_KeepMemoryBack();
 
 /// Whether the memory ended at any time, also where the failure was handled.
 bool HX_DidMemoryEnd();

@@ -39,11 +39,18 @@ constexpr HX_FieldBinding kBindings[] = {
 
 // The kind of scope that a kind of scope may stand in; no value means the
 // document itself. A block may also stand in a block.
-const std::map<HX_ScopeKind, std::optional<HX_ScopeKind>> kParents = {
-    {HX_ScopeKind::eFile, {}},
-    {HX_ScopeKind::eFlat, {}},
-    {HX_ScopeKind::eFunction, HX_ScopeKind::eFile},
-    {HX_ScopeKind::eBlock, HX_ScopeKind::eFunction}};
+std::optional<HX_ScopeKind> parentOf(HX_ScopeKind kind) {
+  switch (kind) {
+    case HX_ScopeKind::eFunction:
+      return HX_ScopeKind::eFile;
+    case HX_ScopeKind::eBlock:
+      return HX_ScopeKind::eFunction;
+    case HX_ScopeKind::eFile:
+    case HX_ScopeKind::eFlat:
+      break;
+  }
+  return {};
+}
 
 std::string kindText(const std::optional<HX_ScopeKind>& kind) {
   return kind ? std::string(HX_WordOf(kHxScopeKinds, *kind)) : "the document";
@@ -86,7 +93,7 @@ class Maker {
   }
 
   bool checkParent(const HX_ScopeRecord& record, const HX_ScopeItem& item) {
-    const std::optional<HX_ScopeKind> wanted = kParents.at(item.kind);
+    const std::optional<HX_ScopeKind> wanted = parentOf(item.kind);
     std::optional<HX_ScopeKind> found;
     if (item.parent != nullptr) found = item.parent->kind;
     const bool isBlockInBlock =

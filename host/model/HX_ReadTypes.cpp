@@ -12,16 +12,19 @@ using Reading = HX_ModelReading;
 using Value = HX_BoundValue;
 
 // Ranges of the arithmetic types on two's complement machines.
-const std::map<HX_CType, HX_NumericalType> kCTypeRanges = {
-    {HX_CType::eSignedChar, {-128, 127, 8, true}},
-    {HX_CType::eUnsignedChar, {0, 255, 8, false}},
-    {HX_CType::eShort, {-32768, 32767, 16, true}},
-    {HX_CType::eUnsignedShort, {0, 65535, 16, false}},
-    {HX_CType::eInt, {-2147483648.0, 2147483647, 32, true}},
-    {HX_CType::eUnsignedInt, {0, 4294967295.0, 32, false}},
-    {HX_CType::eFloat, {-FLT_MAX, FLT_MAX, 32, true}},
-    {HX_CType::eDouble, {-DBL_MAX, DBL_MAX, 64, true}},
-};
+HX_NumericalType rangeOf(HX_CType type) {
+  static const std::map<HX_CType, HX_NumericalType> s_Ranges = {
+      {HX_CType::eSignedChar, {-128, 127, 8, true}},
+      {HX_CType::eUnsignedChar, {0, 255, 8, false}},
+      {HX_CType::eShort, {-32768, 32767, 16, true}},
+      {HX_CType::eUnsignedShort, {0, 65535, 16, false}},
+      {HX_CType::eInt, {-2147483648.0, 2147483647, 32, true}},
+      {HX_CType::eUnsignedInt, {0, 4294967295.0, 32, false}},
+      {HX_CType::eFloat, {-FLT_MAX, FLT_MAX, 32, true}},
+      {HX_CType::eDouble, {-DBL_MAX, DBL_MAX, 64, true}},
+  };
+  return s_Ranges.at(type);
+}
 
 // The types of <stdint.h> of C99: [u]int[_least|_fast]N_t, [u]intptr_t,
 // [u]intmax_t.
@@ -106,7 +109,7 @@ void completeKind(const HX_TypeRecord& record, HX_TypeItem& item) {
   switch (item.kind) {
     case HX_TypeKind::eBase:
       type.setBase();
-      item.numerical = kCTypeRanges.at(*item.cType);
+      item.numerical = rangeOf(*item.cType);
       break;
     case HX_TypeKind::eDerived:
       type.setDerivedFrom(of);

@@ -6,11 +6,15 @@
 #include <charconv>
 #include <stdexcept>
 
+#include "host/base/HX_CheckedAllocator.h"
 #include "host/base/HX_Text.h"
 
 namespace {
 
-using Json = rapidjson::Value;
+using Pool = rapidjson::MemoryPoolAllocator<HX_CheckedAllocator>;
+using Document =
+    rapidjson::GenericDocument<rapidjson::UTF8<>, Pool, HX_CheckedAllocator>;
+using Json = Document::ValueType;
 
 std::string_view textOf(const Json& value) {
   return {value.GetString(), value.GetStringLength()};
@@ -238,7 +242,7 @@ std::size_t charactersIn(std::string_view utf8) {
 }  // namespace
 
 HX_Schema::HX_Schema(const char* text) {
-  rapidjson::Document json;
+  Document json;
   if (json.Parse(text).HasParseError()) refuse("JSON");
   Compiler(*this, json);
 }

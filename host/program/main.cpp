@@ -298,18 +298,23 @@ int runWithLog(int argc, char** argv, HX_DiagnosticLog& log) {
   return kHxRefused;
 }
 
+int refuseMemory() {
+  HX_WriteError("hx_codegen: out of memory [203]\n");
+  return kHxRefused;
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
   try {
     HX_PrepareProcess();
-    HX_KeepMemoryBack();
+    if (!HX_KeepMemoryBack()) return refuseMemory();
     HX_DiagnosticLog log;
     const int code = runWithLog(argc, argv, log);
     log.write(std::cerr, code, HX_ErrorTerminal());
     return code;
   } catch (const std::bad_alloc&) {
-    HX_WriteError("hx_codegen: out of memory [203]\n");
+    return refuseMemory();
   } catch (const std::exception& error) {
     std::cerr << "hx_codegen: " << error.what() << '\n';
   }

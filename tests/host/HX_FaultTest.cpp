@@ -116,18 +116,19 @@ TEST_F(FaultTest, MissingMemoryIsOneLine) {
   for (int kilobytes = 14000; kilobytes <= 21000; kilobytes += 175) {
     SCOPED_TRACE(kilobytes);
     fs::remove_all(m_Out);
+    const std::string limit = "ulimit -v " + std::to_string(kilobytes) + "; ";
+    // The loader of programs, and what runs before main(), report otherwise.
+    if (shell(limit + HX_CODEGEN_COMMAND " --version").code != 0) continue;
     const Result result = shell("ulimit -v " + std::to_string(kilobytes) +
                                 "; " + HX_CODEGEN_COMMAND " generate --quiet " +
                                 model + " --out " + m_Out.string());
-    // The loader of programs reports in another way.
-    if (result.code == 127) continue;
     codes.insert(result.code);
     if (result.code == 0) {
       EXPECT_EQ(whole, filesIn(m_Out));
       continue;
     }
     EXPECT_EQ(2, result.code);
-    EXPECT_EQ("hx_codegen: out of memory\n", result.err);
+    EXPECT_THAT(result.err, MatchesRegex("hx_codegen: out of memory[^\n]*\n"));
     EXPECT_FALSE(fs::exists(m_Out));
   }
   EXPECT_EQ((std::set<int>{0, 2}), codes);
