@@ -30,6 +30,7 @@ class HX_UTILS_API HX_NameDiff : public HX_Allocated {
     std::string_view changes = {};       ///< why name and wanted name differ
   };
 
+  /// The set before and the set now.
   enum HxESideTag : int { eOld = 0, eNew = 1 };
   /// Fate of an item.
   enum HxEChangeTag : int { eKept = 0, eAdded = 1, eRemoved = 2, eRenamed = 3 };
@@ -45,6 +46,7 @@ class HX_UTILS_API HX_NameDiff : public HX_Allocated {
 
   /// An item in one set or both. The absent record has an empty item.
   struct Row {
+    /// Fate of the item, reason of a renaming, the two records.
     HxEChangeTag change = eKept;
     HxEReasonTag reason = eNoReason;
     Record before;
@@ -54,6 +56,7 @@ class HX_UTILS_API HX_NameDiff : public HX_Allocated {
   /// "Replace the whole word from by to." Applied one after the other, the
   /// substitutions never replace a word twice.
   struct Substitution {
+    /// Old word and new word.
     std::string_view from;
     std::string_view to;
   };

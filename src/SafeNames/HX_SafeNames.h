@@ -71,11 +71,12 @@ class HX_UTILS_API HX_SafeName : public HX_Allocated {
 
   /// Step on the road.
   struct Step {
-    HxEStepTag kind = eExpanded;
+    HxEStepTag kind = eExpanded;  ///< change or conflict
     KyCXString text;  ///< the name after the step, or the name in conflict
     const char* reason = nullptr;       ///< profile or pattern
     const HxCSymbol* symbol = nullptr;  ///< the other name's symbol, if any
     const char* other = nullptr;        ///< the other name or the lock's item
+    /// Kind of the word, for eKeyword.
     HxCNames::tagHxEDictEntryType wordKind = HxCNames::eDictCKeyword;
   };
 

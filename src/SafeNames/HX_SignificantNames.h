@@ -36,6 +36,7 @@ class HX_UTILS_API HX_SignificantNames : public HX_Allocated {
   struct Clash {
     const char* first = nullptr;   ///< the name that was there
     const char* second = nullptr;  ///< the name that was to be added
+    /// Places given with the names.
     const HxCSrcRef* firstPlace = nullptr;
     const HxCSrcRef* secondPlace = nullptr;
   };

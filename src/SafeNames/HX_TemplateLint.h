@@ -38,6 +38,7 @@ class HX_UTILS_API HX_TemplateLint : public HX_Allocated {
   /// RETURNS: false, with an empty template, without memory.
   bool read(const KyCXString& form);
 
+  /// Macros of both parts.
   int macroCount() const;
   /// REQUIRES: \p index in [0, macroCount()).
   const Macro& macro(int index) const;
