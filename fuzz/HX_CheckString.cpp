@@ -1,4 +1,4 @@
-// The string class against a plain one over std::wstring.
+// The string class against a plain class over std::wstring.
 #include <climits>
 #include <map>
 #include <regex>
@@ -110,7 +110,7 @@ struct PlainString : std::wstring {
 
 void read(KyCXString& text, HX_Bytes& bytes) { text = bytes.text(); }
 
-// Not through the class that is checked.
+// Not through the class under check.
 void read(PlainString& text, HX_Bytes& bytes) {
   for (const char c : bytes.line()) text.push_back(HX_Bytes::unitOf(c));
 }
@@ -126,7 +126,7 @@ struct Arguments {
   KyCXString::ScEPosition position;
 };
 
-// Each works on both classes; what was moved from is empty.
+// Every change works on both classes; a moved text is empty.
 template <class Text>
 constexpr void (*kChanges[])(Text& t, const Arguments<Text>& a) = {
     [](auto& t, auto& a) { t = a.given; },
@@ -172,7 +172,7 @@ int position(HX_Bytes& bytes) {
   return number < 2 ? (number == 0 ? INT_MIN : INT_MAX) : number % 50 - 5;
 }
 
-// Changes one of two texts; gives what it then answers.
+// Changes the first or the second text; gives the answers of the text.
 template <class Text>
 std::string step(Text* texts, HX_Bytes& bytes) {
   const int change = bytes.below(static_cast<int>(std::size(kChanges<Text>)));

@@ -1,5 +1,5 @@
 // Texts beside std::u16string, and beside QString where Qt is installed. One
-// item is one text of the size given: 25 units are a name, 1,000 a long text.
+// item is a text of the size given: 25 units are a name, 1,000 a long text.
 
 #include "platform/strings/KyCXString.h"
 
@@ -16,7 +16,7 @@ namespace {
 
 constexpr int kTexts = 64;  // enough that no branch learns one text by heart
 
-// The i-th of some texts of one size that differ in their last characters.
+// Text i of a series; the texts have the same size and different ends.
 std::string sample(int size, int i) {
   static const char kWords[] = "subsystem_controller_gain_";
   std::string text;
@@ -70,7 +70,7 @@ QString from8Bit(const QString&, const char* text) {
 QByteArray to8Bit(const QString& text) { return text.toLatin1(); }
 #endif
 
-// Calls work(text, other, 8-bit text) for each of the texts; other is an equal
+// Calls work(text, other, 8-bit text) for all texts; \p other is an equal
 // text in another object.
 template <class Text, class Work>
 void forEachText(benchmark::State& state, Work work) {
@@ -125,7 +125,7 @@ void BM_Compare(benchmark::State& state) {
                               const char*) { return compareOf(text, other); });
 }
 
-// Looks for the end of the text, whose beginning occurs throughout.
+// Looks for the end of the text; the beginning of the end occurs throughout.
 template <class Text>
 void BM_Find(benchmark::State& state) {
   const int size = static_cast<int>(state.range(0));

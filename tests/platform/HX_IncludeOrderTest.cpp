@@ -1,4 +1,4 @@
-// An order that is declared after the container, and the order of references
+// An order declared after the container, and the order of references
 // where the container is included first: both must be used.
 #include "platform/containers/dictionary.h"
 

@@ -1,4 +1,4 @@
-// The process clock of a library that is loaded late counts from the start of
+// The process clock of a library loaded late counts from the start of
 // the process all the same.
 #include <dlfcn.h>
 #include <gtest/gtest.h>
@@ -21,7 +21,7 @@ TEST(LateClockTest, CountsFromTheStartOfTheProcess) {
   const std::int64_t early = HX_ProcessClock();
   const std::int64_t late = clock();
   EXPECT_GE(late, kWait);
-  // Both read the start in steps of up to 10 ms, and ask one after the other.
+  // Both clocks read the start in steps of up to 10 ms.
   EXPECT_NEAR(static_cast<double>(late), static_cast<double>(early), 1000.0);
   EXPECT_GE(HX_ProcessClock() + 10, late);
 }

@@ -24,7 +24,7 @@ namespace {
 
 using testing::ElementsAre;
 
-// Read before the clock's own file is set up, if the linker puts that later.
+// Read before the static objects of the clock exist, in some link orders.
 const std::int64_t kTimeAtLoad = HX_ProcessClock();
 
 using PlatformTest = HX_TestFixture;
@@ -77,7 +77,7 @@ TEST_F(PlatformTest, StackAndArrayGiveBackWhatTheyHold) {
   EXPECT_EQ(leda::array<int>().high(), -1);
 }
 
-// Name, path and parent of blocks that are asked by handle and by path.
+// Name, path and parent of blocks, asked by handle and by path.
 TEST_F(PlatformTest, ModelTreeAnswersForEachBlock) {
   const unsigned short kWide[] = {'g', 0x3B1, 0x416};
   const KyCXString wide(kWide, 3);
@@ -162,8 +162,8 @@ TEST_F(PlatformTest, NumbersAreWrittenInTheWidthAsked) {
             sizeof(long) == 4 ? 10 : 20);
 }
 
-// Changes of a text that ask for memory: of 100 units below 256, and of as many
-// with a larger unit among them.
+// Changes of a text with need of memory: of 100 units below 256, and of a text
+// with a larger unit.
 using Change = void (*)(KyCXString& text, const KyCXString& wide);
 constexpr Change kChanges[] = {
     [](auto& text, auto& wide) { text = wide; },
