@@ -30,6 +30,7 @@ void HX_JsonWriter::next() {
 }
 
 void HX_JsonWriter::newLine() {
+  if (m_Indent == kOneLine) return;
   m_Pieces.text += '\n';
   m_Pieces.text.append(m_Depth * m_Indent, ' ');
 }

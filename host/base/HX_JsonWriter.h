@@ -42,9 +42,11 @@ class HX_TextPieces {
 /// REQUIRES: brackets in pairs; a key before each value of an object.
 class HX_JsonWriter {
  public:
-  /// \param indent  blanks per level
+  /// \param indent  blanks per level; kOneLine for a document on a line
   HX_JsonWriter(std::ostream& out, std::size_t indent)
       : m_Pieces(out), m_Indent(indent) {}
+
+  static constexpr std::size_t kOneLine = static_cast<std::size_t>(-1);
 
   void open(char bracket);
   void close(char bracket);

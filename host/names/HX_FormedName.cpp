@@ -1,6 +1,7 @@
 #include "host/names/HX_FormedName.h"
 
 #include <algorithm>
+#include <iterator>
 
 #include "SourceRef/HxCSrcRefServer.h"
 
@@ -25,6 +26,15 @@ constexpr const char* kReasons[] = {"",
                                     "name of the C library",
                                     "macro of the generated code"};
 
+// In the order of HX_Change::HxEReasonTag; the schema of name maps lists them.
+constexpr const char* kKinds[] = {
+    "none",     "madeIdentifier", "shortened",       "keyword",
+    "baseType", "typeName",       "takenByConstant", "takenByName",
+    "pattern",  "rewritten",      "indistinct",      "held",
+    "retired",  "locked",         "noVariant",       "library",
+    "macro"};
+static_assert(std::size(kKinds) == std::size(kReasons));
+
 bool hasError(const std::vector<HX_Finding>& findings) {
   return std::any_of(findings.begin(), findings.end(),
                      [](const HX_Finding& each) { return each.isError(); });
@@ -41,6 +51,8 @@ std::string HX_Change::text() const {
   const char* const of = detail.empty() ? " " : " of ";
   return text + of + (path.empty() ? id : path + " (" + id + ")");
 }
+
+const char* HX_Change::kind() const { return kKinds[reason]; }
 
 std::string HX_FormedName::sourcePath() const {
   return HX_PathOf(HX_BestSource(*wanted));

@@ -40,6 +40,9 @@ struct HX_Change {
   const HX_WantedName* owner = nullptr;  // for eTakenByName
   std::string detail = {};
 
+  /// A word for programs, for example "takenByName".
+  const char* kind() const;
+
   /// Empty for eNone. \return for example "shortened", "taken by m/Pedal/Gain
   /// ('gain')"
   std::string text() const;
@@ -58,7 +61,7 @@ struct HX_FormedName {
   const HX_WantedName* wanted;
   KyCXString actual;
   bool isComplete = false;
-  bool isDefined = false;  // stands in a scope and may be written into code
+  bool isDefined = false;     // stands in a scope and may be written into code
   mutable HX_CodePlace code;  // entered by the writer of the code
   std::vector<HX_Change> changes;
   std::vector<HX_Finding> findings;
@@ -69,14 +72,24 @@ struct HX_FormedName {
   const KyCXString& formal() const {
     return m_OtherFormal != nullptr ? *m_OtherFormal : actual;
   }
-  /// REQUIRES: `actual` has its final value.
+  /// The name before the search for a free name.
+  const KyCXString& wantedText() const {
+    return m_OtherWanted != nullptr ? *m_OtherWanted : actual;
+  }
+  /// REQUIRES: `actual` has its final value, as below.
+  void setWantedText(const KyCXString& text) {
+    if (!(text == actual))
+      m_OtherWanted = std::make_unique<const KyCXString>(text);
+  }
   void setFormal(const KyCXString& formal) {
     if (!(formal == actual))
       m_OtherFormal = std::make_unique<const KyCXString>(formal);
   }
 
  private:
-  std::unique_ptr<const KyCXString> m_OtherFormal;  // null if equal to actual
+  // Null if equal to actual.
+  std::unique_ptr<const KyCXString> m_OtherFormal;
+  std::unique_ptr<const KyCXString> m_OtherWanted;
 };
 
 /// The first eight bytes of a text as a number: where the numbers differ, texts

@@ -70,8 +70,10 @@ void HX_NameForming::form(HX_FormedName& name) {
   name.isComplete = *isComplete;
 
   // A name that still holds macros is no C name yet.
-  if (name.isComplete || wanted.rare().retained == 0) define(id, name);
+  const bool isFinal = name.isComplete || wanted.rare().retained == 0;
+  if (isFinal) define(id, name);
   name.actual = id.getCookedName(HxCCIdentifier::eActualName);
+  if (isFinal) name.setWantedText(m_Safe.wanted());
   name.setFormal(id.getCookedName(HxCCIdentifier::eFormalName));
   if (wanted.isTask()) m_TaskNames[&wanted] = id;
 }

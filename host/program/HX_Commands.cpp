@@ -32,8 +32,9 @@ void showNames(const HX_Arguments& arguments, HX_Generator& generator) {
   const HX_Profile::Phase phase(generator.profile, "Print");
   if (arguments.log->format != HX_DiagnosticLog::eText)
     arguments.log->add(generator.result);
-  if (arguments.json)
-    HX_WriteJson(std::cout, generator.result);
+  if (arguments.json || arguments.lines)
+    HX_WriteJson(std::cout, *generator.model, generator.result,
+                 arguments.lines);
   else
     HX_WriteTable(std::cout, generator.result, generator.progress);
 }
@@ -62,11 +63,12 @@ void generateCode(const HX_Arguments& arguments, HX_Generator& generator,
     lockOutput->finish();
   }
   HX_Output output(generator.profile.start / arguments.out);
-  const std::size_t changed = generator.write(output);
+  const std::size_t changed = generator.write(output, arguments.lines);
   arguments.log->choose(result);
   arguments.log->add(result);
   if (result.hasErrors()) return;
-  if (arguments.json) HX_WriteJson(std::cout, result);
+  if (arguments.json)
+    HX_WriteJson(std::cout, *generator.model, result, arguments.lines);
   // If a report cannot be written, no file of the code changes.
   generator.profile.finish();
   HX_FlushOutput();

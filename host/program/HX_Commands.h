@@ -33,6 +33,7 @@ struct HX_Arguments {
   std::string rules;
   bool schema = false;
   bool json = false;
+  bool lines = false;
   bool quiet = false;
   int number = 0;  ///< of a message; 0 for all
   int blocks = 1000;

@@ -84,12 +84,13 @@ void HX_Generator::run(HX_NameLock* lock) {
                std::to_string(result.types.size()) + " types");
 }
 
-std::size_t HX_Generator::write(HX_Output& output) {
+std::size_t HX_Generator::write(HX_Output& output, bool asLines) {
   const HX_Profile::Phase phase(profile, "Write C");
   sortById(result.names);
   HX_CWriter(*model, result, banner, progress).write(output);
-  HX_WriteNameMap(output.open("name_map.json"), output.open("name_map.csv"),
-                  result, progress);
+  HX_WriteNameMap(output.open(asLines ? "name_map.jsonl" : "name_map.json"),
+                  output.open("name_map.csv"), *model, result, asLines,
+                  progress);
   progress.end();
   return output.finish();
 }

@@ -33,8 +33,9 @@ struct HX_Generator {
   void run(HX_NameLock* lock);
 
   /// Writes the C code, and the name map by id.
+  /// \param asLines  the JSON of the name map has a document per line
   /// \return the number of files that the commit of \p output changes
-  std::size_t write(HX_Output& output);
+  std::size_t write(HX_Output& output, bool asLines);
 
   HX_Profile& profile;
   HX_Progress& progress;

@@ -40,11 +40,10 @@ void addMap(HX_NameDiff& diff, HX_NameDiff::HxESideTag side,
             const Json& names) {
   for (const Json& name : names) {
     std::string changes;
-    const auto texts = name.find("changes");
+    const auto texts = name.find("reasons");
     if (texts != name.end() && texts->is_array())
       for (const Json& text : *texts)
-        if (text.is_string())
-          changes += (changes.empty() ? "" : ", ") + text.get<std::string>();
+        changes += (changes.empty() ? "" : ", ") + textOf(text, "text");
     add(diff, side,
         {textOf(name, "id"),
          textOf(name, "actual"),
@@ -90,7 +89,7 @@ void HX_AddNames(HX_NameDiff& diff, HX_NameDiff::HxESideTag side,
   if (text.find("hx_names_lock") <= 3 || text.rfind("<<<<<<<", 0) == 0)
     return addLock(diff, side, file, text);
   const Json root = Json::parse(text, nullptr, false);
-  const bool isMap = root.is_object() && !root.contains("model") &&
+  const bool isMap = root.is_object() && root.contains("nameMap") &&
                      root.contains("names") && root["names"].is_array();
   if (isMap) return addMap(diff, side, root["names"]);
   addDocument(diff, side, file, arguments);

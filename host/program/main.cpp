@@ -154,8 +154,11 @@ CommandLine::CommandLine(HX_DiagnosticLog& log) {
   app.set_version_flag("--version", HX_VersionText());
   arguments.keywords = HX_ProgramFolder() / HX_DATA_FOLDER / "keywords";
 
-  addOverModel("names", "print a table of all names", HX_ShowNames)
-      ->add_flag("--json", arguments.json, "print JSON instead");
+  CLI::App* names =
+      addOverModel("names", "print a table of all names", HX_ShowNames);
+  names->add_flag("--json", arguments.json, "print the name map instead");
+  names->add_flag("--lines", arguments.lines,
+                  "print the name map with a JSON document per line");
   addOverModel("explain", "show macro by macro how a name came", HX_ExplainName)
       ->add_option("--name", arguments.name, "the id of the name")
       ->required();
@@ -165,6 +168,9 @@ CommandLine::CommandLine(HX_DiagnosticLog& log) {
   generate->add_option("--out", arguments.out, "folder for the files")
       ->required();
   generate->add_flag("--json", arguments.json, "print the name map as well");
+  generate->add_flag("--lines", arguments.lines,
+                     "write name_map.jsonl, a JSON document per line, in place "
+                     "of name_map.json");
   generate
       ->add_flag("--locked", arguments.locked,
                  "refuse new and changed names, change no lock")

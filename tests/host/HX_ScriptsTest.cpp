@@ -77,7 +77,7 @@ TEST_F(ScriptsTest, CodeOfAForeignModelCompiles) {
   EXPECT_THAT(files.at("_u6A21__u578B_.c"),
               HasSubstr("/* 速度 */\nInt "
                         "_u524D__u901F__u5EA6___u77ED__u6A21__u578B_;"));
-  EXPECT_THAT(files.at("name_map.csv"), HasSubstr("n,前$B_$T$M,"));
+  EXPECT_THAT(files.at("name_map.csv"), HasSubstr(",前$B_$T$M,"));
 }
 
 TEST_F(ScriptsTest, MessagesShowEscapesForControlCharacters) {
