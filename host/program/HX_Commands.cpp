@@ -144,7 +144,8 @@ HX_LockFile lockFileOf(const HX_Arguments& arguments,
 
 /// A run over the model of the command line.
 struct ModelRun {
-  explicit ModelRun(const HX_Arguments& arguments)
+  /// \param explains  the command asks how names came about
+  explicit ModelRun(const HX_Arguments& arguments, bool explains = true)
       : progress(!arguments.quiet && HX_IsErrorOutputTerminal()),
         profile(arguments.profile),
         lock(lockFileOf(arguments, profile.start)),
@@ -153,6 +154,7 @@ struct ModelRun {
             HX_ReadDocument(arguments.model, arguments, profile),
             keywordFolders(arguments),
             HX_ReservedChoice{arguments.reserved, arguments.patterns})) {
+    generator->keepsSpaces = explains;
     generator->run(lock.lock());
     arguments.log->choose(generator->result);
     requireMemory();
@@ -175,8 +177,9 @@ struct ModelRun {
   std::unique_ptr<HX_Generator> generator;
 };
 
-HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command) {
-  ModelRun run(arguments);
+HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command,
+                         bool explains = true) {
+  ModelRun run(arguments, explains);
   command(arguments, *run.generator);
   return run.finish();
 }
@@ -184,7 +187,7 @@ HX_ExitCode runOverModel(const HX_Arguments& arguments, Command command) {
 }  // namespace
 
 HX_ExitCode HX_ShowNames(const HX_Arguments& arguments) {
-  return runOverModel(arguments, showNames);
+  return runOverModel(arguments, showNames, false);
 }
 
 HX_ExitCode HX_ExplainName(const HX_Arguments& arguments) {
@@ -192,7 +195,7 @@ HX_ExitCode HX_ExplainName(const HX_Arguments& arguments) {
 }
 
 HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments) {
-  ModelRun run(arguments);
+  ModelRun run(arguments, false);
   const bool hasErrors = run.generator->result.hasErrors();
   const bool writesLock = run.lock.lock() != nullptr && !arguments.locked &&
                           !hasErrors && run.generator->forming.has_value();

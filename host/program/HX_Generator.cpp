@@ -72,6 +72,7 @@ void HX_Generator::run(HX_NameLock* lock) {
     result.formed = forming.emplace(*spaces).formAll(model->names, progress);
   }
   for (const HX_FormedName& name : result.formed) result.names.push_back(&name);
+  if (!keepsSpaces) spaces.reset();
   const HX_Profile::Phase phase(profile, "Order variables");
   progress.begin("ordering variables");
   const std::size_t before = result.findings.size();
