@@ -75,7 +75,7 @@ std::string smallestDifference(unsigned seed, int count, std::size_t length,
                                const Check& check) {
   std::mt19937 random(seed);
   for (int i = 0; i < count; ++i) {
-    std::string bytes(1 + random() % length, '\0');
+    std::string bytes(length / 2 + random() % length, '\0');
     for (char& byte : bytes) byte = static_cast<char>(random() >> 24);
     if (check(bytes, nullptr).empty()) continue;
     const std::string found = smallest(bytes, check);

@@ -72,9 +72,9 @@ std::string shown(const Text& text);
 using Check =
     std::function<std::string(const std::string& bytes, std::string* log)>;
 
-/// Runs \p count random cases. RETURNS: the smallest case with a difference, as
-/// choices, calls and answers of both sides; an empty text without a
-/// difference.
+/// Runs \p count random cases of about \p length choices. RETURNS: the smallest
+/// case with a difference, as choices, calls and answers of both sides; an
+/// empty text without a difference.
 std::string smallestDifference(unsigned seed, int count, std::size_t length,
                                const Check& check);
 

@@ -38,7 +38,7 @@ class PlainTest : public HX_TestFixture {
 
 TEST_F(PlainTest, NamesAnswerAsThePlainForm) {
   const std::string difference = plain::smallestDifference(
-      HX_Seed(), caseCount(2'500), 400, plain::differenceOfNames);
+      HX_Seed(), caseCount(2'000), 400, plain::differenceOfNames);
   EXPECT_TRUE(difference.empty()) << difference;
 }
 
