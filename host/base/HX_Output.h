@@ -17,6 +17,7 @@
 #include <system_error>
 #include <vector>
 
+#include "host/base/HX_FileSink.h"
 #include "host/base/HX_System.h"
 
 /// A failed write: one line with the file and the reason.
@@ -34,15 +35,15 @@ class HX_OutputError : public std::runtime_error {
 /// names the first.
 ///
 /// SIGHUP, SIGINT and SIGTERM end the program after the destruction.
-class HX_Output {
+class HX_Output : public HX_FileSink {
  public:
   explicit HX_Output(const std::filesystem::path& folder);
   HX_Output(const HX_Output&) = delete;
   HX_Output& operator=(const HX_Output&) = delete;
-  ~HX_Output();
+  ~HX_Output() override;
 
   /// A new file, open until finish(). The first file makes the folder.
-  std::ostream& open(const std::string& name);
+  std::ostream& open(const std::string& name) override;
 
   /// Ends writing. A file that the folder already has with the same content
   /// stays untouched.

@@ -3,6 +3,7 @@
 #include <fstream>
 #include <vector>
 
+#include "host/base/HX_InputFiles.h"
 #include "host/base/HX_JsonReader.h"
 #include "host/base/HX_Text.h"
 
@@ -126,7 +127,9 @@ class Locator : public HX_JsonEvents {
 }  // namespace
 
 HX_Document::HX_Document(const std::string& name, const fs::path& folder)
-    : file(name), text(readFile(name, folder)) {}
+    : file(name), text(readFile(name, folder)) {
+  HX_InputFiles().insert(name);
+}
 
 HX_Document HX_Document::ofText(const std::string& name, std::string text) {
   HX_Document document;

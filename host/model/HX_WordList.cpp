@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "host/base/HX_Faults.h"
+#include "host/base/HX_InputFiles.h"
 #include "host/base/HX_Text.h"
 #include "host/model/HX_Pattern.h"
 
@@ -40,6 +41,7 @@ bool HX_ReadWordList(const fs::path& file, std::set<std::string>& words) {
   std::ifstream stream(file, std::ios::binary);
   if (!stream.is_open() || fs::is_directory(file, error)) return false;
   const std::string text{std::istreambuf_iterator<char>(stream), {}};
+  HX_InputFiles().insert(file.string());
   HX_Faults faults;
   bool hasWord = false;
   std::size_t at = text.starts_with("\xEF\xBB\xBF") ? 3 : 0;

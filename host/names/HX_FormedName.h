@@ -115,6 +115,7 @@ struct HX_RunResult {
   std::vector<const HX_FormedName*> names;      // in the order of the report
   std::vector<const HX_FormedName*> variables;  // in the order of definition
   std::vector<HX_Finding> findings;             // about no single name
+  std::string codeFile;  // of a component, without extension; else empty
 
   /// Whether any finding is an error.
   bool hasErrors() const;

@@ -25,13 +25,15 @@ int groupOf(const HX_WantedName& name) {
 // In the text of paths a block comes before the blocks inside: the character
 // between the names is below all characters of names.
 std::vector<Key> keysOf(const std::deque<HX_WantedName>& names,
-                        std::string& paths) {
+                        const std::vector<bool>& chosen, std::string& paths) {
   std::vector<Key> keys;
   keys.reserve(names.size());
-  for (const HX_WantedName& name : names) {
+  for (std::size_t index = 0; index < names.size(); ++index) {
+    if (!chosen.empty() && !chosen[index]) continue;
+    const HX_WantedName& name = names[index];
     const std::size_t begin = paths.size();
     paths += HX_PathOf(HX_BestSource(name));
-    keys.push_back({&name, keys.size(), begin, paths.size() - begin});
+    keys.push_back({&name, index, begin, paths.size() - begin});
   }
   std::replace(paths.begin(), paths.end(), '/', '\1');
   return keys;
@@ -39,10 +41,10 @@ std::vector<Key> keysOf(const std::deque<HX_WantedName>& names,
 
 }  // namespace
 
-std::vector<std::size_t> HX_FormingOrder(
-    const std::deque<HX_WantedName>& names) {
+std::vector<std::size_t> HX_FormingOrder(const std::deque<HX_WantedName>& names,
+                                         const std::vector<bool>& chosen) {
   std::string paths;
-  std::vector<Key> keys = keysOf(names, paths);
+  std::vector<Key> keys = keysOf(names, chosen, paths);
   const auto pathOf = [&](const Key& key) {
     return std::string_view(paths).substr(key.pathBegin, key.pathSize);
   };

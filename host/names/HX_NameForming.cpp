@@ -48,11 +48,12 @@ constexpr OsTextRow kOsTexts[] = {
 }  // namespace
 
 std::deque<HX_FormedName> HX_NameForming::formAll(
-    const std::deque<HX_WantedName>& names, HX_Progress& progress) {
+    const std::deque<HX_WantedName>& names, const std::vector<bool>& chosen,
+    HX_Progress& progress) {
   std::deque<HX_FormedName> formed;
   for (const HX_WantedName& name : names) formed.emplace_back(name);
   progress.begin("names", names.size());
-  for (const std::size_t index : HX_FormingOrder(names)) {
+  for (const std::size_t index : HX_FormingOrder(names, chosen)) {
     form(formed[index]);
     progress.step();
   }
@@ -136,13 +137,31 @@ void HX_NameForming::replaceMultirate(const HX_WantedName& name,
 }
 
 void HX_NameForming::define(HxCCIdentifier& id, HX_FormedName& name) {
+  const bool isWatched = !m_Watched.empty() && name.wanted->id == m_Watched;
+  const KyCXString expanded =
+      isWatched ? id.getCookedName(HxCCIdentifier::eActualName) : KyCXString();
   name.isDefined = m_Spaces.define(*name.wanted, id, m_Safe);
+  if (isWatched) keepSteps(expanded);
   for (int i = 0; i < m_Safe.stepCount(); ++i) note(m_Safe.step(i), name);
   if (!name.isDefined || m_Safe.text() == m_Safe.wanted()) return;
   HxCTransformationTracer::logTransformation(
       (name.wanted->id + ": " + m_Safe.wanted().cstring() + " -> " +
        m_Safe.text().cstring() + " (" + name.changes.back().text() + ")")
           .c_str());
+}
+
+void HX_NameForming::keepSteps(const KyCXString& expanded) {
+  m_Steps = {{"uncut", HX_ToUtf8(expanded)}};
+  for (int i = 0; i < m_Safe.stepCount(); ++i) {
+    const HX_SafeName::Step& step = m_Safe.step(i);
+    const HX_Change change = HX_NameSpaces::changeOf(step);
+    std::string what = change.text();
+    if (step.kind == HX_SafeName::eDerived) what = "variant";
+    if (step.kind == HX_SafeName::eTooLong) what = "too long, but fixed";
+    if (what.empty()) continue;
+    m_Steps.push_back(
+        {what, HX_ToUtf8(step.text), HX_NameSpaces::isConflict(change)});
+  }
 }
 
 void HX_NameForming::note(const HX_SafeName::Step& step, HX_FormedName& name) {

@@ -25,14 +25,28 @@ struct HX_ExplainedMacro {
   std::string origin;
 };
 
+/// One step from the expanded template to the name, or a conflict on the way.
+struct HX_ExplainedStep {
+  std::string what;
+  std::string text;  ///< the name after the step, or the name in conflict
+  bool isConflict = false;
+};
+
 class HX_NameForming {
  public:
   explicit HX_NameForming(HX_NameSpaces& spaces) : m_Spaces(spaces) {}
 
   /// Forms names in the order of HX_FormingOrder().
+  /// \param chosen  by index, the names to form; all if empty
   /// RETURNS: one formed name per wanted name, in the order of \p names.
   std::deque<HX_FormedName> formAll(const std::deque<HX_WantedName>& names,
+                                    const std::vector<bool>& chosen,
                                     HX_Progress& progress);
+
+  /// Keeps the steps of the name with this id; before formAll().
+  void watch(const std::string& id) { m_Watched = id; }
+  /// The steps of the watched name; the first is the name before all cuts.
+  const std::vector<HX_ExplainedStep>& steps() const { return m_Steps; }
 
   /// The value of each macro of the template. Reports nothing.
   std::vector<HX_ExplainedMacro> explain(const HX_WantedName& name);
@@ -46,9 +60,12 @@ class HX_NameForming {
   void replaceMultirate(const HX_WantedName& name, HxCCIdentifier& id);
   void define(HxCCIdentifier& id, HX_FormedName& name);
   void note(const HX_SafeName::Step& step, HX_FormedName& name);
+  void keepSteps(const KyCXString& expanded);
 
   HX_NameSpaces& m_Spaces;
   HxCNames m_Names;
+  std::string m_Watched;
+  std::vector<HX_ExplainedStep> m_Steps;
   HX_SafeName m_Safe;  // of the name being formed
   std::map<const HX_WantedName*, HxCCIdentifier> m_TaskNames;  // null: empty
 };

@@ -112,6 +112,17 @@ std::vector<const Item*> order(const std::vector<const Item*>& items,
   return ordered;
 }
 
+std::vector<const HX_FormedName*> ordered(
+    const std::vector<const HX_FormedName*>& variables, std::size_t count) {
+  return order<HxCSsNode>(
+      variables, count,
+      [](const HX_FormedName& name) { return name.wanted->index; },
+      [](const HX_FormedName& name, auto use) {
+        for (const HX_WantedName* wanted : name.wanted->dependsOn)
+          use(wanted->index);
+      });
+}
+
 }  // namespace
 
 std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model) {
@@ -146,11 +157,14 @@ std::vector<const HX_FormedName*> HX_OrderVariables(
     for (const HX_FormedName& name : names) add(name);
   else
     for (const std::size_t index : circle) add(names[index]);
-  return order<HxCSsNode>(
-      variables, names.size(),
-      [](const HX_FormedName& name) { return name.wanted->index; },
-      [](const HX_FormedName& name, auto use) {
-        for (const HX_WantedName* wanted : name.wanted->dependsOn)
-          use(wanted->index);
-      });
+  return ordered(variables, names.size());
+}
+
+std::vector<const HX_FormedName*> HX_OrderVariables(
+    const std::vector<const HX_FormedName*>& names, std::size_t count) {
+  std::vector<const HX_FormedName*> variables;
+  for (const HX_FormedName* name : names)
+    if (name->wanted->kind == HX_NameKind::eVariable && name->isDefined)
+      variables.push_back(name);
+  return ordered(variables, count);
 }

@@ -22,5 +22,10 @@ std::vector<const HX_TypeItem*> HX_OrderTypes(const HX_Model& model);
 /// The defined variables among \p names.
 std::vector<const HX_FormedName*> HX_OrderVariables(
     const HX_Model& model, const std::deque<HX_FormedName>& names);
+/// The defined variables among \p names, which belong to one component.
+/// Dependencies on variables of other components do not count.
+/// \param count  number of names of the model
+std::vector<const HX_FormedName*> HX_OrderVariables(
+    const std::vector<const HX_FormedName*>& names, std::size_t count);
 
 #endif  // HOST_NAMES_HX_ORDERING_H

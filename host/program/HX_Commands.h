@@ -27,6 +27,15 @@ struct HX_Arguments {
   int retireRuns = 0;
   bool locked = false;
   std::string out;
+  std::string component;  ///< path of the one component to generate
+  std::string depfile;
+  std::vector<std::string> filters;
+  std::string sort;
+  std::vector<std::string> columns = {"name",   "source", "template",
+                                      "formal", "actual", "complete"};
+  bool byComponent = false;
+  bool listOutputs = false;
+  bool upToDate = false;
   std::string profile;
   std::vector<std::string> dictionaries;
   std::vector<std::string> searchPath;
@@ -45,6 +54,8 @@ struct HX_Arguments {
 HX_ExitCode HX_ShowNames(const HX_Arguments& arguments);
 HX_ExitCode HX_ExplainName(const HX_Arguments& arguments);
 HX_ExitCode HX_GenerateCode(const HX_Arguments& arguments);
+HX_ExitCode HX_CheckModel(const HX_Arguments& arguments);
+HX_ExitCode HX_ListComponents(const HX_Arguments& arguments);
 HX_ExitCode HX_ReportNames(const HX_Arguments& arguments);
 HX_ExitCode HX_PruneLock(const HX_Arguments& arguments);
 HX_ExitCode HX_CompareNames(const HX_Arguments& arguments);

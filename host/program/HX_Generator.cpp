@@ -48,7 +48,8 @@ HX_Generator::HX_Generator(HX_Profile& timing, HX_Progress& shown,
   profile.setModel(HX_NameText(model->name).cstring());
 }
 
-void HX_Generator::run(HX_NameLock* lock) {
+void HX_Generator::run(HX_NameLock* lock, const std::string& path,
+                       const std::string& watched) {
   {
     const HX_Profile::Phase phase(profile, "Order types");
     result.types = HX_OrderTypes(*model);
@@ -69,14 +70,20 @@ void HX_Generator::run(HX_NameLock* lock) {
   std::string().swap(document.text);  // long, and not needed any more
   {
     const HX_Profile::Phase phase(profile, "Form names");
-    result.formed = forming.emplace(*spaces).formAll(model->names, progress);
+    forming.emplace(*spaces).watch(watched);
+    result.formed = forming->formAll(model->names, choose(path), progress);
   }
-  for (const HX_FormedName& name : result.formed) result.names.push_back(&name);
+  for (const HX_FormedName& name : result.formed) {
+    if (component < 0 || m_ComponentOf[name.wanted->index] == component)
+      result.names.push_back(&name);
+  }
   if (!keepsSpaces) spaces.reset();
   const HX_Profile::Phase phase(profile, "Order variables");
   progress.begin("ordering variables");
   const std::size_t before = result.findings.size();
-  result.variables = HX_OrderVariables(*model, result.formed);
+  result.variables =
+      component < 0 ? HX_OrderVariables(*model, result.formed)
+                    : HX_OrderVariables(result.names, result.formed.size());
   if (result.findings.size() > before)
     result.findings.back().source = model->variableCircle.place;
   progress.end();
@@ -85,13 +92,74 @@ void HX_Generator::run(HX_NameLock* lock) {
                std::to_string(result.types.size()) + " types");
 }
 
-std::size_t HX_Generator::write(HX_Output& output, bool asLines) {
+void HX_Generator::splitIntoComponents() {
+  if (components) return;
+  components.emplace(*model);
+  m_ComponentOf.reserve(model->names.size());
+  for (const HX_WantedName& name : model->names)
+    m_ComponentOf.push_back(components->of(name));
+}
+
+// The names of a component, and the tasks: further names contain their names.
+std::vector<bool> HX_Generator::choose(const std::string& path) {
+  if (path.empty()) return {};
+  splitIntoComponents();
+  component = components->find(path);
+  if (component < 0) {
+    std::string known;
+    for (const auto& each : components->all())
+      known += (known.empty() ? "" : ", ") + HX_Quoted(each.path);
+    throw HX_InputError(
+        HX_MessageText(kHxUnknownComponent,
+                       {HX_Visible(document.file), HX_Quoted(path), known}),
+        kHxUnknownComponent);
+  }
+  std::vector<bool> chosen;
+  chosen.reserve(model->names.size());
+  for (const HX_WantedName& name : model->names)
+    chosen.push_back(name.isTask() || m_ComponentOf[name.index] == component);
+  return chosen;
+}
+
+HX_RunResult HX_Generator::resultOf(int index) {
+  HX_RunResult part;
+  part.types = result.types;
+  for (const HX_FormedName* name : result.names) {
+    if (m_ComponentOf[name->wanted->index] == index) part.names.push_back(name);
+  }
+  part.variables = HX_OrderVariables(part.names, result.formed.size());
+  return part;
+}
+
+void HX_Generator::write(int index, HX_FileSink& output) {
   const HX_Profile::Phase phase(profile, "Write C");
-  sortById(result.names);
-  HX_CWriter(*model, result, banner, progress).write(output);
-  HX_WriteNameMap(output.open(asLines ? "name_map.jsonl" : "name_map.json"),
-                  output.open("name_map.csv"), *model, result, asLines,
-                  progress);
+  if (index < 0) {
+    sortById(result.names);
+    writeCode(output);
+    writeNameMap(output, result);
+    return progress.end();
+  }
+  HX_RunResult part = resultOf(index);
+  sortById(part.names);
+  const HX_CFiles& files =
+      components->all()[static_cast<std::size_t>(index)].files;
+  HX_CWriter writer(*model, part, files, banner, progress);
+  if (index == 0) writer.writeTypes(output);
+  writer.writeCode(output);
+  part.codeFile = files.code;
+  writeNameMap(output, part);
+  result.findings.insert(result.findings.end(), part.findings.begin(),
+                         part.findings.end());
   progress.end();
-  return output.finish();
+}
+
+void HX_Generator::writeNameMap(HX_FileSink& output, const HX_RunResult& part) {
+  HX_WriteNameMap(output.open(asLines ? "name_map.jsonl" : "name_map.json"),
+                  output.open("name_map.csv"), *model, part, asLines, progress);
+}
+
+void HX_Generator::writeCode(HX_FileSink& output) {
+  HX_CWriter writer(*model, result, HX_CFiles::ofModel(), banner, progress);
+  writer.writeTypes(output);
+  writer.writeCode(output);
 }

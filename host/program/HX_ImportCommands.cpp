@@ -4,10 +4,26 @@
 #include <stdexcept>
 
 #ifdef HX_HAS_IMPORT
+#include "host/base/HX_InputFiles.h"
 #include "host/import/HX_Import.h"
 #include "host/import/HX_Rules.h"
+#include "host/write/HX_DiagnosticLog.h"
 
 namespace {
+
+void noteInputs(const HX_ImportRequest& request) {
+  HX_InputFiles().insert(request.model.string());
+  if (!request.rules.empty()) HX_InputFiles().insert(request.rules.string());
+  for (const auto& file : request.dictionaries)
+    HX_InputFiles().insert(file.string());
+}
+
+// The line begins with the severity.
+void logNote(const std::string& line, HX_DiagnosticLog& log) {
+  const bool isWarning = line.starts_with("warning: ");
+  log.add({isWarning ? kHxImportWarning : kHxImportNote, isWarning ? 1 : 0,
+           line.substr(line.find(": ") + 2), "", ""});
+}
 
 // Paths count from \p folder. In messages a path stays as the user wrote it,
 // unless the working directory has changed.
@@ -26,8 +42,9 @@ HX_Import importOf(const std::string& file, const HX_Arguments& arguments,
   for (const std::string& path : arguments.ownKeywords)
     request.keywordFolders.push_back(start / path);
   HX_Import import = HX_ImportModel(request);
+  noteInputs(request);
   if (!arguments.quiet) {
-    for (const std::string& note : import.notes) std::cerr << note << '\n';
+    for (const std::string& note : import.notes) logNote(note, *arguments.log);
   }
   return import;
 }

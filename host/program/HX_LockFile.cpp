@@ -59,7 +59,7 @@ int HX_LockFile::addChanges(HX_DiagnosticLog& log) const {
   return changes;
 }
 
-void HX_LockFile::write(HX_Output& output) const {
+void HX_LockFile::write(HX_FileSink& output) const {
   std::ostream& out = output.open(m_Path.filename().string());
   const bool isWritten =
       m_Lock.write([&out](const char* text, std::size_t length) {

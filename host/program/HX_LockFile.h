@@ -35,7 +35,7 @@ class HX_LockFile {
   int addChanges(HX_DiagnosticLog& log) const;
 
   /// Writes the file into \p output; REQUIRES: lock() is not null.
-  void write(HX_Output& output) const;
+  void write(HX_FileSink& output) const;
 
  private:
   std::string m_File;

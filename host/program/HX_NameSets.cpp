@@ -64,7 +64,7 @@ void addDocument(HX_NameDiff& diff, HX_NameDiff::HxESideTag side,
   HX_Generator generator(profile, silent,
                          HX_ReadDocument(file, arguments, profile), folders,
                          {arguments.reserved, arguments.patterns});
-  generator.run(nullptr);
+  generator.run(nullptr, "");
   HX_AddFormedNames(diff, side, generator.result);
 }
 

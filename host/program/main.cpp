@@ -1,5 +1,6 @@
 // hx_codegen: from a model document to names and C code.
 #include <CLI/CLI.hpp>
+#include <algorithm>
 #include <charconv>
 #include <cstdint>
 #include <iostream>
@@ -9,6 +10,7 @@
 #include "SafeNames/HX_ReservedNames.h"
 #include "host/base/HX_Faults.h"
 #include "host/base/HX_Output.h"
+#include "host/base/HX_ResponseFile.h"
 #include "host/base/HX_System.h"
 #include "host/base/HX_Text.h"
 #include "host/import/HX_ImportError.h"
@@ -16,6 +18,7 @@
 #include "host/program/HX_ImportCommands.h"
 #include "host/program/HX_Version.h"
 #include "host/write/HX_DiagnosticLog.h"
+#include "host/write/HX_NameColumns.h"
 
 namespace {
 
@@ -66,6 +69,7 @@ struct CommandLine {
                          Command chosen);
   void addPatterns(CLI::App& added);
   void addImportOptions(CLI::App& added);
+  void addBuildOptions(CLI::App& added);
   void addMessageOptions(CLI::App& added);
 
   CLI::App app{"Forms the names of a model and writes its C code.",
@@ -131,6 +135,29 @@ void CommandLine::addPatterns(CLI::App& added) {
       ->check(CLI::Validator(check, ""));
 }
 
+void CommandLine::addBuildOptions(CLI::App& added) {
+  added.add_option("--out", arguments.out, "folder for the files");
+  CLI::Option* lock = added.get_option("--lock");
+  added
+      .add_flag("--locked", arguments.locked,
+                "refuse new and changed names, change no lock")
+      ->needs(lock);
+  added
+      .add_option("--retire", arguments.retireRuns,
+                  "runs after which names of items that went are free "
+                  "(0: never)")
+      ->check(CLI::Range(0, 1'000'000))
+      ->needs(lock);
+  CLI::Option* whole = added.add_flag("--by-component", arguments.byComponent,
+                                      "a folder with files for each component");
+  added
+      .add_option("--component", arguments.component,
+                  "path of the one component to write; '.' for what lies "
+                  "outside the components")
+      ->needs(lock)
+      ->excludes(whole);
+}
+
 void CommandLine::addImportOptions(CLI::App& added) {
   added.add_option("--rules", arguments.rules,
                    "file of naming rules, for a model file");
@@ -159,28 +186,48 @@ CommandLine::CommandLine(HX_DiagnosticLog& log) {
   names->add_flag("--json", arguments.json, "print the name map instead");
   names->add_flag("--lines", arguments.lines,
                   "print the name map with a JSON document per line");
-  addOverModel("explain", "show macro by macro how a name came", HX_ExplainName)
-      ->add_option("--name", arguments.name, "the id of the name")
+  const CLI::IsMember isColumn(HX_NameColumns());
+  names->add_option("--columns", arguments.columns, "columns, with ','")
+      ->delimiter(',')
+      ->allow_extra_args(false)
+      ->check(isColumn);
+  names->add_option("--sort", arguments.sort, "column to sort by")
+      ->check(isColumn);
+  names
+      ->add_option("--filter", arguments.filters,
+                   "COLUMN=PATTERN or COLUMN!=PATTERN with '*', or a text of "
+                   "any column; may be repeated")
+      ->allow_extra_args(false)
+      ->check(CLI::Validator(HX_CheckFilter, ""));
+
+  CLI::App* explain = addOverModel(
+      "explain", "show macro by macro how a name came", HX_ExplainName);
+  explain->add_option("--name", arguments.name, "the id of the name")
       ->required();
+  explain->add_flag("--json", arguments.json, "print JSON instead");
 
   CLI::App* generate =
       addOverModel("generate", "write C code and name map", HX_GenerateCode);
-  generate->add_option("--out", arguments.out, "folder for the files")
-      ->required();
+  addBuildOptions(*generate);
+  generate->get_option("--out")->required();
   generate->add_flag("--json", arguments.json, "print the name map as well");
   generate->add_flag("--lines", arguments.lines,
                      "write name_map.jsonl, a JSON document per line, in place "
                      "of name_map.json");
-  generate
-      ->add_flag("--locked", arguments.locked,
-                 "refuse new and changed names, change no lock")
-      ->needs(generate->get_option("--lock"));
-  generate
-      ->add_option("--retire", arguments.retireRuns,
-                   "runs after which names of items that went are free "
-                   "(0: never)")
-      ->check(CLI::Range(0, 1'000'000))
-      ->needs(generate->get_option("--lock"));
+  generate->add_flag("--list-outputs", arguments.listOutputs,
+                     "print the paths of the files, write nothing");
+  generate->add_option("--depfile", arguments.depfile,
+                       "file for make: which files the code depends on");
+
+  CLI::App* check = addOverModel(
+      "check", "do all but writing; 1 if there are errors", HX_CheckModel);
+  addBuildOptions(*check);
+  check
+      ->add_flag("--up-to-date", arguments.upToDate,
+                 "1 also if a file would change")
+      ->needs(check->get_option("--out"));
+  addOverModel("components", "print path and file name of each component",
+               HX_ListComponents);
 
   CLI::App* lock = app.add_subcommand("lock", "work on a lock file");
   lock->require_subcommand(1);
@@ -266,7 +313,9 @@ int run(int argc, char** argv, HX_DiagnosticLog& log) {
   CommandLine line(log);
   int code = kHxDone;
   try {
-    line.app.parse(argc, argv);
+    std::vector<std::string> words = HX_ExpandArguments(argc, argv);
+    std::reverse(words.begin(), words.end());
+    line.app.parse(std::move(words));
     log.model = line.arguments.model;
     code = line.command(line.arguments);
   } catch (const CLI::Success& help) {

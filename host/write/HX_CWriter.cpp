@@ -33,8 +33,13 @@ std::string specifiers(const HX_FormedName& name, bool isDefinition) {
 }  // namespace
 
 HX_CWriter::HX_CWriter(const HX_Model& model, HX_RunResult& result,
-                       const std::string& banner, HX_Progress& progress)
-    : m_Model(model), m_Result(result), m_Banner(banner), m_Progress(progress) {
+                       const HX_CFiles& files, const std::string& banner,
+                       HX_Progress& progress)
+    : m_Model(model),
+      m_Result(result),
+      m_Banner(banner),
+      m_Progress(progress),
+      m_Files(files) {
   for (const HX_FormedName* name : result.names) {
     if (name->isDefined && name->wanted->isFunction())
       m_Functions.push_back(name);
@@ -47,8 +52,11 @@ HX_CWriter::HX_CWriter(const HX_Model& model, HX_RunResult& result,
     m_VariablesIn[name->wanted->scope].push_back(name);
 }
 
-void HX_CWriter::write(HX_Output& output) {
+void HX_CWriter::writeTypes(HX_FileSink& output) const {
   writeTypes(HX_CFile(output.open(m_Files.types + ".h")));
+}
+
+void HX_CWriter::writeCode(HX_FileSink& output) {
   writeCode(HX_CFile(output.open(m_Files.code + ".h")),
             HX_CFile(output.open(m_Files.code + ".c")));
 }

@@ -1,8 +1,9 @@
 // Writes C90: a header with the types, a header with the declarations, and a
 // source with the definitions.
 //
-//   HX_CWriter writer(model, result, "", progress);
-//   writer.write(output);
+//   HX_CWriter writer(model, result, HX_CFiles::ofModel(), "", progress);
+//   writer.writeTypes(output);
+//   writer.writeCode(output);
 
 #ifndef HOST_WRITE_HX_CWRITER_H
 #define HOST_WRITE_HX_CWRITER_H
@@ -12,7 +13,7 @@
 #include <string>
 #include <vector>
 
-#include "host/base/HX_Output.h"
+#include "host/base/HX_FileSink.h"
 #include "host/base/HX_Progress.h"
 #include "host/model/HX_Model.h"
 #include "host/names/HX_CFiles.h"
@@ -30,9 +31,11 @@ class HX_CWriter {
   /// Warnings go to \p result, and the places of declarations to its names.
   /// \param banner  further text for the head of each file; may be empty
   HX_CWriter(const HX_Model& model, HX_RunResult& result,
-             const std::string& banner, HX_Progress& progress);
+             const HX_CFiles& files, const std::string& banner,
+             HX_Progress& progress);
 
-  void write(HX_Output& output);
+  void writeTypes(HX_FileSink& output) const;
+  void writeCode(HX_FileSink& output);
 
  private:
   std::string head(const char* what) const;
@@ -54,7 +57,7 @@ class HX_CWriter {
   HX_RunResult& m_Result;
   const std::string m_Banner;
   HX_Progress& m_Progress;
-  const HX_CFiles m_Files = HX_CFiles::ofModel();
+  const HX_CFiles m_Files;
   std::vector<const HX_FormedName*> m_Functions;  // by C name
   // Looked up by scope, never walked.
   std::map<const HX_ScopeItem*, std::vector<const HX_FormedName*>>

@@ -41,7 +41,9 @@ std::string headOf(const HX_Diagnostic& diagnostic,
 
 std::string lineOf(const HX_DiagnosticLog::Entry& entry,
                    const HX_Terminal& terminal) {
-  const HX_Diagnostic& first = entry.first;
+  HX_Diagnostic first = entry.first;
+  for (std::string* text : {&first.text, &first.item, &first.source})
+    *text = HX_Visible(*text);
   const std::string number = " [" + std::to_string(first.number) + "]";
   std::string line;
   if (first.number == kHxMoreFaults)
@@ -109,8 +111,9 @@ void HX_DiagnosticLog::add(const HX_RunResult& result) {
     for (const HX_Finding& finding : findings)
       add({finding.id, finding.severity, finding.text, item, finding.source});
   };
-  for (const HX_FormedName* name : result.names)
-    addAll(name->findings, name->wanted->id);
+  // In the order of the document, whatever is shown.
+  for (const HX_FormedName& name : result.formed)
+    addAll(name.findings, name.wanted->id);
   addAll(result.findings, "");
 }
 

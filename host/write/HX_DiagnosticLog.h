@@ -45,6 +45,9 @@ class HX_DiagnosticLog {
   /// RETURNS: whether the message is an error now.
   bool add(HX_Diagnostic diagnostic);
 
+  /// The number of causes.
+  std::size_t size() const { return m_Entries.size(); }
+
   /// Text: a line per cause, wrapped for a terminal. JSON: an object with the
   /// list "diagnostics". SARIF: version 2.1.0, a run with rules and results.
   /// JSON and SARIF are written without messages too.

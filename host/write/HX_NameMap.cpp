@@ -29,7 +29,9 @@ void writeFindings(HX_JsonWriter& json,
 /// What the entries of one map share.
 struct Map {
   Map(const HX_Model& model, const HX_RunResult& run)
-      : modelName(model.name), result(run), files(HX_CFiles::ofModel()) {}
+      : modelName(model.name), result(run), files(HX_CFiles::ofModel()) {
+    if (!run.codeFile.empty()) files.code = run.codeFile;
+  }
 
   std::string fileOf(const HX_FormedName& name) const {
     switch (name.code.file) {
@@ -45,7 +47,7 @@ struct Map {
 
   const std::string& modelName;
   const HX_RunResult& result;
-  const HX_CFiles files;
+  HX_CFiles files;
 };
 
 void textOrNull(HX_JsonWriter& json, const char* field,

@@ -4,6 +4,7 @@
 #define HOST_WRITE_HX_NAMETABLE_H
 
 #include <iosfwd>
+#include <string>
 #include <vector>
 
 #include "host/base/HX_Progress.h"
@@ -12,14 +13,20 @@
 
 /// A table of names with their findings, then types and variables in the order
 /// of definition.
+/// \param columns  see HX_NameColumns()
+/// \param width    of the terminal: long texts lose their beginnings; 0 for
+///                 lines of any length
 void HX_WriteTable(std::ostream& out, const HX_RunResult& result,
+                   const std::vector<std::string>& columns, int width,
                    HX_Progress& progress);
 
-/// The macros of the template, then the changes of the expanded name.
+/// The macros of the template, then the steps from the expanded template to the
+/// name, conflicts with '!'.
 void HX_WriteExplanation(std::ostream& out, const HX_FormedName& name,
-                         const std::vector<HX_ExplainedMacro>& steps);
-
-/// One line per finding; findings of a name begin with the id of the name.
-void HX_WriteFindings(std::ostream& out, const HX_RunResult& result);
+                         const std::vector<HX_ExplainedMacro>& macros,
+                         const std::vector<HX_ExplainedStep>& steps);
+void HX_WriteExplanationJson(std::ostream& out, const HX_FormedName& name,
+                             const std::vector<HX_ExplainedMacro>& macros,
+                             const std::vector<HX_ExplainedStep>& steps);
 
 #endif  // HOST_WRITE_HX_NAMETABLE_H

@@ -33,7 +33,7 @@ TEST_F(CommandLineTest, VersionNamesTheProgram) {
 
 TEST_F(CommandLineTest, ManualPageHasTheOptionsOfTheHelp) {
   const auto optionsIn = [](const std::string& text) {
-    static const std::regex option("--[a-z]+");
+    static const std::regex option("--[a-z-]+");
     return std::set<std::string>(
         std::sregex_token_iterator(text.begin(), text.end(), option), {});
   };
@@ -41,8 +41,8 @@ TEST_F(CommandLineTest, ManualPageHasTheOptionsOfTheHelp) {
       std::regex_replace(read(HX_MANUAL_PAGE), std::regex(R"(\\-)"), "-");
   std::string help = codegen("--help").out;
   for (const std::string command :
-       {"names", "explain", "generate", "lock", "diff", "lint", "import",
-        "rules", "report", "help", "synthesize"}) {
+       {"names", "explain", "generate", "check", "components", "lock", "diff",
+        "lint", "import", "rules", "report", "help", "synthesize"}) {
     EXPECT_THAT(help, HasSubstr("\n  " + command + " "));
     EXPECT_THAT(page, HasSubstr("\n.SS " + command + "\n"));
     help += codegen(command + " --help").out;
