@@ -100,6 +100,7 @@ Names::Context Names::contextOf(const Id& id) {
   return c;
 }
 
+// One branch per macro, in the order of the test.
 void Names::createSingleNameFromForm(Id& id, int type, Bits retained,
                                      Bits provisional, bool suppressMessages) {
   const auto active = Id::eActiveName;
