@@ -53,6 +53,27 @@ TEST_F(NameEngineTest, AMessageNamesMacroTemplateAndReference) {
                           "[car/Ctrl/Speed Gain]"));
 }
 
+TEST_F(NameEngineTest, AFurtherComponentIsReportedOnTheVariable) {
+  HX_DdTree& tree = HX_DdTree::instance();
+  for (const std::string name : {"Engine", "Gear"}) {
+    const std::string path = "/Pool/Autosar/SoftwareComponents/" + name;
+    tree.add(path, HX_DdTree::kSoftwareComponent);
+    tree.addReference(tree.add(path + "/RelatedVariables"), "P of " + name,
+                      "Variables/Ctrl");
+  }
+  const HxCDdSrcRef variable(tree.add("//DD0/Pool/Variables/Ctrl/speed"));
+  Id id = identifier("$(Component)");
+  id.setDdSourceRef(&variable);
+  EXPECT_EQ(expandId(id), "Engine 1210");
+  EXPECT_THAT(
+      messages(),
+      ElementsAre("1210/2 The variable was referenced first through the "
+                  "RelatedVariables property P of Engine of software component "
+                  "Engine and second by the RelatedVariables property P of "
+                  "Gear of software component Gear. "
+                  "[//DD0/Pool/Variables/Ctrl/speed]"));
+}
+
 TEST_F(NameEngineTest, SymbolMacrosTakeTheSymbol) {
   HX_DataType int16("Int16");
   int16.setCut("i16").setBase();
