@@ -29,6 +29,7 @@ struct HX_Arguments {
   std::string out;
   std::string component;  ///< path of the one component to generate
   std::string depfile;
+  std::string depfileTarget;  ///< in place of the files; may be empty
   std::vector<std::string> filters;
   std::string sort;
   std::vector<std::string> columns = {"name",   "source", "template",

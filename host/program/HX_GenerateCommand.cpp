@@ -2,6 +2,7 @@
 // by component.
 #include <algorithm>
 #include <filesystem>
+#include <fstream>
 #include <iostream>
 #include <memory>
 #include <optional>
@@ -9,6 +10,7 @@
 #include "host/base/HX_ComparingOutput.h"
 #include "host/base/HX_InputFiles.h"
 #include "host/base/HX_Output.h"
+#include "host/base/HX_System.h"
 #include "host/program/HX_ModelRun.h"
 #include "host/write/HX_DiagnosticLog.h"
 #include "host/write/HX_NameMap.h"
@@ -74,6 +76,21 @@ void writeDependencies(std::ostream& out, std::vector<std::string> outputs) {
   out << '\n';
 }
 
+// Not an HX_Output: runs for components write into one folder at one time.
+void placeDepfile(const fs::path& path, const std::string& target,
+                  const std::vector<std::string>& outputs) {
+  const fs::path part = path.string() + "." + HX_ProcessNumber();
+  std::ofstream out(part, std::ios::binary);
+  writeDependencies(
+      out, target.empty() ? outputs : std::vector<std::string>{target});
+  out.close();
+  std::error_code error;
+  if (out) fs::rename(part, path, error);
+  if (out && !error) return;
+  fs::remove(part, error);
+  throw HX_OutputError(path.string() + ": cannot be written");
+}
+
 /// Several folders that change together.
 class Outputs {
  public:
@@ -124,12 +141,6 @@ void placeFiles(const HX_Arguments& arguments, HX_ModelRun& run,
   arguments.log->choose(result);
   arguments.log->add(result);
   if (result.hasErrors()) return;
-  if (!arguments.depfile.empty()) {
-    const fs::path path = start / arguments.depfile;
-    HX_Output& output = outputs.add(path.parent_path());
-    writeDependencies(output.open(path.filename().string()), paths);
-    output.finish();
-  }
   // Last: a lock that was not replaced gives the same names again.
   if (writesLock) {
     HX_Output& output = outputs.add(run.lock.folder());
@@ -143,6 +154,8 @@ void placeFiles(const HX_Arguments& arguments, HX_ModelRun& run,
   HX_FlushOutput();
   HX_RequireMemory();
   outputs.commit();
+  if (!arguments.depfile.empty())
+    placeDepfile(start / arguments.depfile, arguments.depfileTarget, paths);
   if (arguments.json || arguments.quiet) return;
   printSummary(arguments, result, changed);
   if (std::cout.flush()) return;

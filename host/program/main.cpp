@@ -218,6 +218,10 @@ CommandLine::CommandLine(HX_DiagnosticLog& log) {
                      "print the paths of the files, write nothing");
   generate->add_option("--depfile", arguments.depfile,
                        "file for make: which files the code depends on");
+  generate
+      ->add_option("--depfile-target", arguments.depfileTarget,
+                   "what depends, in place of the files of the code")
+      ->needs(generate->get_option("--depfile"));
 
   CLI::App* check = addOverModel(
       "check", "do all but writing; 1 if there are errors", HX_CheckModel);
