@@ -91,6 +91,15 @@ TEST_F(BuildTest, ComponentsTogetherAreTheWholeRun) {
   }
 }
 
+// The function is in one component, the block of the variable in another.
+TEST_F(BuildTest, LocalVariablesGoWithTheirFunction) {
+  const std::string model = m_Folder / "twins.json";
+  write(model, kTwins);
+  ASSERT_EQ(0, generate(model + " --by-component").code);
+  EXPECT_THAT(read(m_Out / "m_A_b_2" / "m_A_b_2.c"),
+              HasSubstr("void F(void) {\n  /* root/a b/In */\n  Int In_c;\n"));
+}
+
 TEST_F(BuildTest, FileNamesOfComponentsAreDistinct) {
   write(m_Folder / "twins.json", kTwins);
   EXPECT_EQ(".\tm\nroot/A b\tm_A_b\nroot/A_b\tm_A_b_2\nroot/a b\tm_a_b_3\n",
