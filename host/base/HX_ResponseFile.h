@@ -11,8 +11,7 @@
 /// The words behind the name of the program. White space separates the words of
 /// a file; quotation marks of both kinds keep white space, and a backslash
 /// keeps the next character. A file may name further files. A word "@file"
-/// without such a file stays as it is. Throws HX_InputError for files that
-/// name each other.
+/// without a file stays. Throws HX_InputError for files in a circle.
 std::vector<std::string> HX_ExpandArguments(int argc, const char* const* argv);
 
 #endif  // HOST_BASE_HX_RESPONSEFILE_H

@@ -76,7 +76,7 @@ void writeDependencies(std::ostream& out, std::vector<std::string> outputs) {
   out << '\n';
 }
 
-// Not an HX_Output: runs for components write into one folder at one time.
+// Not an HX_Output: parallel runs for components share the folder.
 void placeDepfile(const fs::path& path, const std::string& target,
                   const std::vector<std::string>& outputs) {
   const fs::path part = path.string() + "." + HX_ProcessNumber();
