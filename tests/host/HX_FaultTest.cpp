@@ -112,16 +112,34 @@ TEST_F(FaultTest, MissingMemoryIsOneLine) {
   write(model, codegen("synthesize --blocks 2000").out);
   ASSERT_EQ(0, generate(model).code);
   const Files whole = filesIn(m_Out);
-  std::set<int> codes;
-  for (int kilobytes = 14000; kilobytes <= 21000; kilobytes += 175) {
-    SCOPED_TRACE(kilobytes);
+
+  const auto run = [&](int kilobytes, const std::string& arguments) {
     fs::remove_all(m_Out);
-    const std::string limit = "ulimit -v " + std::to_string(kilobytes) + "; ";
-    // The loader of programs, and what runs before main(), report otherwise.
-    if (shell(limit + HX_CODEGEN_COMMAND " --version").code != 0) continue;
-    const Result result = shell("ulimit -v " + std::to_string(kilobytes) +
-                                "; " + HX_CODEGEN_COMMAND " generate --quiet " +
-                                model + " --out " + m_Out.string());
+    return shell("ulimit -v " + std::to_string(kilobytes) + "; " +
+                 HX_CODEGEN_COMMAND " " + arguments);
+  };
+  // About the smallest limit with which a command succeeds.
+  const auto enoughFor = [&](const std::string& arguments) {
+    int low = 1000;
+    int high = 300000;
+    while (high - low > 200) {
+      const int middle = (low + high) / 2;
+      (run(middle, arguments).code == 0 ? high : low) = middle;
+    }
+    return high;
+  };
+  const std::string generate =
+      "generate --quiet " + model + " --out " + m_Out.string();
+  // The loader of programs, and what runs before main(), report otherwise.
+  const int start = enoughFor("--version");
+  const int end = enoughFor(generate);
+  constexpr int kSteps = 20;
+  std::set<int> codes;
+  for (int step = 0; step <= kSteps + 1; ++step) {
+    const int kilobytes = start + (end - start) * step / kSteps;
+    SCOPED_TRACE(kilobytes);
+    if (run(kilobytes, "--version").code != 0) continue;
+    const Result result = run(kilobytes, generate);
     codes.insert(result.code);
     if (result.code == 0) {
       EXPECT_EQ(whole, filesIn(m_Out));
