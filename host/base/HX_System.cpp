@@ -64,7 +64,7 @@ void HX_WriteError(const char* text) {
 
 bool HX_KeepMemoryBack() {
   constexpr std::size_t kEnough = 1 << 20;
-  s_MemoryKept = std::malloc(kEnough);
+  if (s_MemoryKept == nullptr) s_MemoryKept = std::malloc(kEnough);
   std::set_new_handler([] {
     s_DidMemoryEnd = true;
     std::free(s_MemoryKept);

@@ -13,16 +13,16 @@ constexpr double kVersionRequest = 6.0;  // asks "hx_config" for the version
 struct DestroyArray {
   void operator()(mxArray* array) const { MXDestroyArray(array); }
 };
-using OwnedArray = std::unique_ptr<mxArray, DestroyArray>;
+using OwnedAnswer = std::unique_ptr<mxArray, DestroyArray>;
 
 // Returns the answer of "hx_config", null if the call failed.
-OwnedArray callConfig() {
-  OwnedArray input(MXCreateInitializedScalarMxArray(kVersionRequest));
+OwnedAnswer callConfig() {
+  OwnedAnswer input(MXCreateInitializedScalarMxArray(kVersionRequest));
   if (input == nullptr) return input;
   mxArray* inputs[] = {input.get()};
   mxArray* outputs[] = {nullptr};
   const int status = MEXCallMATLAB(1, outputs, 1, inputs, "hx_config");
-  OwnedArray answer(outputs[0]);
+  OwnedAnswer answer(outputs[0]);
   if (status != 0) answer.reset();
   return answer;
 }
@@ -61,7 +61,7 @@ HX_OfficialVersion::~HX_OfficialVersion() = default;
 bool HX_OfficialVersion::evalBrennicVersionAndReleaseDate() {
   m_IsValid = false;
   HX_WithinMemory([&] {
-    const OwnedArray answer = callConfig();
+    const OwnedAnswer answer = callConfig();
     if (answer == nullptr) return;
     KyCXString version = m_Version;
     KyCXString releaseDate = m_ReleaseDate;

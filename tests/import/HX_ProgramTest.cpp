@@ -38,7 +38,9 @@ TEST_F(ProgramTest, ModelFileStandsForItsDocument) {
   EXPECT_EQ(codegen("names climate.json"), codegen("names" + quiet));
   EXPECT_EQ(codegen("names climate.json"),
             codegen("names --path . --dictionary climate_types.sldd" + quiet));
-  EXPECT_THAT(codegen("names climate.slx"), StartsWith("note: 'Inherit: "));
+  EXPECT_THAT(codegen("names climate.slx"),
+              HasSubstr("hx_codegen: 'Inherit: Same as input' takes the type "
+                        "of the naming rule (Controller/Delay) [603]\n"));
   EXPECT_THAT(codegen("explain --name 14#out:1" + quiet),
               HasSubstr("template  $L\nrule      labelled signal\n"));
   EXPECT_EQ("", codegen("generate --out code --profile times" + quiet));
