@@ -14,7 +14,7 @@ struct HX_CFiles {
   static HX_CFiles ofModel();
 
   /// The include guard of the header \p file, given without extension. Never
-  /// begins with '_': such macros belong to the compiler.
+  /// begins with '_', because the compiler owns macros with '_' in front.
   static std::string guardOf(const std::string& file);
 
   /// Macros that place a variable: section, alignment.

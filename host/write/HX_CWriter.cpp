@@ -12,8 +12,8 @@ const HX_Placement& placementOf(const HX_FormedName& name) {
   return name.wanted->rare().placement;
 }
 
-// Everything in front of the type. Attributes come first because no compiler
-// takes them in all other places.
+// All words in front of the type. Attributes come first, because no second
+// place pleases every compiler.
 std::string specifiers(const HX_FormedName& name, bool isDefinition) {
   const HX_Placement& placement = placementOf(name);
   std::string text;
@@ -138,7 +138,7 @@ void HX_CWriter::writeCode(HX_CFile header, HX_CFile source) {
 void HX_CWriter::writeBody(HX_CFile& file, const HX_FormedName& function) {
   const HX_ScopeItem* body = function.wanted->body;
   if (body != nullptr) writeLocals(file, *body, "  ");
-  // A static variable that nothing uses would be a warning.
+  // Compilers warn of an unused static variable.
   if (&function == m_Functions.front())
     writeUses(file, *m_Model.fileScope, "  ");
   if (body != nullptr) writeBlocks(file, *body, "  ");

@@ -10,7 +10,7 @@
 #include "SafeNames/HX_NameLock.h"
 #include "SafeNames/HX_ReservedNames.h"
 #include "SafeNames/implSafeNames/HX_TextLines.h"
-#include "SafeNames/implSafeNames/HX_Variant.h"
+#include "SafeNames/implSafeNames/HX_VariantCounts.h"
 #include "implContainers/HX_HashTable.h"
 #include "implContainers/HX_PlainArray.h"
 #include "implContainers/HX_TextArena.h"

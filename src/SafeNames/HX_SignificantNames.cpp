@@ -6,7 +6,7 @@
 #include "Control/HX_Memory.h"
 #include "NameSpace/HxCXStringIdServer.h"
 #include "SafeNames/implSafeNames/HX_TextLines.h"
-#include "SafeNames/implSafeNames/HX_Variant.h"
+#include "SafeNames/implSafeNames/HX_VariantCounts.h"
 #include "implContainers/HX_HashTable.h"
 #include "implContainers/HX_PlainArray.h"
 #include "implContainers/HX_TextArena.h"

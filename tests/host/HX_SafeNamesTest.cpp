@@ -44,7 +44,7 @@ TEST_F(HostSafeNamesTest, ChangesOfTheDemoRenameNoOtherName) {
   ASSERT_EQ(0, generateLocked(model).code);
   EXPECT_EQ(lock, read(m_Lock));
 
-  // New items in front take the templates of all others and their order.
+  // New items in front share the templates with all old items.
   Json& list = model["names"];
   std::reverse(list.begin(), list.end());
   for (int i = 0; i < 100; ++i) {
@@ -227,7 +227,7 @@ TEST_F(HostSafeNamesTest, WordsPatternsAndSignificanceOfADocumentCount) {
       {"d", "n_strong"}, {"e", "engine_speed"}, {"f", "ENGI_a"}};
   EXPECT_EQ(expected, names());
 
-  // Further lists and patterns by options, and the place of the other name.
+  // Further lists and patterns by options, and the place of the taken name.
   const Json again =
       modelOf({variable("a", "READY"),
                variable("b", "E9"),

@@ -1,7 +1,7 @@
 // Variants of a taken name: head, '_' and a letter code.
 
-#ifndef SAFENAMES_IMPLSAFENAMES_HX_VARIANT_H
-#define SAFENAMES_IMPLSAFENAMES_HX_VARIANT_H
+#ifndef SAFENAMES_IMPLSAFENAMES_HX_VARIANTCOUNTS_H
+#define SAFENAMES_IMPLSAFENAMES_HX_VARIANTCOUNTS_H
 
 #include "implContainers/HX_HashTable.h"
 #include "implContainers/HX_LetterCode.h"
@@ -107,4 +107,4 @@ inline KyCXString significantPart(const KyCXString& name, int count,
 
 }  // namespace hx_detail
 
-#endif  // SAFENAMES_IMPLSAFENAMES_HX_VARIANT_H
+#endif  // SAFENAMES_IMPLSAFENAMES_HX_VARIANTCOUNTS_H
