@@ -7,6 +7,9 @@
 #include <map>
 #include <new>
 
+#include "Control/HxCUtilsControl.h"
+#include "LedaIntegerSupport.h"
+#include "Math/FPS_FloatingPointSupport.h"
 #include "SafeNames/HX_ReservedNames.h"
 #include "host/base/HX_Faults.h"
 #include "host/base/HX_Output.h"
@@ -357,6 +360,20 @@ int runWithLog(int argc, char** argv, HX_DiagnosticLog& log) {
   return kHxRefused;
 }
 
+/// The library, booted while alive. Servers in use are booted by their users.
+struct Library {
+  Library() {
+    control.boot();
+    ModInit_FPS_FloatingPointSupport();
+    LedaIntegerSupportBoot();
+  }
+  Library(const Library&) = delete;
+  Library& operator=(const Library&) = delete;
+  ~Library() { control.shutdown(); }
+
+  HxCUtilsControl control;
+};
+
 int refuseMemory() {
   HX_WriteError("hx_codegen: out of memory [203]\n");
   return kHxRefused;
@@ -368,6 +385,7 @@ int main(int argc, char** argv) {
   try {
     HX_PrepareProcess();
     if (!HX_KeepMemoryBack()) return refuseMemory();
+    const Library library;
     HX_DiagnosticLog log;
     const int code = runWithLog(argc, argv, log);
     log.write(std::cerr, code, HX_ErrorTerminal());
